@@ -8,90 +8,84 @@
 
 namespace {
 
-constexpr char kPriorities[] = "??VDIWEFS";  // a letter's position is its priority
+constexpr char kLetters[] = "??VDIWEFS";  // a letter's position is its priority
+constexpr char kSeparators[] = " ,\t\n";
 constexpr size_t kMostFilters = 32;
 
 struct Filter {
   const char* m_szTag;
   size_t m_nTagLen;
-  int m_nPriority;  // the lowest one to write
+  int m_nLowest;  // the lowest priority to write
 };
 
-/// The filters of ANDROID_LOG_TAGS; filled once, read-only from then on.
+/// The filters of ANDROID_LOG_TAGS: filled at the first line, read-only from then on.
 struct Filters {
+  char* m_szText;  // a copy, since the environment may change; it lives as long as the process
   Filter m_aFilter[kMostFilters];
   size_t m_nCount;
-  int m_nLowest;  // no filter lets a lower priority through
+  int m_nLowest;  // no filter lets anything below this through
 };
 
-Filters g_filters;
+Filters g_filters = {nullptr, {}, 0, ANDROID_LOG_SILENT};
 pthread_once_t g_once = PTHREAD_ONCE_INIT;
 
-/// The priority that `letter` names, or `otherwise`.
-int PriorityOf(char letter, int otherwise) {
-  const char* found = letter == '\0' ? nullptr : strchr("VDIWEFS", letter & ~0x20);
-  return found == nullptr ? otherwise
-                          : static_cast<int>(strchr(kPriorities, *found) - kPriorities);
+/// The priority that stands behind a filter's colon; what is no priority asks for nothing.
+int PriorityOf(char letter) {
+  const char* first = kLetters + ANDROID_LOG_VERBOSE;
+  const char* found = letter == '\0' ? nullptr : strchr(first, letter);
+  return found == nullptr ? ANDROID_LOG_SILENT : static_cast<int>(found - kLetters);
 }
 
-/// Adds one filter, `tag` or `tag:priority`. A tag without a priority asks for everything.
-void Add(Filters& filters, const char* text, size_t length) {
+/// Adds one filter, `tag:priority` or `tag` alone, which asks for everything.
+void Add(const char* text, size_t length) {
+  if (g_filters.m_nCount == kMostFilters) return;
   const void* colon = memchr(text, ':', length);
-  const size_t tagLength =
+  const size_t tag =
       colon == nullptr ? length : static_cast<size_t>(static_cast<const char*>(colon) - text);
-  int priority = ANDROID_LOG_VERBOSE;
-  if (tagLength < length) {
-    priority = tagLength + 1 < length ? PriorityOf(text[tagLength + 1], ANDROID_LOG_SILENT)
-                                      : ANDROID_LOG_VERBOSE;
-  }
-  if (filters.m_nCount < kMostFilters) {
-    filters.m_aFilter[filters.m_nCount++] = {text, tagLength, priority};
-    if (priority < filters.m_nLowest) filters.m_nLowest = priority;
-  }
+  const int lowest = tag + 1 < length ? PriorityOf(text[tag + 1]) : ANDROID_LOG_VERBOSE;
+  g_filters.m_aFilter[g_filters.m_nCount++] = {text, tag, lowest};
+  if (lowest < g_filters.m_nLowest) g_filters.m_nLowest = lowest;
 }
 
 void ReadFilters() {
-  constexpr char kSeparators[] = " ,\t\n";
-  g_filters.m_nLowest = ANDROID_LOG_SILENT;
   const char* wanted = getenv("ANDROID_LOG_TAGS");
   if (wanted == nullptr) return;
-  // The copy lives as long as the process: the environment itself may change behind us.
-  const char* text = strdup(wanted);
-  if (text == nullptr) return;
-  while (*(text += strspn(text, kSeparators)) != '\0') {
+  g_filters.m_szText = strdup(wanted);
+  if (g_filters.m_szText == nullptr) return;
+  const char* text = g_filters.m_szText + strspn(g_filters.m_szText, kSeparators);
+  while (*text != '\0') {
     const size_t length = strcspn(text, kSeparators);
-    Add(g_filters, text, length);
+    Add(text, length);
     text += length;
+    text += strspn(text, kSeparators);
   }
 }
 
-/// The lowest priority to write under `tag`: of its own last filter, else of the last `*`.
+/// The lowest priority to write under `tag`: that of its own last filter, else of the last `*`.
 int LowestFor(const char* tag) {
   const size_t length = strlen(tag);
-  int forAll = ANDROID_LOG_SILENT;
-  int forTag = -1;
+  int others = ANDROID_LOG_SILENT;
+  int own = -1;
   for (size_t i = 0; i < g_filters.m_nCount; ++i) {
     const Filter& filter = g_filters.m_aFilter[i];
-    if (filter.m_nTagLen == 1 && filter.m_szTag[0] == '*') {
-      forAll = filter.m_nPriority;
-    } else if (filter.m_nTagLen == length && memcmp(filter.m_szTag, tag, length) == 0) {
-      forTag = filter.m_nPriority;
+    if (filter.m_nTagLen == length && memcmp(filter.m_szTag, tag, length) == 0) {
+      own = filter.m_nLowest;
+    } else if (filter.m_nTagLen == 1 && filter.m_szTag[0] == '*') {
+      others = filter.m_nLowest;
     }
   }
-  return forTag < 0 ? forAll : forTag;
+  return own < 0 ? others : own;
 }
 
 }  // namespace
 
-extern "C" __attribute__((visibility("default"))) int __android_log_write(int prio,
-                                                                          const char* tag,
-                                                                          const char* text) {
+__attribute__((visibility("default"))) int __android_log_write(int prio, const char* tag,
+                                                               const char* text) {
   pthread_once(&g_once, ReadFilters);
-  if (prio < g_filters.m_nLowest || g_filters.m_nCount == 0) return -EPERM;
+  if (prio < g_filters.m_nLowest || prio >= ANDROID_LOG_SILENT) return -EPERM;
   if (tag == nullptr) tag = "";
-  if (prio >= ANDROID_LOG_SILENT || prio < LowestFor(tag)) return -EPERM;
-  const char letter = kPriorities[prio < 0 ? 0 : prio];
+  if (prio < LowestFor(tag)) return -EPERM;
+  if (text == nullptr) text = "";
   // One call: stdio holds the stream's lock for the whole line.
-  fprintf(stderr, "%c/%s: %s\n", letter, tag, text == nullptr ? "" : text);
-  return 1;
+  return fprintf(stderr, "%c/%s: %s\n", kLetters[prio], tag, text) < 0 ? -EPERM : 1;
 }
