@@ -1,0 +1,140 @@
+// Login, and the list of the user's accounts. Both replies carry the same account records:
+//
+//   reply    |68=code|M2=refusal|M3=notice  record*
+//   record   |00=...|67=sequence|68=code|07=type|M5=..|16=..|17=branch part|18=account
+//   part|69=name|01= result   count ! ( <07>@M5@account@16@69! )*  [ <M>@notice! ]      the notice:
+//   login alone
+//
+// A refusal's message is shown as the gateway sent it, without a source or code.
+#include "gateway/core/gateway_pub.h"
+#include "gateway/core/log.h"
+#include "gateway/core/messages.h"
+
+namespace {
+
+// Room for one record: a longer one reads as empty, which ends the list.
+constexpr size_t kRecordSize = 200;
+
+constexpr size_t kNoticeSize = 300;
+
+constexpr int kLastSequence = 900000;  // a record numbered above it marks the end of the list
+
+enum Field { kSequence, kCode, kType, kM5, kField16, kAccountHead, kAccountTail, kName };
+
+constexpr CTagTable kTags({{"67"},
+                           {"68"},
+                           {"07"},
+                           {"M5"},
+                           {"16"},
+                           {"17", Blanks::kSkipped},
+                           {"18", Blanks::kSkipped},
+                           {"69"}});
+
+void LogText(const char* label, std::string_view text) {
+  char scratch[kNoticeSize + 20];
+  CTextWriter line(scratch, sizeof scratch);
+  line.Append(WIRE("%s%s"), label, text);
+  debuglog(line.Text());
+}
+
+void LogStatus(int status) {
+  char scratch[32];
+  CTextWriter line(scratch, sizeof scratch);
+  line.Append(WIRE("[status]%d"), status);
+  debuglog(line.Text());
+}
+
+// An account shorter than 7 characters is shown with 7 digits, as the host keys its screens.
+void AppendAccount(CResultText& list, std::string_view head, std::string_view tail) {
+  char scratch[20];
+  CTextWriter account(scratch, sizeof scratch);
+  account.Append(WIRE("%s%s"), head, tail);
+  const std::string_view text(account.Text(), account.Length());
+  if (text.empty() || text.size() >= 7) {
+    list.AppendText(text);
+  } else {
+    list.AppendNumber(ReadInt32(text), 7);
+  }
+}
+
+void AppendAccountLine(CResultText& list, const CRecord& record) {
+  list.Append(WIRE("<%s>@%s@"), record.Text(kType, 10), record.Text(kM5, 20));
+  AppendAccount(list, record.Text(kAccountHead, 10), record.Text(kAccountTail, 10));
+  list.Append(WIRE("@%s@%s!"), record.Text(kField16, 20), record.Text(kName, 20));
+}
+
+int AppendAccountLines(CResultText& list, std::string_view reply) {
+  int count = 0;
+  CRecord record(kTags);
+  CRecordWalker walker(reply, kRecordSize);
+  while (walker.Next(record) && !record.Empty()) {
+    if (record.Number(kSequence, 20) > kLastSequence) break;
+    if (record.Text(kCode, 20) != "0000") continue;
+    AppendAccountLine(list, record);
+    ++count;
+  }
+  return count;
+}
+
+// The notice counts as one more record. It is asked for only behind a list of accounts: a login
+// without accounts shows none.
+int AppendNotice(CResultText& list, std::string_view reply) {
+  const std::string_view notice = Bounded(FindField(reply, "M3", Blanks::kTaken), kNoticeSize);
+  LogText("[strResult2]", notice);
+  if (notice.empty()) return 0;
+  list.Append(WIRE("<M>@%s!"), notice);
+  return 1;
+}
+
+}  // namespace
+
+char* CGatewayPub::EncodeAccountQuery(const char* branch, const char* identity,
+                                      const char* password, const char* function, int* status) {
+  *status = 1;
+  CTextWriter line = StartRequest();
+  if (!WriteQueryHead(line, branch, identity, password)) {
+    *status = -1;
+    return line.Text();
+  }
+  line.Append(WIRE("FUNC=%s|01="), function);
+  return Finish(line, status, kBadParameters);
+}
+
+char* CGatewayPub::AuthEncode(const char* branch, const char* identity, const char* password,
+                              int* status) {
+  return EncodeAccountQuery(branch, identity, password, "0", status);
+}
+
+char* CGatewayPub::GetTotalAccountEncode(const char* branch, const char* identity,
+                                         const char* password, int* status) {
+  return EncodeAccountQuery(branch, identity, password, "12", status);
+}
+
+char* CGatewayPub::AuthDecode(const char* reply, int* status) {
+  const std::string_view text = AsText(reply);
+  LogReply("AuthDecode", text);
+  return ListAccounts(text, true, status);
+}
+
+char* CGatewayPub::GetTotalAccountDecode(const char* reply, int* status) {
+  const std::string_view text = AsText(reply);
+  LogReply("GetTotalAccountDecode", text);
+  return ListAccounts(text, false, status);
+}
+
+char* CGatewayPub::ListAccounts(std::string_view reply, bool login, int* status) {
+  *status = 1;
+  if (TransportFailed(reply, status)) return m_szBuffer;
+  const std::string_view code = Bounded(FindField(reply, "68", Blanks::kTaken), 20);
+  if (login) LogText("[strResult]", code);
+  if (code != "0000") {
+    return Fail(Bounded(FindField(reply, "M2", Blanks::kTaken), kBufferSize), status);
+  }
+  CResultText list({m_pData, m_nDataSize, m_nDataLen}, reply.size());
+  int count = AppendAccountLines(list, reply);
+  if (count == 0) return Answer("0!");
+  if (login) count += AppendNotice(list, reply);
+  char* const result = FinishList(list, count, status);
+  if (login) LogStatus(*status);
+  return result;
+}

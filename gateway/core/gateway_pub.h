@@ -1,0 +1,204 @@
+// The gateway session object that every operation works on, and the operations of the session
+// itself: login, account maintenance, certificates.
+#ifndef QUORVANE_GATEWAY_CORE_GATEWAY_PUB_H_
+#define QUORVANE_GATEWAY_CORE_GATEWAY_PUB_H_
+
+#include <cstddef>
+#include <cstdint>
+#include <string_view>
+
+#include "gateway/core/reply_reader.h"
+#include "gateway/core/result_text.h"
+#include "gateway/core/text_writer.h"
+
+// One object lives for one call: constructed, filled with the session data, one `...Encode` or
+// `...Decode`, destroyed. Every text that a method returns lies in the object and dies with it; a
+// null return means that memory ran out. A null text argument is read as an empty one.
+//
+// Encoders return one request line; decoders return a result for the user interface. Both set
+// `*status` (never null) to 1, or to -1 with a message in place of the text.
+class CGatewayPub {
+ public:
+  static constexpr size_t kBufferSize = 4096;  // of a request or short result, with terminator
+
+  CGatewayPub();
+  virtual ~CGatewayPub();
+  CGatewayPub(const CGatewayPub&) = delete;
+  CGatewayPub& operator=(const CGatewayPub&) = delete;
+
+  // The device's serial number: at most 20 characters are kept, and a full field has no terminator,
+  // so that the address follows it in a header. Null clears the field.
+  void setSerialNumber(const char* serial);
+
+  // The device's address in text form: at most 64 characters are kept. Null clears the field.
+  void setLocalIP(const char* ip);
+
+  // Appends the header of a query to the terminated text in `out`, a buffer of kBufferSize bytes.
+  // `identity` is the user's ID number and account joined by '&', in either order, one of them
+  // optional. Returns 1, or 0 with a "[CLIENT]" message alone in `out`.
+  int initQueryHead(const char* branch, const char* identity, const char* password, char* out);
+
+  // Append the header of an order likewise. `function` is 'I' (new), 'D' (cancel), 'C' (change) or
+  // a futures function letter; `rocDate` a date such as 1130115 or empty. `orderKey`, a buffer of
+  // kBufferSize bytes, receives the text that opens the order's signature payload.
+  int initOrderHead(char function, const char* branch, const char* identity, const char* password,
+                    const char* rocDate, char* out, char* orderKey);
+  int initOrderHead1(char function, const char* branch, const char* identity, const char* password,
+                     const char* rocDate, char* out, char* orderKey);
+  int initOrderHead2(char function, const char* branch, const char* identity, const char* password,
+                     char* out);
+
+  // Splits an identity field at its first '&'. A part of 1 to size - 1 characters is copied with a
+  // terminator; any other leaves its buffer (which may be null) as it was. Returns 0 when `field`
+  // is null or has no '&', else 1.
+  int SeparateDataFromUiField(const char* field, char* first, int firstSize, char* second,
+                              int secondSize);
+
+  // Copies the value of the first field `tag` of `reply` into `out` (cleared before, `outSize`
+  // bytes) if it fits with its terminator. `skipBlank` passes over empty and single-blank values
+  // that a '|' closes. Returns the value's length, 0 when there is none, even if it did not fit.
+  int GetToken(const char* tag, const char* reply, char* out, int outSize, bool skipBlank);
+
+  // Copies the next record, from "|00=" to before "|01=", into `out` (cleared before) if it fits,
+  // and moves `pos` behind that last bar; moves `pos` to the end when no complete record is left.
+  void GetSubString(const char* reply, int& pos, char* out, int outSize);
+
+  // Copies the text from `*cursor` to before `separator` into `out` (not cleared before; may be
+  // null) if it fits and is not empty, and moves `*cursor` behind the separator, or to the end of
+  // the text when there is none and `out` is not null.
+  void GetFieldString(char** cursor, const char* separator, char* out, int outSize);
+
+  // Sets `*status` to -1 and `message` (cleared before) to what to tell the user when the reply is
+  // a transport failure; leaves `*status` alone otherwise.
+  void CheckError(const char* reply, int* status, char* message, int messageSize);
+
+  // Puts "[GATEWAY]" before a message that names no source; `message` has room for 9 more bytes.
+  void MakeErrorMsg(char* message);
+
+  // Appends `data`, whose length is `length`, to m_pData; `reset` empties it first.
+  void AppendData(const char* data, int length, bool reset);
+
+  // As the free function of the same name.
+  void debuglog(const char* text);
+
+  // Dates, between the Republic of China calendar (year - 1911) and the western one, and prices,
+  // between decimal text and integers scaled by 10^decimals.
+
+  // Converts in place, by length: 1130115 and 990115 become western, 20240115 becomes 1130115; any
+  // other text, and one whose number is 0, stays. `date` has room for at least 10 bytes.
+  void TransDate(char* date);
+
+  // 1130115 to 20240115; 0 stays 0.
+  int RocDateToStandardDate(int rocDate);
+  int RocDateToStandardDate(const char* rocDate);
+
+  // Writes 12345 with 2 decimals as "123.45" into `out` of `outSize` bytes; -150 becomes "-1.-50".
+  // A text that does not fit leaves `out` empty.
+  void SetPriceString(int value, int decimals, char* out, int outSize);
+
+  // Reads "12.5" with 2 decimals as 1250; further decimals are cut. GetPriceString2 is for amounts
+  // above 32 bits and reads no leading '-' of its own.
+  int32_t GetPriceString(const char* text, int decimals);
+  int64_t GetPriceString2(const char* text, int decimals);
+
+  // Appends `src` to `dst`, zero-filled and three times as long, with every blank as "%20".
+  void fctRep(const char* src, char* dst);
+
+  // Replaces every `from` in `text` by `to`, both characters; a `to` of 0 cuts the text.
+  void StringReplaceAll(char* text, int from, int to);
+
+  // Login and the list of the user's accounts.
+  char* AuthEncode(const char* branch, const char* identity, const char* password, int* status);
+  char* AuthDecode(const char* reply, int* status);
+  char* GetTotalAccountEncode(const char* branch, const char* identity, const char* password,
+                              int* status);
+  char* GetTotalAccountDecode(const char* reply, int* status);
+
+  int32_t m_nDataSize;  // capacity of m_pData
+  int32_t m_nDataLen;   // characters in m_pData
+  char m_szBuffer[kBufferSize];
+  char* m_pData;  // long results; released with array delete
+  int32_t m_nMarket;
+  int32_t m_nPlatform;
+  int32_t m_nSeqNo;
+  char m_szSerialNo[20];  // no terminator when full
+  char m_szLocalIP[64];   // no terminator when full
+
+ protected:
+  // The three order headers: what each sends is in order_head.cpp.
+  enum class OrderHead { kPlain, kSigned, kBrief };
+
+  // What every order header is made of; `rocDate` is sent by kPlain alone.
+  struct OrderOrigin {
+    char function;
+    const char* branch;
+    const char* identity;
+    const char* password;
+    const char* rocDate;
+  };
+
+  // The local time of one call and the request id made of it.
+  struct Stamp {
+    int year, month, day, hour, minute, second;
+    int requestId;  // HHMMSS and the sequence number modulo 100, eight digits
+  };
+
+  // The public headers at work. False leaves a message alone in `line`; an overflow is no failure
+  // here, Finish tells it.
+  bool WriteQueryHead(CTextWriter& line, const char* branch, const char* identity,
+                      const char* password);
+  bool WriteOrderHead(OrderHead head, const OrderOrigin& origin, CTextWriter& line,
+                      CTextWriter& key);
+
+  // An empty request in m_szBuffer.
+  CTextWriter StartRequest() { return CTextWriter(m_szBuffer, sizeof m_szBuffer); }
+
+  // Ends an encoder: its request, or the message `overflow` and status -1 when it did not fit.
+  static char* Finish(CTextWriter& line, int* status, const char* overflow);
+
+  // As Finish, for a request whose blanks travel as "%20".
+  static char* FinishEscaped(CTextWriter& line, int* status, const char* overflow);
+
+  // Ends an encoder with `message` in place of the request and status -1.
+  static char* Fail(CTextWriter& line, int* status, const char* message);
+
+  // Ends a decoder with a short result that lies in m_szBuffer.
+  char* Answer(std::string_view text);
+  char* Fail(std::string_view message, int* status);
+
+  // Ends a decoder with a gateway's refusal: the message with its source, then the code in
+  // parentheses if there is one; status -1.
+  char* Refuse(std::string_view message, std::string_view code, int* status);
+
+  // Ends a decoder with its list, "count!records"; a null text and status -1 when memory ran out.
+  static char* FinishList(CResultText& records, int count, int* status);
+
+  // Whether the reply is a transport failure: then m_szBuffer tells it and the status is -1.
+  bool TransportFailed(std::string_view reply, int* status);
+
+  // Logs "<name>: Len:<length>" and then the reply itself.
+  void LogReply(const char* name, std::string_view reply);
+
+ private:
+  // Room for a full serial number with the address run onto it.
+  using SerialScratch = char[sizeof(m_szSerialNo) + sizeof(m_szLocalIP)];
+
+  // Reads the clock and reduces m_nSeqNo modulo 100.
+  Stamp TakeStamp();
+  std::string_view SerialNo(SerialScratch& scratch) const;
+  std::string_view LocalIP() const;
+  const char* PlatformName() const;
+  const char* RequestKind() const;
+
+  void WriteOrderKey(OrderHead head, const OrderOrigin& origin, std::string_view first,
+                     std::string_view second, const Stamp& stamp, CTextWriter& key) const;
+  void WriteOrderOrigin(OrderHead head, const OrderOrigin& origin, const Stamp& stamp,
+                        CTextWriter& line) const;
+  static void WriteStamps(CTextWriter& line, const Stamp& stamp);
+
+  char* EncodeAccountQuery(const char* branch, const char* identity, const char* password,
+                           const char* function, int* status);
+  char* ListAccounts(std::string_view reply, bool login, int* status);
+};
+
+#endif  // QUORVANE_GATEWAY_CORE_GATEWAY_PUB_H_

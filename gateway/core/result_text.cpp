@@ -1,0 +1,80 @@
+#include "gateway/core/result_text.h"
+
+#include <new>
+
+namespace {
+
+constexpr size_t kSlack = 4096;
+
+char* Allocate(size_t size) {
+  return size <= INT32_MAX ? new (std::nothrow_t{}) char[size] : nullptr;
+}
+
+void Adopt(const HeapText& owner, char* block, size_t size) {
+  delete[] owner.data;
+  owner.data = block;
+  owner.size = static_cast<int32_t>(size);
+}
+
+}  // namespace
+
+void AppendHeapText(const HeapText& owner, const char* text, int length, bool reset) {
+  if (text == nullptr || length <= 0) return;
+  if (reset && owner.length > 0) {
+    owner.length = 0;
+    memset(owner.data, 0, static_cast<size_t>(owner.size));
+  }
+  const auto used = static_cast<size_t>(owner.length);
+  const size_t needed = used + static_cast<size_t>(length);
+  if (needed >= static_cast<size_t>(owner.size)) {
+    char* const block = Allocate(needed + kSlack);
+    if (block == nullptr) return;
+    memset(block, 0, needed + kSlack);
+    if (used > 0) memcpy(block, owner.data, used);
+    Adopt(owner, block, needed + kSlack);
+  }
+  memcpy(owner.data + used, text, strnlen(text, static_cast<size_t>(length)));
+  owner.length = static_cast<int32_t>(needed);
+}
+
+CResultText::CResultText(const HeapText& owner, size_t expected)
+    : CWireText(nullptr, nullptr), m_owner(owner), m_nExpected(expected), m_pRecords(nullptr) {
+  owner.length = 0;
+}
+
+char* CResultText::Finish(std::string_view opening, int count) {
+  if (m_pRecords == nullptr) MakeRoom(0);
+  if (m_bFailed) return nullptr;
+  char scratch[kOpeningRoom];
+  const CDecimal decimal(count, 0);
+  memcpy(scratch, opening.data(), opening.size());
+  decimal.WriteTo(scratch + opening.size());
+  const size_t size = opening.size() + decimal.Size() + 1;
+  scratch[size - 1] = '!';
+  char* const start = m_pRecords - size;
+  memcpy(start, scratch, size);
+  *m_pAt = '\0';
+  m_owner.length = static_cast<int32_t>(m_pAt - m_owner.data);
+  return start;
+}
+
+bool CResultText::MakeRoom(size_t count) {
+  if (m_bFailed) return false;
+  const size_t used = Length();
+  if (m_pRecords != nullptr) m_nExpected *= 8;
+  if (m_nExpected < used + count) m_nExpected = used + count;
+  const size_t size = kOpeningRoom + m_nExpected + kSlack;
+  char* const block = Allocate(size);
+  if (block == nullptr) {
+    m_bFailed = true;
+    m_pEnd = m_pAt;  // nothing more fits, however short
+    return false;
+  }
+  char* const records = block + kOpeningRoom;
+  if (used > 0) memcpy(records, m_pRecords, used);
+  Adopt(m_owner, block, size);
+  m_pRecords = records;
+  m_pAt = records + used;
+  m_pEnd = block + size - 1;
+  return true;
+}

@@ -1,0 +1,51 @@
+// A result that grows: the records of a list.
+#ifndef QUORVANE_GATEWAY_CORE_RESULT_TEXT_H_
+#define QUORVANE_GATEWAY_CORE_RESULT_TEXT_H_
+
+#include <cstdint>
+
+#include "gateway/core/wire_text.h"
+
+// A heap text as the gateway objects keep it: owned by the object, released with array delete.
+struct HeapText {
+  char*& data;
+  int32_t& size;    // capacity
+  int32_t& length;  // characters
+};
+
+// Appends `length` characters of `text`, growing by what is needed plus 4096 zeroed bytes whenever
+// the text would reach the capacity. `reset` empties the text first. When memory runs out the old
+// text stays as it was.
+void AppendHeapText(const HeapText& owner, const char* text, int length, bool reset);
+
+// Writes the records of one list straight into an object's heap text, with room kept before them
+// for what opens the list: the finished list is never copied. A list that memory cannot hold
+// fails once, for good.
+class CResultText : public CWireText<CResultText> {
+ public:
+  // `owner`'s text is replaced. `expected` is a fair guess of the list's size: a first allocation
+  // holds that much, and a second eight times as much, more than any reply of that size can give.
+  CResultText(const HeapText& owner, size_t expected);
+
+  bool Failed() const { return m_bFailed; }
+
+  // The records so far.
+  size_t Length() const { return static_cast<size_t>(m_pAt - m_pRecords); }
+
+  // The terminated list behind "%s%d!" of `opening` (at most 8 characters) and `count`, or null
+  // when it failed. Lies in the owner's heap text.
+  char* Finish(std::string_view opening, int count);
+
+ private:
+  friend class CWireText<CResultText>;
+  static constexpr size_t kOpeningRoom = 20;
+
+  bool MakeRoom(size_t count);
+
+  HeapText m_owner;
+  size_t m_nExpected;
+  char* m_pRecords;
+  bool m_bFailed = false;
+};
+
+#endif  // QUORVANE_GATEWAY_CORE_RESULT_TEXT_H_
