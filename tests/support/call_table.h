@@ -1,0 +1,46 @@
+#ifndef TESTS_SUPPORT_CALL_TABLE_H_
+#define TESTS_SUPPORT_CALL_TABLE_H_
+
+#include <jni.h>
+
+#include <cstddef>
+#include <string>
+#include <string_view>
+
+namespace gateway_tests {
+
+/// Calls an entry point through a pointer of its true type.
+using TCaller = jstring (*)(void* entryPoint, JNIEnv* env, const jvalue* arguments);
+
+/// One native method of the host class.
+struct TExport {
+  /// Method name in Java, "AuthEncode".
+  std::string_view m_szName;
+  /// One letter for each Java argument: i int, S String, b byte, c char, s the status int[].
+  std::string_view m_szShape;
+  TCaller m_pCall;
+  /// Number of last strings that the export keeps on purpose (never releases).
+  int m_nKeptStrings;
+
+  bool IsDecoder() const { return m_szName.find("Decode") != std::string_view::npos; }
+  bool HasStatus() const { return m_szShape.back() == 's'; }
+  /// "Java_..._AuthEncode".
+  std::string SymbolName() const;
+  /// The Java method descriptor, "(III...[I)Ljava/lang/String;".
+  std::string Descriptor() const;
+  /// Address of the entry point in the loaded library; null while the library lacks it.
+  void* EntryPoint() const;
+};
+
+inline constexpr std::string_view kSymbolPrefix = "Java_com_brindlex_kernel_quorvane_gatewayjni_";
+inline constexpr size_t kExportCount = 59;
+
+/// All 59 native methods; the one table that vector runners, fuzz targets and thread tests share.
+const TExport (&AllExports())[kExportCount];
+
+/// The row of that name, or null.
+const TExport* FindExport(std::string_view name);
+
+}  // namespace gateway_tests
+
+#endif  // TESTS_SUPPORT_CALL_TABLE_H_

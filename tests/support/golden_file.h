@@ -1,0 +1,48 @@
+#ifndef TESTS_SUPPORT_GOLDEN_FILE_H_
+#define TESTS_SUPPORT_GOLDEN_FILE_H_
+
+#include <cstdint>
+#include <optional>
+#include <string>
+#include <vector>
+
+#include "tests/support/recording_host.h"
+
+namespace gateway_tests {
+
+/// One golden case: a call with all that it must answer. The format is described in
+/// tests/vectors/README.md.
+struct TGoldenCase {
+  std::string m_File;
+  int m_nLine = 0;
+  std::string m_Title;
+  std::string m_Operation;
+  std::string m_Clock;
+  TArguments m_Arguments;
+  std::optional<int32_t> m_Status;
+  std::string m_Result;
+  /// Empty when the case says nothing about log lines.
+  std::optional<std::vector<std::string>> m_LogLines;
+
+  /// "login.txt:12: title".
+  std::string Where() const;
+  /// The title as a test name: letters, digits and '_'.
+  std::string TestName() const;
+  /// The platform row that the case passes; 0 for a decoder.
+  int64_t PlatformRow() const;
+};
+
+/// All cases of a directory's *.txt files in order, and what is wrong with the files.
+struct TGoldenCases {
+  std::vector<TGoldenCase> m_Cases;
+  std::vector<std::string> m_Errors;
+};
+
+TGoldenCases ReadGoldenCases(const std::string& directory);
+
+/// `text` with each "{11}" replaced by the platform name.
+std::string FillPlatformName(std::string text, const std::string& platformName);
+
+}  // namespace gateway_tests
+
+#endif  // TESTS_SUPPORT_GOLDEN_FILE_H_
