@@ -1,0 +1,54 @@
+// The library's exports against the table of native methods.
+
+#include <gtest/gtest.h>
+
+#include <iostream>
+#include <set>
+#include <string>
+
+#include "tests/support/call_table.h"
+
+namespace gateway_tests {
+namespace {
+
+/// True once all operations exist; a missing export is then a failure.
+constexpr bool kAllExportsExist = false;
+
+TEST(ExportTable, HoldsEachMethodOnce) {
+  std::set<std::string_view> names;
+  int decoders = 0;
+  for (const TExport& row : AllExports()) {
+    EXPECT_TRUE(names.insert(row.m_szName).second) << row.m_szName;
+    decoders += row.IsDecoder() ? 1 : 0;
+  }
+  EXPECT_EQ(names.size(), 59U);
+  EXPECT_EQ(decoders, 27);
+}
+
+TEST(ExportTable, DerivesTheJavaDescriptor) {
+  EXPECT_EQ(FindExport("AuthDecode")->Descriptor(), "(Ljava/lang/String;[I)Ljava/lang/String;");
+  EXPECT_EQ(FindExport("SubmitOrderEncode2")->Descriptor(),
+            "(IIILjava/lang/String;Ljava/lang/String;Ljava/lang/String;Ljava/lang/String;"
+            "Ljava/lang/String;BB)Ljava/lang/String;");
+  EXPECT_EQ(FindExport("QueryOrderDecode")->m_szShape, "iSs");
+  EXPECT_EQ(FindExport("FutSubmitOrderEncode1")->m_szShape, "iiiSSSSSSSSSSSSSSSbbbcccccciiis");
+}
+
+TEST(ExportTable, EachMethodIsExported) {
+  std::string missing;
+  for (const TExport& row : AllExports()) {
+    if (row.EntryPoint() == nullptr) missing.append(" ").append(row.m_szName);
+  }
+  if (kAllExportsExist) {
+    EXPECT_EQ(missing, "");
+  } else if (!missing.empty()) {
+    std::cout << "not exported yet:" << missing << '\n';
+  }
+  EXPECT_NE(FindExport("AuthEncode")->EntryPoint(), nullptr);
+  EXPECT_NE(FindExport("AuthDecode")->EntryPoint(), nullptr);
+  EXPECT_NE(FindExport("GetTotalAccountEncode")->EntryPoint(), nullptr);
+  EXPECT_NE(FindExport("GetTotalAccountDecode")->EntryPoint(), nullptr);
+}
+
+}  // namespace
+}  // namespace gateway_tests

@@ -1,0 +1,136 @@
+// The golden cases, one test each, run natively.
+
+#include <gtest/gtest.h>
+
+#include <string>
+
+#include "tests/support/golden_file.h"
+#include "tests/support/recording_host.h"
+#include "tests/support/surroundings.h"
+
+namespace gateway_tests {
+
+// GoogleTest prints parameters; the title says all.
+void PrintTo(const TGoldenCase& golden, std::ostream* out) {
+  *out << golden.Where();
+}
+
+namespace {
+
+constexpr EPlacement kPlacements[] = {EPlacement::kHeap, EPlacement::kBeforeUnreadable,
+                                      EPlacement::kAfterUnreadable};
+
+const TGoldenCases& AllGolden() {
+  static const TGoldenCases s_Cases = ReadGoldenCases(TEST_VECTORS);
+  return s_Cases;
+}
+
+bool SetClockOf(const TGoldenCase& golden) {
+  return SetClock(golden.m_Clock.empty() ? "2024-01-15 13:45:21" : golden.m_Clock);
+}
+
+/// The name that the library sends for a platform row, read from a header.
+std::string PlatformName(int64_t row) {
+  CRecordingHost host;
+  const TOutcome outcome = host.Call(
+      *FindExport("AuthEncode"),
+      {TArgument::Int(0), TArgument::Int(row), TArgument::Int(0), TArgument::Text("S"),
+       TArgument::Text("1.2.3.4"), TArgument::Text(""), TArgument::Text("&"), TArgument::Text("")});
+  const std::string request = outcome.m_Result.value_or("");
+  const size_t begin = request.find("|11=") + 4;
+  return request.substr(begin, request.find('|', begin) - begin);
+}
+
+class Golden : public testing::TestWithParam<TGoldenCase> {};
+
+TEST(GoldenFiles, AreWellFormed) {
+  for (const std::string& error : AllGolden().m_Errors) ADD_FAILURE() << error;
+}
+
+TEST_P(Golden, Case) {
+  const TGoldenCase& golden = GetParam();
+  const TExport* const row = FindExport(golden.m_Operation);
+  ASSERT_NE(row, nullptr) << golden.m_Operation;
+  ASSERT_TRUE(SetClockOf(golden)) << golden.m_Clock;
+  const std::string platform = PlatformName(golden.PlatformRow());
+
+  for (EPlacement placement : kPlacements) {
+    SCOPED_TRACE(golden.Where() + ", placement " + std::to_string(static_cast<int>(placement)));
+    CRecordingHost host(placement);
+    const TOutcome outcome = host.Call(*row, golden.m_Arguments);
+    EXPECT_EQ(outcome.m_Violations, std::vector<std::string>());
+    ASSERT_TRUE(outcome.m_Result.has_value());
+    EXPECT_EQ(*outcome.m_Result, FillPlatformName(golden.m_Result, platform));
+    EXPECT_EQ(outcome.m_Status, golden.m_Status);
+    if (!golden.m_LogLines.has_value()) continue;
+    std::vector<std::string> expected = *golden.m_LogLines;
+    for (std::string& line : expected) line = FillPlatformName(line, platform);
+    EXPECT_EQ(outcome.m_LogLines, expected);
+  }
+}
+
+std::string NameOf(const testing::TestParamInfo<TGoldenCase>& info) {
+  const std::string file = info.param.m_File;
+  return file.substr(0, file.find('.')) + "_" + info.param.TestName();
+}
+
+INSTANTIATE_TEST_SUITE_P(Vectors, Golden, testing::ValuesIn(AllGolden().m_Cases), NameOf);
+
+// A reply may end anywhere: each beginning of each golden reply, its last byte the last readable
+// one, is answered.
+TEST(GoldenReplies, EachPrefixIsAnswered) {
+  CRecordingHost host(EPlacement::kBeforeUnreadable);
+  for (const TGoldenCase& golden : AllGolden().m_Cases) {
+    const TExport* const row = FindExport(golden.m_Operation);
+    if (row == nullptr || !row->IsDecoder() || row->EntryPoint() == nullptr) continue;
+    TArguments arguments = golden.m_Arguments;
+    if (!arguments.back().m_Text.has_value()) continue;
+    for (std::string& reply = *arguments.back().m_Text; !reply.empty(); reply.pop_back()) {
+      const TOutcome outcome = host.Call(*row, arguments);
+      ASSERT_TRUE(outcome.IsSound()) << golden.Where() << "\nreply " << reply << "\n"
+                                     << testing::PrintToString(outcome.m_Violations);
+    }
+  }
+}
+
+// Whatever the machine refuses, nothing is leaked, nothing is built on top, null comes back.
+TEST(GoldenCalls, EachRefusedVmCallIsSurvived) {
+  for (const TGoldenCase& golden : AllGolden().m_Cases) {
+    const TExport* const row = FindExport(golden.m_Operation);
+    if (row == nullptr || row->EntryPoint() == nullptr || !SetClockOf(golden)) continue;
+    CRecordingHost host;
+    const int calls = host.Call(*row, golden.m_Arguments).m_nFallibleCalls;
+    for (int failing = 1; failing <= calls; ++failing) {
+      host.FailCall(failing);
+      const TOutcome outcome = host.Call(*row, golden.m_Arguments);
+      EXPECT_EQ(outcome.m_Violations, std::vector<std::string>())
+          << golden.Where() << ", VM call " << failing;
+      EXPECT_FALSE(outcome.m_Result.has_value()) << golden.Where() << ", VM call " << failing;
+    }
+  }
+}
+
+// Each string null in turn is answered as an empty one is.
+TEST(GoldenCalls, EachNullStringReadsAsAnEmptyOne) {
+  CRecordingHost host;
+  for (const TGoldenCase& golden : AllGolden().m_Cases) {
+    const TExport* const row = FindExport(golden.m_Operation);
+    if (row == nullptr || row->EntryPoint() == nullptr || !SetClockOf(golden)) continue;
+    for (size_t i = 0; i < golden.m_Arguments.size(); ++i) {
+      if (golden.m_Arguments[i].m_chLetter != 'S') continue;
+      TArguments arguments = golden.m_Arguments;
+      arguments[i] = TArgument::Null();
+      const TOutcome withNull = host.Call(*row, arguments);
+      arguments[i] = TArgument::Text("");
+      const TOutcome withEmpty = host.Call(*row, arguments);
+      const std::string where = golden.Where() + ", argument " + std::to_string(i + 1);
+      EXPECT_TRUE(withNull.IsSound()) << where << testing::PrintToString(withNull.m_Violations);
+      EXPECT_EQ(withNull.m_Result, withEmpty.m_Result) << where;
+      EXPECT_EQ(withNull.m_Status, withEmpty.m_Status) << where;
+      EXPECT_EQ(withNull.m_LogLines, withEmpty.m_LogLines) << where;
+    }
+  }
+}
+
+}  // namespace
+}  // namespace gateway_tests
