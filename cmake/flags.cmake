@@ -13,7 +13,8 @@ add_library(quorvane_flags INTERFACE)
 target_compile_options(quorvane_flags INTERFACE
     -Wall -Wextra -Wpedantic -Wformat=2 -Wconversion -Wsign-conversion -Wshadow
     $<$<BOOL:${QUORVANE_WERROR}>:-Werror>
-    -ffile-prefix-map=${PROJECT_SOURCE_DIR}=.)
+    # Where it was built leaves no trace, so that two builds are equal to the byte.
+    -ffile-prefix-map=${PROJECT_SOURCE_DIR}=. -ffile-prefix-map=${PROJECT_BINARY_DIR}=.)
 if(QUORVANE_SANITIZE)
   # The vptr check needs the type information that the library is built without.
   set(sanitize -fsanitize=${QUORVANE_SANITIZE} -fno-sanitize=vptr -fno-sanitize-recover=all
