@@ -1,0 +1,84 @@
+package com.brindlex.kernel.quorvane.simulator;
+
+import java.time.LocalDate;
+import java.util.Map;
+import java.util.TreeMap;
+
+/** What an account holds of each stock: at the opening, and what the day's fills change. */
+final class StockHoldings {
+    private static final int CASH = 0;
+    private static final int MARGIN = 1;
+    private static final int SHORT = 2;
+
+    private static final int KINDS = 3;
+
+    /** One stock: for each way of holding it the opening quantity, what came and what went. */
+    static final class Holding {
+        private final long[] opening = new long[KINDS];
+        private final long[] came = new long[KINDS];
+        private final long[] went = new long[KINDS];
+        private long other;
+
+        private Holding opening(long cash, long margin, long sold, long pledged) {
+            opening[CASH] = cash;
+            opening[MARGIN] = margin;
+            opening[SHORT] = sold;
+            other = pledged;
+            return this;
+        }
+
+        long cash() {
+            return opening[CASH] + came[CASH] - went[CASH];
+        }
+
+        private void apply(StockFill fill) {
+            int way = fill.onMargin() ? MARGIN : fill.isShort() ? SHORT : CASH;
+            // a short position grows by selling
+            boolean grows = (fill.order.side == 'B') != (way == SHORT);
+            (grows ? came : went)[way] += fill.shares;
+        }
+
+        private void write(Reply reply, String code, Brokerage brokerage) {
+            reply.record().field("29", code);
+            for (int way = 0; way < KINDS; way++) {
+                String tag = String.valueOf(75 + way);
+                reply.field(tag, opening[way]);
+                if (brokerage == Brokerage.JZG) {
+                    reply.field(tag + "1", came[way]).field(tag + "2", -went[way]);
+                } else {
+                    reply.field(tag + "1", came[way] - went[way]);
+                }
+            }
+            if (brokerage == Brokerage.STANDARD) {
+                reply.field("PS", other);
+            }
+            reply.close();
+        }
+    }
+
+    private final LocalDate today;
+
+    StockHoldings(LocalDate today) {
+        this.today = today;
+    }
+
+    /** The account's holdings now; the sample account opens with three stocks. */
+    Map<String, Holding> of(Account account, Iterable<StockFill> fills) {
+        Map<String, Holding> holdings = new TreeMap<>();
+        if (account.number.equals("1234567")) {
+            holdings.put("2317", new Holding().opening(5000, 2000, 0, 0));
+            holdings.put("0050", new Holding().opening(10350, 0, 0, 1000));
+            holdings.put("2330", new Holding().opening(0, 0, 1000, 0));
+        }
+        for (StockFill fill : fills) {
+            if (fill.order.account == account && fill.within(today, LocalDate.MAX)) {
+                holdings.computeIfAbsent(fill.order.stock.code, code -> new Holding()).apply(fill);
+            }
+        }
+        return holdings;
+    }
+
+    void write(Map<String, Holding> holdings, Reply reply, Brokerage brokerage) {
+        holdings.forEach((code, holding) -> holding.write(reply, code, brokerage));
+    }
+}

@@ -1,0 +1,152 @@
+package com.brindlex.kernel.quorvane.simulator;
+
+import java.time.LocalDate;
+import java.util.List;
+import java.util.Map;
+
+/** Answers order book, fills, positions, credit and settlement of a securities account. */
+final class StockLists {
+    private static final String ALL_TRADE_TYPES = "0";
+    private static final long MARGIN_QUOTA = 500;
+
+    private final List<StockOrder> orders;
+    private final List<StockFill> fills;
+    private final StockHoldings holdings;
+    private final Brokerage brokerage;
+
+    StockLists(List<StockOrder> orders, List<StockFill> fills, StockHoldings holdings, Brokerage brokerage) {
+        this.orders = orders;
+        this.fills = fills;
+        this.holdings = holdings;
+        this.brokerage = brokerage;
+    }
+
+    String answer(Request request, Account account, LocalDate today) throws Refusal {
+        switch (request.kind()) {
+            case STOCK_ORDER_BOOK:
+                return orderBook(request, account);
+            case STOCK_FILLS:
+                return fillList(request, account);
+            case STOCK_POSITIONS:
+                return positions(request, account);
+            case STOCK_CREDIT:
+                return credit(request);
+            default:
+                return settlement(request, account, today);
+        }
+    }
+
+    /** Shares that can be sold: held for cash, less what open orders already sell. */
+    long sellable(Account account, String code) {
+        StockHoldings.Holding holding = holdings.of(account, fills).get(code);
+        long shares = holding == null ? 0 : holding.cash();
+        for (StockOrder order : orders) {
+            boolean sells = order.side == 'S' && order.kind == 0;
+            if (sells && order.account == account && order.stock.code.equals(code)) {
+                shares -= order.open();
+            }
+        }
+        return shares;
+    }
+
+    private String orderBook(Request request, Account account) throws Refusal {
+        LocalDate first = Texts.date(request.get("SDATE"), "SDATE");
+        LocalDate last = Texts.date(request.get("EDATE"), "EDATE");
+        request.number("28");
+        Reply reply = Reply.query(request);
+        for (StockOrder order : orders) {
+            LocalDate day = order.entered.toLocalDate();
+            boolean wanted = request.get("28").equals(ALL_TRADE_TYPES)
+                    || request.get("28").equals(String.valueOf(order.tradeType));
+            if (order.account == account && wanted && !day.isBefore(first) && !day.isAfter(last)) {
+                order.write(reply);
+            }
+        }
+        return reply.list();
+    }
+
+    private String fillList(Request request, Account account) throws Refusal {
+        if (!request.get("57").equals("2")) {
+            throw Refusal.malformed("57");
+        }
+        LocalDate first = westernDate(request, "SDATE");
+        LocalDate last = westernDate(request, "EDATE");
+        Reply reply = Reply.query(request);
+        for (StockFill fill : fills) {
+            if (fill.order.account == account && fill.within(first, last)) {
+                fill.write(reply);
+            }
+        }
+        return reply.list();
+    }
+
+    private static LocalDate westernDate(Request request, String tag) throws Refusal {
+        if (request.get(tag).length() != 8) {
+            throw Refusal.malformed(tag);
+        }
+        return Texts.date(request.get(tag), tag);
+    }
+
+    private String positions(Request request, Account account) throws Refusal {
+        Map<String, StockHoldings.Holding> held = holdings.of(account, fills);
+        Reply reply = Reply.query(request);
+        holdings.write(held, reply, brokerage);
+        return reply.list();
+    }
+
+    private static String credit(Request request) throws Refusal {
+        Stock stock = Stock.byCode(request.get("29"));
+        if (stock == null || !stock.credit) {
+            throw new Refusal(Refusal.Reason.NO_DATA);
+        }
+        return Reply.query(request).record().field("29", stock.code)
+                .field("76", MARGIN_QUOTA).field("77", MARGIN_QUOTA / 2)
+                .field("B8", "60").field("B9", "90").field("A0", "Y").field("A1", "Y").field("A2", "N")
+                .close().end().text();
+    }
+
+    private String settlement(Request request, Account account, LocalDate today) throws Refusal {
+        if (!request.get("H4").equals("1")) {
+            throw Refusal.malformed("H4");
+        }
+        LocalDate first;
+        LocalDate last;
+        if (request.get("SDATE").length() == 1) {
+            first = today.minusDays(daysBack(request));
+            last = today;
+        } else {
+            first = Texts.date(request.get("SDATE"), "SDATE");
+            last = Texts.date(request.get("EDATE"), "EDATE");
+        }
+        Reply reply = Reply.query(request);
+        for (StockFill fill : fills) {
+            if (fill.order.account == account && fill.within(first, last)) {
+                fill.writeSettlement(reply, brokerage);
+            }
+        }
+        return reply.list();
+    }
+
+    /** Period codes; there is no code 3. */
+    private static int daysBack(Request request) throws Refusal {
+        if (!request.get("EDATE").isEmpty()) {
+            throw Refusal.malformed("EDATE");
+        }
+        switch (request.get("SDATE")) {
+            case "1":
+                return 0;
+            case "2":
+                return 1;
+            case "4":
+                return 7;
+            case "5":
+                return 30;
+            case "6":
+                return 90;
+            case "7":
+                return 180;
+            default:
+                throw Refusal.malformed("SDATE");
+        }
+    }
+}
