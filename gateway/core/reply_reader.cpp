@@ -1,6 +1,5 @@
 #include "gateway/core/reply_reader.h"
 
-#include "gateway/core/byte_scan.h"
 #include "gateway/core/decimal.h"
 
 namespace {
@@ -8,8 +7,8 @@ namespace {
 constexpr std::string_view kGatewayError = "[GATEWAY]error";
 constexpr std::string_view kBrokerTimeout = "[BROKER]timeout";
 
-constexpr uint32_t kOpening = CTagTable::Key("00");
-constexpr uint32_t kClosing = CTagTable::Key("01");
+constexpr TagKey kOpening = MakeTagKey("00");
+constexpr TagKey kClosing = MakeTagKey("01");
 
 bool StartsWith(std::string_view text, std::string_view start) {
   return text.size() >= start.size() && memcmp(text.data(), start.data(), start.size()) == 0;
@@ -22,8 +21,7 @@ std::string_view Slice(const char* from, const char* to) {
 // Whether the bar at `bar` opens the field that ends a record: a record stops before that bar, so
 // the record's last field is not closed by it.
 bool ClosesRecord(const char* bar, const char* replyEnd) {
-  size_t tagSize = 0;
-  return bar != replyEnd && CTagTable::KeyOfField(bar + 1, replyEnd, tagSize) == kClosing;
+  return bar != replyEnd && TagKeyOf(bar + 1, replyEnd) == kClosing;
 }
 
 bool IsSkippable(std::string_view value, bool closed) {
@@ -45,15 +43,15 @@ Transport JudgeTransport(std::string_view reply) {
 }
 
 std::string_view FindField(std::string_view text, std::string_view tag, Blanks blanks) {
-  const char* const end = text.data() + text.size();
-  const char* bar = FindBar(text.data(), end);
-  while (bar != end) {
+  CBarScanner bars(text.data(), text.size());
+  const char* bar = bars.Next();
+  while (bar != bars.End()) {
     const char* const field = bar + 1;
-    bar = FindBar(field, end);
+    bar = bars.Next();
     const std::string_view whole = Slice(field, bar);
     if (!StartsWith(whole, tag) || whole.size() == tag.size() || field[tag.size()] != '=') continue;
     const std::string_view value = Slice(field + tag.size() + 1, bar);
-    if (blanks == Blanks::kSkipped && IsSkippable(value, bar != end)) continue;
+    if (blanks == Blanks::kSkipped && IsSkippable(value, bar != bars.End())) continue;
     return value;
   }
   return {};
@@ -63,16 +61,10 @@ int32_t CRecord::Number(int row, size_t bound) const {
   return ReadInt32(Text(row, bound));
 }
 
-void CRecord::Clear() {
-  m_nPresent = 0;
-  m_bEmpty = true;
-}
-
-void CRecord::Index(const char* field, const char* end, const char* replyEnd) {
-  size_t tagSize = 0;
-  const int row = m_tags.Find(CTagTable::KeyOfField(field, end, tagSize));
+inline void CRecord::Index(TagKey key, const char* field, const char* end, const char* replyEnd) {
+  const int row = m_tags.Find(key);
   if (row == CTagTable::kNone || (m_nPresent >> row & 1) != 0) return;
-  const std::string_view value = Slice(field + tagSize + 1, end);
+  const std::string_view value = Slice(field + TagSize(key), end);
   if (m_tags.SkipsBlanks(row) && IsSkippable(value, !ClosesRecord(end, replyEnd))) return;
   m_values[row] = value;
   m_nPresent |= 1U << row;
@@ -81,24 +73,19 @@ void CRecord::Index(const char* field, const char* end, const char* replyEnd) {
 bool CRecordWalker::Next(CRecord& record) {
   record.Clear();
   const char* opening = nullptr;
-  const char* bar = FindBar(m_pAt, m_pEnd);
-  while (bar != m_pEnd) {
-    const char* const start = bar;
-    const char* const field = bar + 1;
-    bar = FindBar(field, m_pEnd);
-    size_t tagSize = 0;
-    const uint32_t key = CTagTable::KeyOfField(field, bar, tagSize);
+  while (m_pBar != m_bars.End()) {
+    const char* const start = m_pBar;
+    const char* const field = start + 1;
+    m_pBar = m_bars.Next();
+    const TagKey key = TagKeyOf(field, m_pBar);
     if (key == kClosing) {
-      m_pAt = field;
-      const bool fits = opening != nullptr && static_cast<size_t>(start - opening) < m_nBound;
-      if (!fits) record.Clear();
-      record.m_bEmpty = !fits;
+      record.m_bEmpty = opening == nullptr || static_cast<size_t>(start - opening) >= m_nBound;
+      if (record.m_bEmpty) record.Clear();
       return true;
     }
-    if (opening != nullptr) record.Index(field, bar, m_pEnd);
+    if (opening != nullptr) record.Index(key, field, m_pBar, m_bars.End());
     if (key == kOpening && opening == nullptr) opening = start;
   }
-  m_pAt = m_pEnd;
   record.Clear();
   return false;
 }

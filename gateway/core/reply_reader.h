@@ -9,6 +9,8 @@
 #include <cstdint>
 #include <string_view>
 
+#include "gateway/core/byte_scan.h"
+
 // What the reply itself says of the transport.
 enum class Transport { kOk, kGatewayDown, kBrokerDown };
 
@@ -33,6 +35,38 @@ struct TagRow {
   Blanks blanks = Blanks::kTaken;
 };
 
+// A tag and its '=' as a number, first character lowest, so that a field is told by one comparison.
+using TagKey = uint32_t;
+inline constexpr TagKey kNoTag = 0;
+
+constexpr TagKey MakeTagKey(char first, char second, char third, char fourth = '\0') {
+  const char chars[] = {first, second, third, fourth};
+  TagKey key = 0;
+  for (int i = 0; i < 4; ++i) key |= TagKey{static_cast<unsigned char>(chars[i])} << (8 * i);
+  return key;
+}
+
+constexpr TagKey MakeTagKey(const char* tag) {
+  return tag[2] == '\0' ? MakeTagKey(tag[0], tag[1], '=') : MakeTagKey(tag[0], tag[1], tag[2], '=');
+}
+
+// The key of the field that starts at `field` and ends at `end`; kNoTag when it has no tag of two
+// or three characters.
+inline TagKey TagKeyOf(const char* field, const char* end) {
+  const auto size = end - field;
+  if (size >= 4) {
+    const TagKey key = MakeTagKey(field[0], field[1], field[2], field[3]);
+    if (field[2] == '=') return key & 0x00ffffff;
+    return field[3] == '=' ? key : kNoTag;
+  }
+  return size == 3 && field[2] == '=' ? MakeTagKey(field[0], field[1], '=') : kNoTag;
+}
+
+// Number of characters before the value of a field with this key.
+constexpr size_t TagSize(TagKey key) {
+  return key >> 24 == 0 ? 3 : 4;
+}
+
 // The tags that one decoder reads from its records, numbered by their place in the table: declare
 // an enum of meanings in the same order. At most kMaxTags.
 class CTagTable {
@@ -43,63 +77,43 @@ class CTagTable {
   template <size_t N>
   constexpr explicit CTagTable(const TagRow (&rows)[N]) {
     static_assert(N <= kMaxTags, "a table holds at most kMaxTags tags");
-    for (size_t row = 0; row < N; ++row) {
-      m_skips[row] = rows[row].blanks == Blanks::kSkipped;
-      size_t place = Place(Key(rows[row].tag));
-      while (m_entries[place].key != 0) place = (place + 1) % kPlaces;
-      m_entries[place].key = Key(rows[row].tag);
-      m_entries[place].row = static_cast<int>(row);
-    }
+    while (!Place(rows, N)) m_nFactor += 2;
   }
 
   // The row of the tag with this key, or kNone.
-  int Find(uint32_t key) const {
-    size_t place = Place(key);
-    while (m_entries[place].key != 0) {
-      if (m_entries[place].key == key) return m_entries[place].row;
-      place = (place + 1) % kPlaces;
-    }
-    return kNone;
+  int Find(TagKey key) const {
+    const Entry& entry = m_entries[PlaceOf(key)];
+    return entry.key == key ? entry.row : kNone;
   }
 
-  bool SkipsBlanks(int row) const { return m_skips[row]; }
-
-  // A tag and its '=' as a number, first character lowest; the text has 2 or 3 characters.
-  static constexpr uint32_t Key(const char* tag) {
-    uint32_t key = Byte(tag[0]) | Byte(tag[1]) << 8;
-    if (tag[2] == '\0') return key | Byte('=') << 16;
-    return key | Byte(tag[2]) << 16 | Byte('=') << 24;
-  }
-
-  // The key of the field that starts at `field` and ends at `end`, 0 when its tag has another
-  // length; `tagSize` is then the number of characters before the '='.
-  static uint32_t KeyOfField(const char* field, const char* end, size_t& tagSize) {
-    const auto size = static_cast<size_t>(end - field);
-    if (size >= 3 && field[2] == '=') {
-      tagSize = 2;
-      return Byte(field[0]) | Byte(field[1]) << 8 | Byte('=') << 16;
-    }
-    if (size >= 4 && field[3] == '=') {
-      tagSize = 3;
-      return Byte(field[0]) | Byte(field[1]) << 8 | Byte(field[2]) << 16 | Byte('=') << 24;
-    }
-    return 0;
-  }
+  bool SkipsBlanks(int row) const { return (m_nSkips >> row & 1) != 0; }
 
  private:
-  static constexpr size_t kPlaces = 128;  // sparse, so that a look-up meets its tag at once
+  static constexpr size_t kPlaces = 256;
 
   struct Entry {
-    uint32_t key = 0;
+    TagKey key = 0xffffffff;  // no field has this key
     int row = kNone;
   };
 
-  static constexpr uint32_t Byte(char c) { return static_cast<unsigned char>(c); }
+  constexpr size_t PlaceOf(TagKey key) const { return key * m_nFactor >> 24; }
 
-  static constexpr size_t Place(uint32_t key) { return (key * 0x9e3779b1U) >> 25; }
+  // Whether every tag found a place of its own with the present factor.
+  constexpr bool Place(const TagRow* rows, size_t count) {
+    for (Entry& entry : m_entries) entry = Entry();
+    for (size_t row = 0; row < count; ++row) {
+      Entry& entry = m_entries[PlaceOf(MakeTagKey(rows[row].tag))];
+      if (entry.row != kNone) return false;
+      entry.key = MakeTagKey(rows[row].tag);
+      entry.row = static_cast<int>(row);
+      if (rows[row].blanks == Blanks::kSkipped) m_nSkips |= 1U << row;
+    }
+    return true;
+  }
 
   Entry m_entries[kPlaces] = {};
-  bool m_skips[kMaxTags] = {};
+  uint32_t m_nFactor = 0x9e3779b1;
+  uint32_t m_nSkips = 0;  // bit per row
 };
 
 // One record's fields, indexed once. A tag that stands several times counts where it stands first.
@@ -125,8 +139,11 @@ class CRecord {
  private:
   friend class CRecordWalker;
 
-  void Clear();
-  void Index(const char* field, const char* end, const char* replyEnd);
+  void Clear() {
+    m_bEmpty = true;
+    m_nPresent = 0;
+  }
+  void Index(TagKey key, const char* field, const char* end, const char* replyEnd);
 
   const CTagTable& m_tags;
   bool m_bEmpty = true;
@@ -140,15 +157,15 @@ class CRecordWalker {
   // `bound` is the size of the record buffer: a record of that many characters or more is dropped
   // and comes out empty.
   CRecordWalker(std::string_view reply, size_t bound)
-      : m_pAt(reply.data()), m_pEnd(reply.data() + reply.size()), m_nBound(bound) {}
+      : m_bars(reply.data(), reply.size()), m_pBar(m_bars.Next()), m_nBound(bound) {}
 
   // Indexes the next record. A closing field before any opening one, like a dropped record, gives
   // an empty record. Returns false, with an empty record, when no complete record is left.
   bool Next(CRecord& record);
 
  private:
-  const char* m_pAt;
-  const char* m_pEnd;
+  CBarScanner m_bars;
+  const char* m_pBar;  // the first bar that was not looked behind
   size_t m_nBound;
 };
 
