@@ -1,0 +1,136 @@
+// The session object: its fields, its setters, its log.
+
+#include "tests/unit/session.h"
+
+#include <cstring>
+#include <type_traits>
+
+#include "gateway/core/gateway_pub.h"
+#include "gateway/core/log.h"
+
+namespace gateway_tests {
+namespace {
+
+using SessionObject = CSessionTest;
+
+// A host that knows the object by its layout finds each field where it expects it.
+TEST_F(SessionObject, FieldsStandInTheirOrder) {
+  CGatewayPub gateway;
+  const auto place = [&gateway](const void* field) {
+    return static_cast<const char*>(field) - reinterpret_cast<const char*>(&gateway);
+  };
+  const auto pointer = static_cast<std::ptrdiff_t>(sizeof(void*));
+  const std::ptrdiff_t first = place(&gateway.m_nDataSize);
+  EXPECT_EQ(first, pointer);
+  EXPECT_EQ(place(&gateway.m_nDataLen), first + 4);
+  EXPECT_EQ(place(gateway.m_szBuffer), first + 8);
+  EXPECT_EQ(place(&gateway.m_pData), first + 8 + 4096);
+  EXPECT_EQ(place(&gateway.m_nMarket), first + 8 + 4096 + pointer);
+  EXPECT_EQ(place(&gateway.m_nPlatform), place(&gateway.m_nMarket) + 4);
+  EXPECT_EQ(place(&gateway.m_nSeqNo), place(&gateway.m_nMarket) + 8);
+  EXPECT_EQ(place(gateway.m_szSerialNo), place(&gateway.m_nMarket) + 12);
+  EXPECT_EQ(place(gateway.m_szLocalIP), place(gateway.m_szSerialNo) + 20);
+  EXPECT_EQ(sizeof gateway.m_szBuffer, 4096U);
+  EXPECT_EQ(sizeof gateway.m_szSerialNo, 20U);
+  EXPECT_EQ(sizeof gateway.m_szLocalIP, 64U);
+}
+
+TEST_F(SessionObject, HasAVirtualDestructorAndIsNotCopied) {
+  EXPECT_TRUE(std::has_virtual_destructor_v<CGatewayPub>);
+  EXPECT_FALSE(std::is_copy_constructible_v<CGatewayPub>);
+  EXPECT_FALSE(std::is_copy_assignable_v<CGatewayPub>);
+}
+
+TEST_F(SessionObject, StartsZeroedAndLogsNothing) {
+  alignas(CGatewayPub) char memory[sizeof(CGatewayPub)];
+  memset(memory, 0x5a, sizeof memory);
+  auto* gateway = new (memory) CGatewayPub;
+  EXPECT_EQ(gateway->m_nDataSize, 0);
+  EXPECT_EQ(gateway->m_nDataLen, 0);
+  EXPECT_EQ(gateway->m_pData, nullptr);
+  EXPECT_EQ(gateway->m_nMarket, 0);
+  EXPECT_EQ(gateway->m_nPlatform, 0);
+  EXPECT_EQ(gateway->m_nSeqNo, 0);
+  EXPECT_EQ(std::string(gateway->m_szSerialNo, 20), std::string(20, '\0'));
+  EXPECT_EQ(std::string(gateway->m_szLocalIP, 64), std::string(64, '\0'));
+  EXPECT_EQ(m_log.Take(), TLines{});
+  gateway->~CGatewayPub();
+  EXPECT_EQ(m_log.Take(), TLines{"~CGatewayPub"});
+}
+
+TEST_F(SessionObject, BothLogFunctionsWriteTheSameLine) {
+  CGatewayPub gateway;
+  gateway.debuglog("member");
+  debuglog("free");
+  debuglog("");
+  gateway.debuglog("");
+  EXPECT_EQ(m_log.Take(), (TLines{"member", "free", "", ""}));
+}
+
+TEST_F(SessionObject, NullTextIsLoggedAsAnEmptyLine) {
+  CGatewayPub gateway;
+  gateway.debuglog(nullptr);
+  debuglog(nullptr);
+  EXPECT_EQ(m_log.Take(), (TLines{"", ""}));
+}
+
+struct FieldCase {
+  size_t given;  // length of the text
+  size_t kept;   // characters in the field
+};
+
+constexpr FieldCase kSerialCases[] = {{0, 0}, {1, 1}, {19, 19}, {20, 20}, {21, 20}, {4096, 20}};
+constexpr FieldCase kAddressCases[] = {{0, 0}, {1, 1}, {63, 63}, {64, 64}, {65, 64}, {4096, 64}};
+
+TEST_F(SessionObject, SerialNumberKeepsUpTo20CharactersAndNothingBesideItsField) {
+  for (const FieldCase& row : kSerialCases) {
+    CGatewayPub gateway;
+    gateway.setLocalIP("10.0.0.1");
+    gateway.setSerialNumber(CTextAtPageEnd(std::string(row.given, 'x')));
+    EXPECT_EQ(std::string(gateway.m_szSerialNo, strnlen(gateway.m_szSerialNo, 20)),
+              std::string(row.kept, 'x'))
+        << row.given;
+    EXPECT_STREQ(gateway.m_szLocalIP, "10.0.0.1") << row.given;
+    EXPECT_EQ(gateway.m_nSeqNo, 0) << row.given;
+  }
+}
+
+TEST_F(SessionObject, LocalAddressKeepsUpTo64CharactersAndNothingBesideItsField) {
+  for (const FieldCase& row : kAddressCases) {
+    struct {
+      CGatewayPub gateway;
+      char behind[8] = "untold!";
+    } host;
+    host.gateway.setSerialNumber("SN0001");
+    host.gateway.setLocalIP(CTextAtPageEnd(std::string(row.given, '1')));
+    EXPECT_EQ(std::string(host.gateway.m_szLocalIP, strnlen(host.gateway.m_szLocalIP, 64)),
+              std::string(row.kept, '1'))
+        << row.given;
+    EXPECT_STREQ(host.gateway.m_szSerialNo, "SN0001") << row.given;
+    EXPECT_STREQ(host.behind, "untold!") << row.given;
+  }
+}
+
+TEST_F(SessionObject, NullClearsTheWholeField) {
+  CGatewayPub gateway;
+  gateway.setSerialNumber("12345678901234567890");
+  gateway.setLocalIP("10.0.0.1");
+  gateway.setSerialNumber(nullptr);
+  EXPECT_EQ(std::string(gateway.m_szSerialNo, 20), std::string(20, '\0'));
+  EXPECT_STREQ(gateway.m_szLocalIP, "10.0.0.1");
+  gateway.setLocalIP(nullptr);
+  EXPECT_EQ(std::string(gateway.m_szLocalIP, 64), std::string(64, '\0'));
+}
+
+TEST_F(SessionObject, ShorterTextReplacesALongerOne) {
+  CGatewayPub gateway;
+  gateway.setSerialNumber("12345678901234567890");
+  gateway.setSerialNumber("AB");
+  EXPECT_STREQ(gateway.m_szSerialNo, "AB");
+  gateway.setLocalIP("2001:db8::1");
+  gateway.setLocalIP("::1");
+  EXPECT_STREQ(gateway.m_szLocalIP, "::1");
+}
+
+}  // namespace
+}  // namespace gateway_tests
