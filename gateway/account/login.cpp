@@ -12,23 +12,23 @@
 
 namespace {
 
-// Room for one record: a longer one reads as empty, which ends the list.
-constexpr size_t kRecordSize = 200;
+// The end mark is above 900000 here, and a record without content ends the list too.
+constexpr ListShape kShape = {200, 20, 20, 0, true, 900001};
 
 constexpr size_t kNoticeSize = 300;
 
-constexpr int kLastSequence = 900000;  // a record numbered above it marks the end of the list
-
-enum Field { kSequence, kCode, kType, kM5, kField16, kAccountHead, kAccountTail, kName };
+enum Field { kType = kOwnFields, kM5, kField16, kAccountHead, kAccountTail, kName };
 
 constexpr CTagTable kTags({{"67"},
                            {"68"},
+                           {"M2"},
                            {"07"},
                            {"M5"},
                            {"16"},
                            {"17", Blanks::kSkipped},
                            {"18", Blanks::kSkipped},
                            {"69"}});
+static_assert(OpensListTable(kTags), "the list frame reads its rows");
 
 void LogText(const char* label, std::string_view text) {
   char scratch[kNoticeSize + 20];
@@ -65,13 +65,8 @@ void AppendAccountLine(CResultText& list, const CRecord& record) {
 
 int AppendAccountLines(CResultText& list, std::string_view reply) {
   int count = 0;
-  CRecord record(kTags);
-  CRecordWalker walker(reply, kRecordSize);
-  while (walker.Next(record) && !record.Empty()) {
-    if (record.Number(kSequence, 20) > kLastSequence) break;
-    if (record.Text(kCode, 20) != "0000") continue;
-    AppendAccountLine(list, record);
-    ++count;
+  for (CReplyList accounts(reply, kTags, kShape); accounts.NextData(); ++count) {
+    AppendAccountLine(list, accounts.Record());
   }
   return count;
 }

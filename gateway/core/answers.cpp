@@ -38,6 +38,18 @@ char* CGatewayPub::Refuse(std::string_view message, std::string_view code, int* 
   return answer.Text();
 }
 
+char* CGatewayPub::AnswerWithoutData(const CReplyList& list, std::string_view noData, int* status) {
+  switch (list.Verdict()) {
+    case ListVerdict::kNoData:
+      return Answer(noData);
+    case ListVerdict::kRefused:
+      return Refuse(list.Message(), list.Code(), status);
+    case ListVerdict::kData:
+      break;
+  }
+  return nullptr;
+}
+
 char* CGatewayPub::FinishList(CResultText& records, int count, int* status) {
   char* const list = records.Finish("", count);
   if (list == nullptr) *status = -1;

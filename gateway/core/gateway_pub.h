@@ -7,6 +7,7 @@
 #include <cstdint>
 #include <string_view>
 
+#include "gateway/core/list_frame.h"
 #include "gateway/core/reply_reader.h"
 #include "gateway/core/result_text.h"
 #include "gateway/core/text_writer.h"
@@ -169,6 +170,10 @@ class CGatewayPub {
   // Ends a decoder with a gateway's refusal: the message with its source, then the code in
   // parentheses if there is one; status -1.
   char* Refuse(std::string_view message, std::string_view code, int* status);
+
+  // Ends the decoder of a list that the reply refuses, or that has nothing to show, which the user
+  // interface knows as `noData`. Null when there is data: ask before the walk.
+  char* AnswerWithoutData(const CReplyList& list, std::string_view noData, int* status);
 
   // Ends a decoder with its list, "count!records"; a null text and status -1 when memory ran out.
   static char* FinishList(CResultText& records, int count, int* status);

@@ -81,7 +81,7 @@ class CTagTable {
   }
 
   // The row of the tag with this key, or kNone.
-  int Find(TagKey key) const {
+  constexpr int Find(TagKey key) const {
     const Entry& entry = m_entries[PlaceOf(key)];
     return entry.key == key ? entry.row : kNone;
   }
