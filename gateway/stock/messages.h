@@ -1,0 +1,16 @@
+// The texts that a user of the stock market may be shown, beside those of every operation.
+#ifndef QUORVANE_GATEWAY_STOCK_MESSAGES_H_
+#define QUORVANE_GATEWAY_STOCK_MESSAGES_H_
+
+#include "gateway/core/messages.h"
+
+// Orders that are not sent. A quantity of 0 is refused too, by the words for one below 0.
+inline constexpr char kPriceKindError[] = "[CLIENT] 委託價格錯誤";
+inline constexpr char kTradeTypeError[] = "[CLIENT] 委託交易錯誤";
+inline constexpr char kStockCodeTooLong[] = "[CLIENT] 股票代號最多六碼";
+inline constexpr char kQuantityError[] = "[CLIENT] 委託數量不可小於0";
+
+// Queries that are not sent.
+inline constexpr char kDateError[] = "[CLIENT] 日期輸入錯誤";
+
+#endif  // QUORVANE_GATEWAY_STOCK_MESSAGES_H_
