@@ -180,31 +180,35 @@ CRecordingHost::CRecordingHost(EPlacement placement)
 CRecordingHost::~CRecordingHost() = default;
 
 TOutcome CRecordingHost::Call(const TExport& row, const TArguments& arguments) {
+  return CallAt(row.EntryPoint(), row, arguments);
+}
+
+TOutcome CRecordingHost::CallAt(void* entryPoint, const TExport& row, const TArguments& arguments) {
   m_Outcome = TOutcome();
   m_Texts.clear();
   m_pResult.reset();
   m_bExceptionPending = false;
   m_pStatus = row.HasStatus() && !m_bNullStatus ? std::make_unique<TStatus>() : nullptr;
-
-  void* const entryPoint = row.EntryPoint();
-  const size_t expected = row.m_szShape.size() - (row.HasStatus() ? 1 : 0);
-  if (entryPoint == nullptr) {
-    Violation("the library does not export " + row.SymbolName());
-    return std::move(m_Outcome);
+  if (entryPoint == nullptr) Violation("the library does not export " + row.SymbolName());
+  const std::vector<jvalue> values = MakeValues(row, arguments);
+  if (m_Outcome.m_Violations.empty()) {
+    ListenToLog(this);
+    const jstring returned = row.m_pCall(entryPoint, m_pEnvironment.get(), values.data());
+    ListenToLog(nullptr);
+    Finish(row, returned);
   }
-  if (arguments.size() != expected) {
-    Violation("the test passes " + std::to_string(arguments.size()) + " arguments, not " +
-              std::to_string(expected));
-    return std::move(m_Outcome);
-  }
+  return std::move(m_Outcome);
+}
 
-  std::vector<jvalue> values(row.m_szShape.size());
+std::vector<jvalue> CRecordingHost::MakeValues(const TExport& row, const TArguments& arguments) {
+  std::string shape;
+  for (const TArgument& argument : arguments) shape.push_back(argument.m_chLetter);
+  if (row.HasStatus()) shape.push_back('s');
+  if (shape != row.m_szShape) Violation("the test passes the arguments " + shape);
+
+  std::vector<jvalue> values(shape.size());
   for (size_t i = 0; i < arguments.size(); ++i) {
     const TArgument& argument = arguments[i];
-    if (argument.m_chLetter != row.m_szShape[i]) {
-      Violation("the test passes another type as argument " + std::to_string(i + 1));
-      return std::move(m_Outcome);
-    }
     switch (argument.m_chLetter) {
       case 'i':
         values[i].i = static_cast<jint>(argument.m_nNumber);
@@ -225,12 +229,7 @@ TOutcome CRecordingHost::Call(const TExport& row, const TArguments& arguments) {
     }
   }
   if (row.HasStatus()) values.back().l = m_pStatus != nullptr ? m_pStatus->Handle() : nullptr;
-
-  ListenToLog(this);
-  const jstring returned = row.m_pCall(entryPoint, m_pEnvironment.get(), values.data());
-  ListenToLog(nullptr);
-  Finish(row, returned);
-  return std::move(m_Outcome);
+  return values;
 }
 
 void CRecordingHost::Finish(const TExport& row, jstring returned) {

@@ -72,6 +72,9 @@ class CRecordingHost : private ILogListener {
   /// Calls `row` with `arguments`, which must fit its shape without the status array.
   TOutcome Call(const TExport& row, const TArguments& arguments);
 
+  /// Calls another function of the row's shape in place of the library's.
+  TOutcome CallAt(void* entryPoint, const TExport& row, const TArguments& arguments);
+
  private:
   struct TEnvironment;
   struct TText;
@@ -82,6 +85,7 @@ class CRecordingHost : private ILogListener {
   void Note(std::string_view what, std::string_view detail);
   void Violation(std::string text);
   bool MustFail(const char* function);
+  std::vector<jvalue> MakeValues(const TExport& row, const TArguments& arguments);
   void Finish(const TExport& row, jstring returned);
 
   EPlacement m_ePlacement;

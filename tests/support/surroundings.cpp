@@ -1,6 +1,5 @@
 #include "tests/support/surroundings.h"
 
-#include <atomic>
 #include <cstdlib>
 #include <string>
 
@@ -8,7 +7,7 @@ namespace gateway_tests {
 namespace {
 
 constexpr std::time_t kClockNotSet = -1;
-std::atomic<std::time_t> g_tClock{kClockNotSet};
+thread_local std::time_t t_tClock = kClockNotSet;
 thread_local ILogListener* t_pListener = nullptr;
 
 }  // namespace
@@ -20,7 +19,7 @@ void EnterMarketTimeZone() {
 }
 
 void SetClock(std::time_t when) {
-  g_tClock = when;
+  t_tClock = when;
 }
 
 bool SetClock(std::string_view localTime) {
@@ -41,7 +40,7 @@ void ListenToLog(ILogListener* listener) {
 extern "C" {
 
 __attribute__((visibility("default"))) std::time_t time(std::time_t* out) noexcept {
-  std::time_t now = gateway_tests::g_tClock;
+  std::time_t now = gateway_tests::t_tClock;
   if (now == gateway_tests::kClockNotSet) {
     std::timespec real{};
     clock_gettime(CLOCK_REALTIME, &real);

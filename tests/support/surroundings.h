@@ -13,7 +13,7 @@ namespace gateway_tests {
 /// Sets the time zone of the market. To be called first in main, before any thread exists.
 void EnterMarketTimeZone();
 
-/// Stops the clock of this process at `when`, for all threads.
+/// Stops the clock of the calling thread at `when`. Threads that never do so have the real time.
 void SetClock(std::time_t when);
 
 /// Stops the clock at a local time "2024-01-15 13:45:21"; false when the text is no such time.

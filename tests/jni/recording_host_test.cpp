@@ -1,0 +1,178 @@
+// The recording host itself: each thing that no entry point may do is seen.
+
+#include "tests/support/recording_host.h"
+
+#include <gtest/gtest.h>
+
+#include <cstring>
+#include <string>
+#include <vector>
+
+namespace gateway_tests {
+namespace {
+
+using TDecodeFunction = jstring (*)(JNIEnv*, jclass, jstring, jintArray);
+
+TOutcome CallDecoder(TDecodeFunction function, const TArgument& reply = TArgument::Text("text"),
+                     EPlacement placement = EPlacement::kHeap) {
+  CRecordingHost host(placement);
+  return host.CallAt(reinterpret_cast<void*>(function), *FindExport("AuthDecode"), {reply});
+}
+
+/// An entry point as it should be; the others below are this one with one mistake.
+jstring Good(JNIEnv* env, jclass, jstring reply, jintArray status) {
+  const char* text = env->GetStringUTFChars(reply, nullptr);
+  jint* elements = env->GetIntArrayElements(status, nullptr);
+  elements[0] = static_cast<jint>(std::strlen(text)) - 3;
+  env->ReleaseStringUTFChars(reply, text);
+  env->ReleaseIntArrayElements(status, elements, 0);
+  return env->NewStringUTF("result");
+}
+
+TEST(RecordingHost, PassesAGoodCall) {
+  const TOutcome outcome = CallDecoder(&Good);
+  EXPECT_TRUE(outcome.IsSound());
+  EXPECT_EQ(outcome.m_Result, "result");
+  EXPECT_EQ(outcome.m_Status, 1);
+  EXPECT_EQ(outcome.m_nFallibleCalls, 3);
+}
+
+TEST(RecordingHost, SeesAStringThatIsNeverReleased) {
+  const TOutcome outcome = CallDecoder([](JNIEnv* env, jclass, jstring reply, jintArray) {
+    env->GetStringUTFChars(reply, nullptr);
+    return env->NewStringUTF("");
+  });
+  EXPECT_EQ(outcome.m_Violations, std::vector<std::string>{"string 1 was never released"});
+}
+
+TEST(RecordingHost, SeesElementsThatAreNeverReleased) {
+  const TOutcome outcome = CallDecoder([](JNIEnv* env, jclass, jstring, jintArray status) {
+    env->GetIntArrayElements(status, nullptr)[0] = 1;
+    return env->NewStringUTF("");
+  });
+  EXPECT_EQ(outcome.m_Violations,
+            std::vector<std::string>{"the status elements were never released"});
+  EXPECT_NE(outcome.m_Status, 1) << "only a release writes back";
+}
+
+TEST(RecordingHost, WritesNothingBackWhenElementsAreAbandoned) {
+  const TOutcome outcome = CallDecoder([](JNIEnv* env, jclass, jstring, jintArray status) {
+    jint* elements = env->GetIntArrayElements(status, nullptr);
+    elements[0] = 1;
+    env->ReleaseIntArrayElements(status, elements, JNI_ABORT);
+    return env->NewStringUTF("");
+  });
+  EXPECT_NE(outcome.m_Status, 1);
+  EXPECT_FALSE(outcome.IsSound());
+}
+
+TEST(RecordingHost, SeesADoubleReleaseAndAForeignPointer) {
+  const TOutcome twice = CallDecoder([](JNIEnv* env, jclass, jstring reply, jintArray) {
+    const char* text = env->GetStringUTFChars(reply, nullptr);
+    env->ReleaseStringUTFChars(reply, text);
+    env->ReleaseStringUTFChars(reply, text);
+    return env->NewStringUTF("");
+  });
+  EXPECT_EQ(twice.m_Violations,
+            std::vector<std::string>{"ReleaseStringUTFChars: string is not held"});
+  const TOutcome foreign = CallDecoder([](JNIEnv* env, jclass, jstring reply, jintArray) {
+    env->ReleaseStringUTFChars(reply, env->GetStringUTFChars(reply, nullptr) + 1);
+    return env->NewStringUTF("");
+  });
+  EXPECT_EQ(foreign.m_Violations,
+            std::vector<std::string>{"ReleaseStringUTFChars: not the pointer handed out"});
+}
+
+TEST(RecordingHost, SeesAWriteIntoTheCharacters) {
+  const TOutcome outcome = CallDecoder([](JNIEnv* env, jclass, jstring reply, jintArray) {
+    const char* text = env->GetStringUTFChars(reply, nullptr);
+    const_cast<char*>(text)[0] = 'X';
+    env->ReleaseStringUTFChars(reply, text);
+    return env->NewStringUTF("");
+  });
+  EXPECT_EQ(outcome.m_Violations,
+            std::vector<std::string>{"ReleaseStringUTFChars: the characters were written to"});
+}
+
+TEST(RecordingHost, SeesARequestForTheCharactersOfNull) {
+  const TOutcome outcome = CallDecoder(
+      [](JNIEnv* env, jclass, jstring reply, jintArray) {
+        env->GetStringUTFChars(reply, nullptr);
+        return env->NewStringUTF("");
+      },
+      TArgument::Null());
+  EXPECT_EQ(outcome.m_Violations,
+            std::vector<std::string>{"GetStringUTFChars: not a string of this call"});
+}
+
+TEST(RecordingHost, SeesAResultThatTheMachineDidNotMake) {
+  const TOutcome outcome =
+      CallDecoder([](JNIEnv*, jclass, jstring reply, jintArray) { return reply; });
+  EXPECT_EQ(outcome.m_Violations,
+            std::vector<std::string>{"the returned string is not the one made"});
+}
+
+TEST(RecordingHost, SeesAStringMadeWhileAnExceptionIsPending) {
+  CRecordingHost host;
+  host.FailCall(1);
+  const TOutcome outcome = host.CallAt(reinterpret_cast<void*>(static_cast<TDecodeFunction>(
+                                           [](JNIEnv* env, jclass, jstring reply, jintArray) {
+                                             env->GetStringUTFChars(reply, nullptr);
+                                             return env->NewStringUTF("");
+                                           })),
+                                       *FindExport("AuthDecode"), {TArgument::Text("")});
+  EXPECT_FALSE(outcome.m_Violations.empty());
+}
+
+TEST(RecordingHost, KnowsTheStringsThatAccountOpeningKeeps) {
+  TArguments arguments(3, TArgument::Int(0));
+  arguments.resize(3 + 8, TArgument::Text(""));
+  arguments.resize(3 + 8 + 2, TArgument::Byte(0));
+  using TOpenFunction =
+      jstring (*)(JNIEnv*, jclass, jint, jint, jint, jstring, jstring, jstring, jstring, jstring,
+                  jstring, jstring, jstring, jbyte, jbyte, jintArray);
+  const TOpenFunction releasesAll = [](JNIEnv* env, jclass, jint, jint, jint, jstring, jstring,
+                                       jstring, jstring, jstring, jstring, jstring, jstring last,
+                                       jbyte, jbyte, jintArray) {
+    env->ReleaseStringUTFChars(last, env->GetStringUTFChars(last, nullptr));
+    return env->NewStringUTF("");
+  };
+  CRecordingHost host;
+  const TOutcome outcome = host.CallAt(reinterpret_cast<void*>(releasesAll),
+                                       *FindExport("OpenAccountEncode"), arguments);
+  EXPECT_EQ(outcome.m_Violations,
+            std::vector<std::string>{"string 8 was released, but this export keeps it"});
+}
+
+TEST(RecordingHostDeathTest, EndsOnAForbiddenCallWithItsName) {
+  EXPECT_DEATH(CallDecoder([](JNIEnv* env, jclass, jstring reply, jintArray) {
+                 env->GetStringUTFLength(reply);
+                 return env->NewStringUTF("");
+               }),
+               "forbidden VM call: GetStringUTFLength");
+  EXPECT_DEATH(CallDecoder([](JNIEnv* env, jclass, jstring, jintArray) {
+                 env->ExceptionCheck();
+                 return env->NewStringUTF("");
+               }),
+               "forbidden VM call: ExceptionCheck");
+}
+
+/// Reads `distance` bytes off the end (or, negative, off the begin) of the reply "text".
+template <int kDistance>
+jstring Overread(JNIEnv* env, jclass, jstring reply, jintArray) {
+  const char* text = env->GetStringUTFChars(reply, nullptr);
+  const volatile char* byte = text + (kDistance < 0 ? kDistance : 4 + kDistance);
+  const char result[] = {*byte, '\0'};
+  env->ReleaseStringUTFChars(reply, text);
+  return env->NewStringUTF(result);
+}
+
+TEST(RecordingHostDeathTest, OneByteTooFarCrashes) {
+  const TArgument text = TArgument::Text("text");
+  EXPECT_DEATH(CallDecoder(&Overread<1>, text, EPlacement::kBeforeUnreadable), "");
+  EXPECT_DEATH(CallDecoder(&Overread<-1>, text, EPlacement::kAfterUnreadable), "");
+  EXPECT_EQ(CallDecoder(&Overread<0>, text, EPlacement::kBeforeUnreadable).m_Result, "");
+}
+
+}  // namespace
+}  // namespace gateway_tests
