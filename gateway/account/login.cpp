@@ -53,7 +53,7 @@ void AppendAccount(CResultText& list, std::string_view head, std::string_view ta
   if (text.empty() || text.size() >= 7) {
     list.AppendText(text);
   } else {
-    list.AppendNumber(ReadInt32(text), 7);
+    list.Append(WIRE("%07d"), ReadInt32(text));
   }
 }
 

@@ -97,9 +97,8 @@ void CGatewayPub::SetPriceString(int value, int decimals, char* out, int outSize
   const int64_t unit = decimals > 0 ? PowerOfTen32(decimals) : 1;
   const size_t width = decimals > 0 ? static_cast<size_t>(decimals) : 0;
   CTextWriter text(out, static_cast<size_t>(outSize));
-  text.AppendNumber(value / unit);
-  text.AppendChar('.');
-  text.AppendNumber(value % unit, width);
+  text.Append(WIRE("%ld."), value / unit);
+  text.AppendPadded(value % unit, width);
   if (text.Overflowed()) text.Replace("");
   text.Text();
 }

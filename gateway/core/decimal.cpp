@@ -24,6 +24,8 @@ constexpr int64_t kPowersOfTen[] = {1,
                                     100000000000000000,
                                     1000000000000000000};
 
+constexpr ptrdiff_t kSafeDigits = 18;
+
 constexpr bool IsSpace(char c) {
   return c == ' ' || (c >= '\t' && c <= '\r');
 }
@@ -32,17 +34,28 @@ constexpr bool IsDigit(char c) {
   return c >= '0' && c <= '9';
 }
 
+constexpr uint64_t Magnitude(int64_t value) {
+  return value < 0 ? 0 - static_cast<uint64_t>(value) : static_cast<uint64_t>(value);
+}
+
 }  // namespace
 
 int64_t ReadInt64(std::string_view text) {
   const char* at = text.data();
   const char* const end = at + text.size();
-  while (at != end && IsSpace(*at)) ++at;
-  const bool negative = at != end && *at == '-';
-  if (at != end && (*at == '-' || *at == '+')) ++at;
-
-  const uint64_t limit = static_cast<uint64_t>(INT64_MAX) + (negative ? 1 : 0);
+  bool negative = false;
+  if (at != end && !IsDigit(*at)) {
+    while (at != end && IsSpace(*at)) ++at;
+    negative = at != end && *at == '-';
+    if (at != end && (*at == '-' || *at == '+')) ++at;
+  }
+  // So many digits fit 64 bits without a look.
+  const char* const safe = end - at > kSafeDigits ? at + kSafeDigits : end;
   uint64_t magnitude = 0;
+  for (; at != safe && IsDigit(*at); ++at) {
+    magnitude = magnitude * 10 + static_cast<uint64_t>(*at - '0');
+  }
+  const uint64_t limit = static_cast<uint64_t>(INT64_MAX) + (negative ? 1 : 0);
   for (; at != end && IsDigit(*at); ++at) {
     const auto digit = static_cast<uint64_t>(*at - '0');
     if (magnitude > (limit - digit) / 10) {
@@ -67,4 +80,20 @@ int64_t PowerOfTen64(int exponent) {
   if (exponent < 0) return 0;
   const auto row = static_cast<size_t>(exponent);
   return row < std::size(kPowersOfTen) ? kPowersOfTen[row] : INT64_MAX;
+}
+
+size_t DecimalSize(int64_t value, size_t width) {
+  size_t size = value < 0 ? 2 : 1;
+  for (uint64_t rest = Magnitude(value); rest >= 10; rest /= 10) ++size;
+  return size < width ? width : size;
+}
+
+char* WriteDecimal(char* at, int64_t value, size_t width) {
+  const size_t size = DecimalSize(value, width);
+  if (value < 0) *at = '-';
+  uint64_t rest = Magnitude(value);
+  for (size_t i = size; i > (value < 0 ? 1U : 0U); rest /= 10) {
+    at[--i] = static_cast<char>('0' + rest % 10);
+  }
+  return at + size;
 }

@@ -4,7 +4,9 @@
 
 #include <cstddef>
 #include <cstdint>
+#include <cstring>
 #include <string_view>
+#include <type_traits>
 
 // Reads a number as C's `atoll` does: blanks, a sign, digits up to the first other character.
 // Saturates at the 64-bit limits; a text without digits is 0.
@@ -12,6 +14,10 @@ int64_t ReadInt64(std::string_view text);
 
 // As ReadInt64, then narrowed to 32 bits by wrapping: what `atoi` gives where `long` has 64 bits.
 int32_t ReadInt32(std::string_view text);
+
+constexpr uint64_t PowerOfTen(size_t exponent) {
+  return exponent == 0 ? 1 : 10 * PowerOfTen(exponent - 1);
+}
 
 // 10 to the power `exponent`, saturated at the type's maximum; 0 for a negative exponent.
 int32_t PowerOfTen32(int exponent);
@@ -34,55 +40,46 @@ inline int64_t WrapMultiply(int64_t a, int64_t b) {
   return static_cast<int64_t>(static_cast<uint64_t>(a) * static_cast<uint64_t>(b));
 }
 
-// Number of decimal digits of `value`; 1 for 0.
-inline size_t CountDigits(uint64_t value) {
-  size_t count = 1;
-  while (value >= 10000) {
-    value /= 10000;
-    count += 4;
-  }
-  if (value >= 1000) return count + 3;
-  if (value >= 100) return count + 2;
-  return value >= 10 ? count + 1 : count;
+// The longest number of its type, with a sign.
+template <class Signed>
+inline constexpr size_t kMaxDecimalSize = sizeof(Signed) == 4 ? 11 : 20;
+
+// "00" to "99", so that digits are written two at a time.
+inline constexpr char kDigitPairs[] =
+    "0001020304050607080910111213141516171819202122232425262728293031323334353637383940414243444546"
+    "4748495051525354555657585960616263646566676869707172737475767778798081828384858687888990919293"
+    "949596979899";
+
+inline void WriteDigitPair(char* at, uint32_t value) {
+  memcpy(at, kDigitPairs + 2 * value, 2);
 }
 
-// Writes exactly `count` digits of `value` at `at`, zero-padded on the left.
-inline void WriteDigits(char* at, uint64_t value, size_t count) {
-  while (count > 0 && value > UINT32_MAX) {
-    at[--count] = static_cast<char>('0' + value % 10);
-    value /= 10;
+// Writes the last `kCount` digits of `value`, zero-padded on the left; returns the place behind.
+template <size_t kCount>
+inline char* WriteDigits(char* at, uint32_t value) {
+  if constexpr (kCount == 1) {
+    *at = static_cast<char>('0' + value % 10);
+  } else if constexpr (kCount >= 2) {
+    WriteDigitPair(at + kCount - 2, value % 100);
+    WriteDigits<kCount - 2>(at, value / 100);
   }
-  auto narrow = static_cast<uint32_t>(value);  // 32-bit division is cheaper on every ABI
-  while (count > 0) {
-    at[--count] = static_cast<char>('0' + narrow % 10);
-    narrow /= 10;
-  }
+  return at + kCount;
 }
 
-// A number as printf's "%0<width>d" prints it (width 0: plain "%d"): the sign counts as one
-// character of the width and stands before the zeros.
-class CDecimal {
- public:
-  CDecimal(int64_t value, size_t width)
-      : m_nMagnitude(value < 0 ? 0 - static_cast<uint64_t>(value) : static_cast<uint64_t>(value)),
-        m_nSign(value < 0 ? 1 : 0),
-        m_nDigits(CountDigits(m_nMagnitude)) {
-    if (width > m_nSign + m_nDigits) m_nDigits = width - m_nSign;
-  }
+// Writes a number below 100000 without leading zeros; returns the place behind. Unrolled, for
+// most numbers of the wire are that short.
+inline char* WriteShortNumber(char* at, uint32_t value) {
+  if (value < 10) return WriteDigits<1>(at, value);
+  if (value < 100) return WriteDigits<2>(at, value);
+  if (value < 1000) return WriteDigits<3>(at, value);
+  return value < 10000 ? WriteDigits<4>(at, value) : WriteDigits<5>(at, value);
+}
 
-  // Number of characters.
-  size_t Size() const { return m_nSign + m_nDigits; }
+// Number of characters of `value` as printf's "%0<width>d" prints it (width 0: plain "%d"): the
+// sign counts as one character of the width and stands before the zeros.
+size_t DecimalSize(int64_t value, size_t width);
 
-  // Writes Size() characters at `at`, without a terminator.
-  void WriteTo(char* at) const {
-    if (m_nSign != 0) *at = '-';
-    WriteDigits(at + m_nSign, m_nMagnitude, m_nDigits);
-  }
-
- private:
-  uint64_t m_nMagnitude;
-  size_t m_nSign;
-  size_t m_nDigits;
-};
+// Writes that many characters at `at`; returns the place behind them.
+char* WriteDecimal(char* at, int64_t value, size_t width);
 
 #endif  // QUORVANE_GATEWAY_CORE_DECIMAL_H_

@@ -192,8 +192,8 @@ class CGatewayPub {
   Stamp TakeStamp();
   std::string_view SerialNo(SerialScratch& scratch) const;
   std::string_view LocalIP() const;
-  const char* PlatformName() const;
-  const char* RequestKind() const;
+  std::string_view PlatformName() const;
+  std::string_view RequestKind() const;
 
   void WriteOrderKey(OrderHead head, const OrderOrigin& origin, std::string_view first,
                      std::string_view second, const Stamp& stamp, CTextWriter& key) const;

@@ -7,10 +7,10 @@
 
 namespace {
 
-constexpr char kNoEdition[] = "NO DEFINE";
+constexpr std::string_view kNoEdition = "NO DEFINE";
 
 // The client editions, by the host's platform number.
-constexpr const char* kPlatformNames[] = {
+constexpr std::string_view kPlatformNames[] = {
     kNoEdition, kNoEdition, kNoEdition, kNoEdition, kNoEdition, "QVPHONE", kNoEdition, "QVTAB",
     kNoEdition, "QVLITE",   "QVPRO",    "QVFUTURE", "QVOPTION", "QVWATCH", "QVPRO"};
 
@@ -60,13 +60,13 @@ std::string_view CGatewayPub::SerialNo(SerialScratch& scratch) const {
   return {scratch, size + address.size()};
 }
 
-const char* CGatewayPub::PlatformName() const {
+std::string_view CGatewayPub::PlatformName() const {
   const auto row = static_cast<uint32_t>(m_nPlatform);
   return row < std::size(kPlatformNames) ? kPlatformNames[row] : kNoEdition;
 }
 
 // Securities or futures; the host's number is compared unsigned, so a negative one means futures.
-const char* CGatewayPub::RequestKind() const {
+std::string_view CGatewayPub::RequestKind() const {
   return static_cast<uint32_t>(m_nMarket) <= 100 ? "S" : "F";
 }
 

@@ -45,14 +45,11 @@ CResultText::CResultText(const HeapText& owner, size_t expected)
 char* CResultText::Finish(std::string_view opening, int count) {
   if (m_pRecords == nullptr) MakeRoom(0);
   if (m_bFailed) return nullptr;
-  char scratch[kOpeningRoom];
-  const CDecimal decimal(count, 0);
-  memcpy(scratch, opening.data(), opening.size());
-  decimal.WriteTo(scratch + opening.size());
-  const size_t size = opening.size() + decimal.Size() + 1;
-  scratch[size - 1] = '!';
+  const size_t size = opening.size() + DecimalSize(count, 0) + 1;
   char* const start = m_pRecords - size;
-  memcpy(start, scratch, size);
+  memcpy(start, opening.data(), opening.size());
+  WriteDecimal(start + opening.size(), count, 0);
+  m_pRecords[-1] = '!';
   *m_pAt = '\0';
   m_owner.length = static_cast<int32_t>(m_pAt - m_owner.data);
   return start;

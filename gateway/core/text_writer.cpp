@@ -2,18 +2,10 @@
 
 #include <algorithm>
 
-CTextWriter::CTextWriter(char* buffer, size_t size)
-    : CWireText(buffer, buffer + size - 1), m_pBegin(buffer), m_pLimit(buffer + size - 1) {}
-
 CTextWriter CTextWriter::Continue(char* buffer, size_t size) {
   CTextWriter writer(buffer, size);
   writer.m_pAt += strnlen(buffer, size - 1);
   return writer;
-}
-
-char* CTextWriter::Text() {
-  *m_pAt = '\0';
-  return m_pBegin;
 }
 
 void CTextWriter::Replace(std::string_view text) {

@@ -10,7 +10,8 @@ class CTextWriter : public CWireText<CTextWriter> {
  public:
   // Starts an empty text in `buffer`, which has `size` >= 1 bytes, terminator included, and
   // outlives the writer. Nothing is cleared but the text's own end.
-  CTextWriter(char* buffer, size_t size);
+  CTextWriter(char* buffer, size_t size)
+      : CWireText(buffer, buffer + size - 1), m_pBegin(buffer), m_pLimit(buffer + size - 1) {}
 
   // Goes on behind the terminated text that `buffer` holds already.
   static CTextWriter Continue(char* buffer, size_t size);
@@ -20,7 +21,10 @@ class CTextWriter : public CWireText<CTextWriter> {
   size_t Length() const { return static_cast<size_t>(m_pAt - m_pBegin); }
 
   // The text so far, terminated; valid as long as the buffer, until the next change.
-  char* Text();
+  char* Text() {
+    *m_pAt = '\0';
+    return m_pBegin;
+  }
 
   // Drops all that was written, an overflow too, and starts over with `text`.
   void Replace(std::string_view text);

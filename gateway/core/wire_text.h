@@ -1,60 +1,20 @@
-// Texts built piece by piece from the wire's own format texts.
+// Texts built piece by piece.
 //
-// A piece is one printf-like format, joined to the text as C text: a NUL character that a "%c"
+// A piece is one format of the wire, joined to the text as C text: a NUL character that a "%c"
 // brings in ends its own piece and loses the rest of that piece alone; the next piece follows
-// directly. Formats are read by the compiler, so a wrong value type does not build and nothing is
-// interpreted at run time:
+// directly.
 //
 //   line.Append(WIRE("|27=%d|28=%d|29=%s"), kind, type, code);
-//
-// Marks: "%s" (a C text, null read as empty, or a std::string_view), "%c", "%d" (int),
-// "%ld" (any integer) and the zero-padded "%0Nd".
 #ifndef QUORVANE_GATEWAY_CORE_WIRE_TEXT_H_
 #define QUORVANE_GATEWAY_CORE_WIRE_TEXT_H_
 
 #include <cstring>
 #include <string_view>
 #include <type_traits>
+#include <utility>
 
 #include "gateway/core/decimal.h"
-
-// A format text as a type, so that its marks are read while compiling.
-#define WIRE(text)                                                  \
-  ([] {                                                             \
-    struct Format {                                                 \
-      static constexpr const char* Chars() { return text; }         \
-      static constexpr size_t Length() { return sizeof(text) - 1; } \
-    };                                                              \
-    return Format{};                                                \
-  }())
-
-// One mark of a format: what it prints, its zero-padded width and where the format goes on.
-struct WireMark {
-  char kind;
-  size_t width;
-  size_t next;
-};
-
-template <class Format>
-constexpr size_t FindMark(size_t from) {
-  while (from < Format::Length() && Format::Chars()[from] != '%') ++from;
-  return from;
-}
-
-template <class Format>
-constexpr WireMark ReadMark(size_t at) {
-  WireMark mark = {'d', 0, at + 1};
-  while (Format::Chars()[mark.next] >= '0' && Format::Chars()[mark.next] <= '9') {
-    mark.width = mark.width * 10 + static_cast<size_t>(Format::Chars()[mark.next++] - '0');
-  }
-  if (Format::Chars()[mark.next] == 'l') {
-    mark.kind = 'l';
-    mark.next += 2;
-  } else {
-    mark.kind = Format::Chars()[mark.next++];
-  }
-  return mark;
-}
+#include "gateway/core/wire_format.h"
 
 inline std::string_view AsText(const char* text) {
   return text == nullptr ? std::string_view() : std::string_view(text);
@@ -63,34 +23,125 @@ inline std::string_view AsText(std::string_view text) {
   return text;
 }
 
+// Copies `size` bytes. Most values of a line are a few characters long, so that two overlapping
+// moves cost less than a call.
+inline void CopyShort(char* to, const char* from, size_t size) {
+  if (size > 16) {
+    memcpy(to, from, size);
+  } else if (size >= 8) {
+    uint64_t head, tail;
+    memcpy(&head, from, 8);
+    memcpy(&tail, from + size - 8, 8);
+    memcpy(to, &head, 8);
+    memcpy(to + size - 8, &tail, 8);
+  } else if (size >= 4) {
+    uint32_t head, tail;
+    memcpy(&head, from, 4);
+    memcpy(&tail, from + size - 4, 4);
+    memcpy(to, &head, 4);
+    memcpy(to + size - 4, &tail, 4);
+  } else if (size > 0) {
+    to[0] = from[0];
+    to[size / 2] = from[size / 2];
+    to[size - 1] = from[size - 1];
+  }
+}
+
+// The values of a piece as they are written: a size, at least a bound of it that costs nothing to
+// know, and the writing itself, into room that was made before.
+struct TextValue {
+  std::string_view text;
+
+  size_t Bound() const { return text.size(); }
+  size_t Size() const { return text.size(); }
+  char* WriteTo(char* at) const {
+    CopyShort(at, text.data(), text.size());
+    return at + text.size();
+  }
+};
+
+struct CharValue {
+  char c;
+
+  static size_t Bound() { return 1; }
+  static size_t Size() { return 1; }
+  char* WriteTo(char* at) const {
+    *at = c;
+    return at + 1;
+  }
+};
+
+// `Signed` is int32_t or int64_t; `kWidth` as in "%0<width>d", 0 for the plain number.
+template <class Signed, size_t kWidth>
+struct NumberValue {
+  // Numbers below it fill their width with zeros on the left, and fit 32 bits.
+  static constexpr uint64_t kEnd = kWidth < 10 ? PowerOfTen(kWidth) : UINT32_MAX;
+
+  Signed number;
+
+  static size_t Bound() {
+    return kWidth > kMaxDecimalSize<Signed> ? kWidth : kMaxDecimalSize<Signed>;
+  }
+  size_t Size() const { return DecimalSize(number, kWidth); }
+  char* WriteTo(char* at) const {
+    if constexpr (kWidth == 0) {
+      if (number >= 0 && number < 100000)
+        return WriteShortNumber(at, static_cast<uint32_t>(number));
+    } else {
+      if (number >= 0 && static_cast<uint64_t>(number) < kEnd) {
+        return WriteDigits<kWidth>(at, static_cast<uint32_t>(number));
+      }
+    }
+    return WriteDecimal(at, number, kWidth);
+  }
+};
+
+// As NumberValue, with a width that is known only at run time.
+struct PaddedValue {
+  int64_t number;
+  size_t width;
+
+  size_t Bound() const { return DecimalSize(number, width); }
+  size_t Size() const { return DecimalSize(number, width); }
+  char* WriteTo(char* at) const { return WriteDecimal(at, number, width); }
+};
+
+// The value that a mark of this kind and width prints.
+template <char kKind, size_t kWidth, class Value>
+auto MakeWireValue(const Value& value) {
+  if constexpr (kKind == 's') {
+    return TextValue{AsText(value)};
+  } else if constexpr (kKind == 'c') {
+    static_assert(std::is_same_v<Value, char>, "%c takes a char");
+    return CharValue{value};
+  } else if constexpr (kKind == 'l') {
+    static_assert(std::is_integral_v<Value>, "%ld takes an integer");
+    return NumberValue<int64_t, kWidth>{static_cast<int64_t>(value)};
+  } else {
+    static_assert(kKind == 'd' && std::is_same_v<Value, int>, "%d takes an int");
+    return NumberValue<int32_t, kWidth>{value};
+  }
+}
+
 // The pieces, over a room that `Room` provides: `bool Room::MakeRoom(size_t)` is asked when the
 // next characters do not fit and either makes them fit or says no, for good.
 template <class Room>
 class CWireText {
  public:
-  // Joins one piece: `format` is a WIRE("...") text, then one value for each of its marks.
+  // Joins one piece, whole or not at all: `format` is a WIRE("...") text, then one value for each
+  // of its marks.
   template <class Format, class... Values>
   void Append(Format, const Values&... values) {
-    AppendFrom<Format, 0>(values...);
+    static_assert(kWirePlan<Format>.count == sizeof...(Values), "one value for each mark");
+    AppendMarks<Format>(std::index_sequence_for<Values...>(), values...);
   }
 
-  void AppendText(std::string_view text) {
-    if (text.empty() || !Has(text.size())) return;
-    memcpy(m_pAt, text.data(), text.size());
-    m_pAt += text.size();
-  }
+  void AppendText(std::string_view text) { AppendValue(TextValue{text}); }
 
-  void AppendChar(char c) {
-    if (Has(1)) *m_pAt++ = c;
-  }
+  void AppendChar(char c) { AppendValue(CharValue{c}); }
 
-  // Printed as "%0<width>d"; width 0 is the plain number.
-  void AppendNumber(int64_t value, size_t width = 0) {
-    const CDecimal decimal(value, width);
-    if (!Has(decimal.Size())) return;
-    decimal.WriteTo(m_pAt);
-    m_pAt += decimal.Size();
-  }
+  // Printed as "%0<width>d" prints it.
+  void AppendPadded(int64_t number, size_t width) { AppendValue(PaddedValue{number, width}); }
 
  protected:
   CWireText(char* at, char* end) : m_pAt(at), m_pEnd(end) {}
@@ -99,40 +150,75 @@ class CWireText {
   char* m_pEnd;  // the place kept for the terminator
 
  private:
-  bool Has(size_t count) {
-    return static_cast<size_t>(m_pEnd - m_pAt) >= count ||
-           static_cast<Room*>(this)->MakeRoom(count);
-  }
+  bool Has(size_t count) const { return static_cast<size_t>(m_pEnd - m_pAt) >= count; }
+  bool MakeRoom(size_t count) { return static_cast<Room*>(this)->MakeRoom(count); }
 
-  template <class Format, size_t kFrom, class... Values>
-  void AppendFrom(const Values&... values) {
-    constexpr size_t kMark = FindMark<Format>(kFrom);
-    if constexpr (kMark > kFrom) AppendText({Format::Chars() + kFrom, kMark - kFrom});
-    if constexpr (kMark < Format::Length()) {
-      static_assert(sizeof...(Values) > 0, "a mark of the format has no value");
-      AppendValue<Format, kMark>(values...);
-    } else {
-      static_assert(sizeof...(Values) == 0, "a value has no mark in the format");
+  template <class Value>
+  void AppendValue(const Value& value) {
+    if (Has(value.Bound()) || Has(value.Size()) || MakeRoom(value.Size())) {
+      m_pAt = value.WriteTo(m_pAt);
     }
   }
 
-  template <class Format, size_t kAt, class Value, class... Rest>
-  void AppendValue(const Value& value, const Rest&... rest) {
-    constexpr WireMark kMark = ReadMark<Format>(kAt);
-    if constexpr (kMark.kind == 's') {
-      AppendText(AsText(value));
-    } else if constexpr (kMark.kind == 'c') {
-      static_assert(std::is_same_v<Value, char>, "%c takes a char");
-      if (value == '\0') return;
-      AppendChar(value);
-    } else {
-      static_assert(kMark.kind == 'l' || kMark.kind == 'd', "an unknown mark");
-      static_assert(kMark.kind == 'l' ? std::is_integral_v<Value> : std::is_same_v<Value, int>,
-                    "%d takes an int, %ld an integer");
-      AppendNumber(static_cast<int64_t>(value), kMark.width);
-    }
-    AppendFrom<Format, kMark.next>(rest...);
+  template <class Format, size_t... kAt, class... Values>
+  void AppendMarks(std::index_sequence<kAt...>, const Values&... values) {
+    constexpr const WirePlan& kPlan = kWirePlan<Format>;
+    AppendPiece<Format, kAt...>(
+        MakeWireValue<kPlan.marks[kAt].kind, kPlan.marks[kAt].width>(values)...);
   }
+
+  // The room is asked for once a piece, with a bound that is cheap to know; the exact size counts
+  // only where that bound does not fit. The place is held in a local meanwhile, so that it stays in
+  // a register.
+  template <class Format, size_t... kAt, class... Values>
+  void AppendPiece(const Values&... values) {
+    if (!Has((kWirePlan<Format>.literalChars + ... + values.Bound())) &&
+        !MakeRoomFor<Format, kAt...>(values...)) {
+      return;
+    }
+    char* at = m_pAt;
+    if ((WriteMark<Format, kAt>(at, values) && ...)) WriteLiteral<Format, sizeof...(kAt)>(at);
+    m_pAt = at;
+  }
+
+  template <class Format, size_t... kAt, class... Values>
+  __attribute__((noinline)) bool MakeRoomFor(const Values&... values) {
+    size_t size = 0;
+    if ((CountMark<Format, kAt>(size, values) && ...)) {
+      size += kWirePlan<Format>.marks[sizeof...(kAt)].literalSize;
+    }
+    return Has(size) || MakeRoom(size);
+  }
+
+  template <class Format, size_t kAt>
+  static void WriteLiteral(char*& at) {
+    constexpr const WireMark& kMark = kWirePlan<Format>.marks[kAt];
+    memcpy(at, Format::Chars() + kMark.literalAt, kMark.literalSize);
+    at += kMark.literalSize;
+  }
+
+  // Writes the text before a mark and the mark's value; false ends the piece.
+  template <class Format, size_t kAt, class Value>
+  static bool WriteMark(char*& at, const Value& value) {
+    WriteLiteral<Format, kAt>(at);
+    if (EndsPiece(value)) return false;
+    at = value.WriteTo(at);
+    return true;
+  }
+
+  template <class Format, size_t kAt, class Value>
+  static bool CountMark(size_t& size, const Value& value) {
+    size += kWirePlan<Format>.marks[kAt].literalSize;
+    if (EndsPiece(value)) return false;
+    size += value.Size();
+    return true;
+  }
+
+  template <class Value>
+  static bool EndsPiece(const Value&) {
+    return false;
+  }
+  static bool EndsPiece(const CharValue& value) { return value.c == '\0'; }
 };
 
 #endif  // QUORVANE_GATEWAY_CORE_WIRE_TEXT_H_
