@@ -18,6 +18,9 @@ final class RequestParser {
     };
     private static final String TIME_STAMP = "|21|22|23|24|V4";
 
+    /** Free texts: no other value may hold an equals sign. */
+    private static final String FREE_TEXTS = "PWD|54|55|NAME|ADDRESS|TEL|MSG";
+
     /** Stands in a shape where two fields run into each other without a bar. */
     private static final String NO_BAR = "~";
 
@@ -91,6 +94,8 @@ final class RequestParser {
         if (tag.equals("14") && value.startsWith("15=", 1)) {
             put(bars, tag, value.substring(0, 1));
             put(NO_BAR, "15", value.substring(4));
+        } else if (value.indexOf('=') >= 0 && !tag.matches(FREE_TEXTS)) {
+            throw Refusal.malformed(tag);
         } else {
             put(bars, tag, value);
         }
@@ -153,8 +158,7 @@ final class RequestParser {
         if (kind.variant == 0 && fields.containsKey("44")) {
             stamp += "|44";
         }
-        int length = expect(ORDER_HEADERS[kind.variant] + block + stamp);
-        return length;
+        return expect(ORDER_HEADERS[kind.variant] + block + stamp);
     }
 
     private int expect(String header) throws Refusal {
