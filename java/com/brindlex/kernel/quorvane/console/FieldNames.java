@@ -4,7 +4,9 @@ import java.util.EnumMap;
 import java.util.HashMap;
 import java.util.Map;
 
-/** What each tag of the wire is called: one table, by scene where a tag has more than one meaning. */
+/**
+ * What each tag of the wire is called: one table, by scene where a tag has more than one meaning.
+ */
 public final class FieldNames {
     /** Stands in place of a tag for a signature payload that has none. */
     public static final String PAYLOAD = "!!";

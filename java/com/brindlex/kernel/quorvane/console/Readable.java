@@ -1,6 +1,7 @@
 package com.brindlex.kernel.quorvane.console;
 
 import java.math.BigDecimal;
+import java.math.RoundingMode;
 import java.util.regex.Matcher;
 import java.util.regex.Pattern;
 
@@ -55,7 +56,8 @@ public final class Readable {
             BigDecimal scaled = new BigDecimal(number.group()).movePointLeft(decimals);
             // two decimals always, four only where they say something
             return decimals == 2 || scaled.signum() == 0
-                    ? scaled.setScale(decimals == 2 ? 2 : 0, java.math.RoundingMode.UNNECESSARY).toPlainString()
+                    ? scaled.setScale(decimals == 2 ? 2 : 0, RoundingMode.UNNECESSARY)
+                              .toPlainString()
                     : scaled.stripTrailingZeros().toPlainString();
         });
     }
@@ -71,7 +73,10 @@ public final class Readable {
         return code > 0 && code < STOCK_TYPES.length ? STOCK_TYPES[code] : String.valueOf(code);
     }
 
-    /** {@code TIMEX&O&TXO&202401&C&180000000} reads TXO 202401 C 18000; two legs stand side by side. */
+    /**
+     * {@code TIMEX&O&TXO&202401&C&180000000} reads TXO 202401 C 18000; two legs stand side by
+     * side.
+     */
     private static String contract(String value) {
         String[] parts = value.split("&", -1);
         if (parts.length < 4) {
@@ -82,10 +87,14 @@ public final class Readable {
     }
 
     private static String leg(String[] parts, int index) {
-        StringBuilder text = new StringBuilder(pick(parts[2], index)).append(' ').append(pick(parts[3], index));
+        StringBuilder text =
+                new StringBuilder(pick(parts[2], index)).append(' ').append(pick(parts[3], index));
         boolean option = parts[1].matches("[OX]") && parts.length > 5;
         if (option) {
-            text.append(' ').append(pick(parts[4], index)).append(' ').append(scaled(pick(parts[5], index), 4));
+            text.append(' ')
+                    .append(pick(parts[4], index))
+                    .append(' ')
+                    .append(scaled(pick(parts[5], index), 4));
         }
         return text.toString();
     }

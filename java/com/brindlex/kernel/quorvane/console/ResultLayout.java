@@ -12,18 +12,16 @@ public enum ResultLayout {
     ACCOUNTS("class", "label", "account", "branch", "flag"),
     STOCK_ACKNOWLEDGEMENT("gateway no.", "order date", "", "accepted"),
     FUTURES_ACKNOWLEDGEMENT("gateway no.", "order date", "", "accepted", "MT"),
-    STOCK_ORDERS(
-            "gateway no.", "order", "type", "stock", "ordered", "state", "filled", "cancelled", "price",
-            "time", "entered", "order date", "N6", "change"),
+    STOCK_ORDERS("gateway no.", "order", "type", "stock", "ordered", "state", "filled", "cancelled",
+            "price", "time", "entered", "order date", "N6", "change"),
     STOCK_FILLS("order", "type", "stock", "shares", "price", "amount", "date", "time"),
     CASH_POSITIONS("stock", "opening|change"),
     MARGIN_POSITIONS("stock", "opening|change", "", "", "", "", ""),
     SHORT_POSITIONS("stock", "opening|change", "", "", "", ""),
     OTHER_POSITIONS("stock", "quantity"),
     CREDIT("stock", "margin (76)", "short (77)", "B8", "B9", "A0", "A1", "A2"),
-    SETTLEMENT(
-            "date", "", "type", "stock", "quantity", "price", "amount", "fee (79)", "tax (78)", "84",
-            "81/85", "82/87", "86", "89", "88", "sign", "net"),
+    SETTLEMENT("date", "", "type", "stock", "quantity", "price", "amount", "fee (79)", "tax (78)",
+            "84", "81/85", "82/87", "86", "89", "88", "sign", "net"),
     FUTURES_ORDERS(
             "gateway no.", "order", "legs", "contract", "ordered", "state", "filled", "cancelled",
             "price", "time", "entered", "order date", "N6", "change", "in force", "MT"),
@@ -32,9 +30,8 @@ public enum ResultLayout {
             "time&filled at", "MT", "date&fill date"),
     FUTURES_POSITIONS("side", "contract", "contracts", "price", "since", "currency"),
     OPTIONS_POSITIONS("side", "contract", "contracts", "price", "since"),
-    MARGIN(
-            "currency", "", "LO, 2 decimals", "", "PN", "RA", "LO", "QY", "", "QX", "", "U5", "", "", "",
-            "", "U9", "U5", "", "", "", "", "RF", "", "", "", "", "F0", "F1", "F2", "F3"),
+    MARGIN("currency", "", "LO, 2 decimals", "", "PN", "RA", "LO", "QY", "", "QX", "", "U5", "", "",
+            "", "", "U9", "U5", "", "", "", "", "RF", "", "", "", "", "F0", "F1", "F2", "F3"),
     BALANCE("", "", "", "", "balance", "");
 
     private final List<String> columns;
@@ -56,7 +53,8 @@ public enum ResultLayout {
             return futures ? Readable.Form.FOUR_DECIMALS : Readable.Form.TWO_DECIMALS;
         }
         if (this == MARGIN && !name.equals("currency")) {
-            return name.equals("LO, 2 decimals") ? Readable.Form.TWO_DECIMALS : Readable.Form.FOUR_DECIMALS;
+            return name.equals("LO, 2 decimals") ? Readable.Form.TWO_DECIMALS
+                                                 : Readable.Form.FOUR_DECIMALS;
         }
         switch (name) {
             case "type":

@@ -36,7 +36,8 @@ public final class Screen {
 
     /** Puts a text into a style. */
     public String styled(Style style, String text) {
-        return colours && !style.code.isEmpty() ? "\033[" + style.code + "m" + text + "\033[0m" : text;
+        return colours && !style.code.isEmpty() ? "\033[" + style.code + "m" + text + "\033[0m"
+                                                : text;
     }
 
     /** Writes a line. */
@@ -112,8 +113,8 @@ public final class Screen {
         out.println(styled(Style.DIM, line.append(right).toString()));
     }
 
-    private void row(
-            List<String> cells, List<Integer> kept, List<Integer> widths, Style style, boolean numbersRight) {
+    private void row(List<String> cells, List<Integer> kept, List<Integer> widths, Style style,
+            boolean numbersRight) {
         String bar = styled(Style.DIM, "│");
         StringBuilder line = new StringBuilder("  ").append(bar);
         for (int i = 0; i < kept.size(); i++) {
@@ -133,9 +134,10 @@ public final class Screen {
     }
 
     private static boolean isWide(int c) {
-        return c >= 0x1100 && c <= 0x115F || c >= 0x2E80 && c <= 0xA4CF || c >= 0xAC00 && c <= 0xD7A3
-                || c >= 0xF900 && c <= 0xFAFF || c >= 0xFE30 && c <= 0xFE6F
-                || c >= 0xFF00 && c <= 0xFF60 || c >= 0xFFE0 && c <= 0xFFE6 || c >= 0x20000 && c <= 0x3FFFD;
+        return c >= 0x1100 && c <= 0x115F || c >= 0x2E80 && c <= 0xA4CF
+                || c >= 0xAC00 && c <= 0xD7A3 || c >= 0xF900 && c <= 0xFAFF
+                || c >= 0xFE30 && c <= 0xFE6F || c >= 0xFF00 && c <= 0xFF60
+                || c >= 0xFFE0 && c <= 0xFFE6 || c >= 0x20000 && c <= 0x3FFFD;
     }
 
     static String pad(String text, int columns) {

@@ -17,8 +17,9 @@ final class Stage {
 
     static final String SERIAL = "R58M30ABCDE";
 
-    private static final Set<String> HEADER_TAGS = Set.of("F", "KIND", "BHNO", "CB", "IP", "11", "VER",
-            "65", "SN", "15", "IDNO", "ACNO", "PWD", "21", "22", "23", "24", "V4", "44", "FUNC", "FUNC1", "01");
+    private static final Set<String> HEADER_TAGS =
+            Set.of("F", "KIND", "BHNO", "CB", "IP", "11", "VER", "65", "SN", "15", "IDNO", "ACNO",
+                    "PWD", "21", "22", "23", "24", "V4", "44", "FUNC", "FUNC1", "01");
 
     /** Builds a request. */
     interface Encoder {
@@ -64,7 +65,8 @@ final class Stage {
     }
 
     static String rocDate(LocalDate date) {
-        return String.format("%03d%02d%02d", date.getYear() - 1911, date.getMonthValue(), date.getDayOfMonth());
+        return String.format(
+                "%03d%02d%02d", date.getYear() - 1911, date.getMonthValue(), date.getDayOfMonth());
     }
 
     /** Sends a request that must be built, and shows everything on its way there and back. */
@@ -83,7 +85,8 @@ final class Stage {
         screen.labelled("reply", Screen.Style.DIM, reply);
         String result = decoder.decode(reply, status);
         screen.labelled("result", status[0] == 1 ? Screen.Style.PLAIN : Screen.Style.BAD, result);
-        screen.labelled("status", status[0] == 1 ? Screen.Style.GOOD : Screen.Style.BAD, status[0] + "");
+        screen.labelled(
+                "status", status[0] == 1 ? Screen.Style.GOOD : Screen.Style.BAD, status[0] + "");
         expect(status[0] == wanted, "status " + wanted, "status " + status[0]);
         return result;
     }
@@ -150,7 +153,8 @@ final class Stage {
 
     /** Prints the verdict. Returns whether every outcome was what it should be. */
     boolean close() {
-        screen.title(failures == 0 ? "All " + steps + " steps as they should be" : failures + " outcomes are WRONG");
+        screen.title(failures == 0 ? "All " + steps + " steps as they should be"
+                                   : failures + " outcomes are WRONG");
         return failures == 0;
     }
 }

@@ -67,7 +67,8 @@ final class CertificateOffice {
                 return renew(request, own(holder, EnumSet.of(State.INSTALLED, State.OPENED)));
             case REVOKE_CERTIFICATE:
                 checkHolder(request, holder);
-                return step(request, own(holder, EnumSet.complementOf(EnumSet.of(State.REVOKED))), State.REVOKED);
+                return step(request, own(holder, EnumSet.complementOf(EnumSet.of(State.REVOKED))),
+                        State.REVOKED);
             case CERTIFICATE_INSTALLED:
                 return step(request, own(holder, EnumSet.of(State.ISSUED)), State.INSTALLED);
             case CERTIFICATE_OPENED:
@@ -85,7 +86,8 @@ final class CertificateOffice {
             throw Refusal.rejected("憑證已存在");
         }
         issued++;
-        Certificate fresh = new Certificate(String.format("%08d", issued), today.plusDays(VALID_DAYS));
+        Certificate fresh =
+                new Certificate(String.format("%08d", issued), today.plusDays(VALID_DAYS));
         certificates.put(holder, fresh);
         return good(request, fresh.text());
     }

@@ -64,7 +64,8 @@ public final class CustomerBook {
     private Customer find(Request request) {
         String account = request.get("ACNO");
         for (Customer customer : customers) {
-            boolean idFits = namesId(request) ? customer.idNumber.equals(request.get("IDNO")) : !account.isEmpty();
+            boolean idFits = namesId(request) ? customer.idNumber.equals(request.get("IDNO"))
+                                              : !account.isEmpty();
             boolean accountFits = account.isEmpty();
             for (Account own : customer.accounts) {
                 accountFits |= own.hasNumber(account);
@@ -76,7 +77,9 @@ public final class CustomerBook {
         return null;
     }
 
-    /** An order that names an account alone sends that account in the place of the ID number too. */
+    /**
+     * An order that names an account alone sends that account in the place of the ID number too.
+     */
     private static boolean namesId(Request request) {
         return request.has("IDNO") && !request.get("IDNO").equals(request.get("ACNO"));
     }

@@ -45,7 +45,8 @@ final class FuturesDesk {
     private String change(Request request, Account account, LocalDateTime now) throws Refusal {
         FuturesRules.check(request);
         FuturesOrder order = byNumber(request.get("36"));
-        if (order == null || order.account != account || !order.gatewayNumber.equals(request.get("46"))) {
+        if (order == null || order.account != account
+                || !order.gatewayNumber.equals(request.get("46"))) {
             throw Refusal.rejected("查無此委託");
         }
         if (!order.leg1.sameContract(new FuturesLeg(request, true))) {

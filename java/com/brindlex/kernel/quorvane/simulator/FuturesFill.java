@@ -15,7 +15,8 @@ final class FuturesFill {
 
     final LocalDateTime at;
 
-    FuturesFill(FuturesOrder order, long contracts, BigDecimal price1, BigDecimal price2, LocalDateTime at) {
+    FuturesFill(FuturesOrder order, long contracts, BigDecimal price1, BigDecimal price2,
+            LocalDateTime at) {
         this.order = order;
         this.contracts = contracts;
         this.price1 = price1;
@@ -30,8 +31,10 @@ final class FuturesFill {
 
     void write(Reply reply) {
         order.writeCommon(reply);
-        reply.field("47", contracts).field("48", price1.toPlainString())
-                .field("50", Texts.date(at.toLocalDate())).field("51", Texts.time(at.toLocalTime()));
+        reply.field("47", contracts)
+                .field("48", price1.toPlainString())
+                .field("50", Texts.date(at.toLocalDate()))
+                .field("51", Texts.time(at.toLocalTime()));
         if (order.leg2 != null) {
             reply.field("W5", price2.toPlainString());
         }

@@ -33,7 +33,8 @@ final class FuturesLists {
     }
 
     FuturesMargin margin(Account account) {
-        return new FuturesMargin(openPositions(account), fillsOf(account, LocalDate.MIN, LocalDate.MAX));
+        return new FuturesMargin(
+                openPositions(account), fillsOf(account, LocalDate.MIN, LocalDate.MAX));
     }
 
     private String orderBook(Request request, Account account) throws Refusal {

@@ -38,10 +38,22 @@ final class FuturesMargin {
         long equity = BALANCE - fees;
         long maintenance = bound * 3 / 4;
         String ratio = bound == 0 ? "0" : String.valueOf(equity * 100 / bound);
-        return Reply.query(request).record()
-                .field("LO", BALANCE + ".00").field("PN", equity).field("RA", available())
-                .field("QY", bound).field("QX", maintenance).field("U5", 0).field("U9", fees)
-                .field("RF", ratio).field("F0", 0).field("F1", 0).field("F2", equity).field("F3", available())
-                .close().end().text();
+        return Reply.query(request)
+                .record()
+                .field("LO", BALANCE + ".00")
+                .field("PN", equity)
+                .field("RA", available())
+                .field("QY", bound)
+                .field("QX", maintenance)
+                .field("U5", 0)
+                .field("U9", fees)
+                .field("RF", ratio)
+                .field("F0", 0)
+                .field("F1", 0)
+                .field("F2", equity)
+                .field("F3", available())
+                .close()
+                .end()
+                .text();
     }
 }

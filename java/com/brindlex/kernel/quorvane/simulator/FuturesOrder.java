@@ -77,9 +77,15 @@ final class FuturesOrder {
     /** Writes the order as a record of the order book. */
     void write(Reply reply) {
         writeCommon(reply);
-        reply.field("O4", fillOrKill).field("V5", immediate).field("41", cancelled).field("47", filled)
-                .field("39", failed() ? "E" : " ").field("K1", failure)
-                .field("27", priceType).field("N6", n6).field("JV", open() > 0 ? "Y" : "N")
+        reply.field("O4", fillOrKill)
+                .field("V5", immediate)
+                .field("41", cancelled)
+                .field("47", filled)
+                .field("39", failed() ? "E" : " ")
+                .field("K1", failure)
+                .field("27", priceType)
+                .field("N6", n6)
+                .field("JV", open() > 0 ? "Y" : "N")
                 .close();
     }
 }

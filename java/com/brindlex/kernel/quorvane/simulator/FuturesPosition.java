@@ -38,7 +38,8 @@ final class FuturesPosition {
     }
 
     private boolean matches(FuturesLeg first, FuturesLeg second) {
-        return same(leg1, first) && (leg2 == null ? second == null : second != null && same(leg2, second));
+        return same(leg1, first)
+                && (leg2 == null ? second == null : second != null && same(leg2, second));
     }
 
     private static boolean same(FuturesLeg own, FuturesLeg other) {
@@ -53,7 +54,8 @@ final class FuturesPosition {
     }
 
     private BigDecimal average(BigDecimal old, BigDecimal added, long more) {
-        return old.multiply(BigDecimal.valueOf(contracts)).add(added.multiply(BigDecimal.valueOf(more)))
+        return old.multiply(BigDecimal.valueOf(contracts))
+                .add(added.multiply(BigDecimal.valueOf(more)))
                 .divide(BigDecimal.valueOf(contracts + more), 4, RoundingMode.HALF_UP);
     }
 
@@ -66,7 +68,8 @@ final class FuturesPosition {
 
     /** Margin that the position binds: futures and sold options do, a pair binds one leg's. */
     BigDecimal margin() {
-        boolean binds = !leg1.product.option || leg1.side == 'S' || leg2 != null && leg2.side == 'S';
+        boolean binds =
+                !leg1.product.option || leg1.side == 'S' || leg2 != null && leg2.side == 'S';
         return BigDecimal.valueOf(binds ? contracts * leg1.product.margin : 0);
     }
 

@@ -60,7 +60,8 @@ public final class Gateway {
      * @param price1 price of leg 1 as text
      * @param price2 price of leg 2 as text, empty for one leg
      */
-    public synchronized void fillFutures(String orderNumber, long contracts, String price1, String price2) {
+    public synchronized void fillFutures(
+            String orderNumber, long contracts, String price1, String price2) {
         futures.fill(orderNumber, contracts, price1, price2, LocalDateTime.now(clock));
     }
 

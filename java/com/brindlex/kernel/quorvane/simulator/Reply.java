@@ -31,9 +31,14 @@ final class Reply {
     /** The whole reply to a request that is refused; {@code order} picks the form. */
     static String refusal(boolean order, Refusal refusal) {
         if (order) {
-            return new Reply("F=1").field("39", "E").field("19", "").field("K1", refusal.getMessage()).text();
+            return new Reply("F=1")
+                    .field("39", "E")
+                    .field("19", "")
+                    .field("K1", refusal.getMessage())
+                    .text();
         }
-        Reply reply = new Reply("F=7").field("68", refusal.code()).field("M2", refusal.getMessage());
+        Reply reply =
+                new Reply("F=7").field("68", refusal.code()).field("M2", refusal.getMessage());
         reply.open(refusal.code()).field("M2", refusal.getMessage()).close();
         return reply.end().text();
     }

@@ -65,7 +65,8 @@ public enum RequestKind {
     /** Value of the closing tag 01. */
     final String ending;
 
-    RequestKind(char market, String function, int variant, String shape, boolean escaped, String ending) {
+    RequestKind(char market, String function, int variant, String shape, boolean escaped,
+            String ending) {
         this.market = market;
         this.function = function;
         this.variant = variant;

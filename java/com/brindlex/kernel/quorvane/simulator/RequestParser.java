@@ -134,7 +134,8 @@ final class RequestParser {
             boolean account = fields.containsKey("ACNO");
             boolean idNumber = value("15").equals("1");
             block = "|15" + (idNumber ? "|IDNO" : "") + (account ? "|ACNO" : "") + "|PWD";
-            if (!idNumber && !value("15").equals("0") || account && !value("ACNO").matches("[0-9]{7}")) {
+            if (!idNumber && !value("15").equals("0")
+                    || account && !value("ACNO").matches("[0-9]{7}")) {
                 throw Refusal.malformed("15");
             }
         }
@@ -151,7 +152,9 @@ final class RequestParser {
         if (!byId && !account) {
             throw Refusal.malformed("ACNO");
         }
-        String block = (byId && kind.variant == 0 ? NO_BAR : "|") + "15|IDNO" + (account ? "|ACNO" : "") + "|PWD"
+        String block = (byId && kind.variant == 0 ? NO_BAR : "|") + "15|IDNO"
+                + (account ? "|ACNO" : "")
+                + "|PWD"
                 // the blocks that lead with the ID number end with a bar of their own
                 + (byId ? "|" : "");
         String stamp = kind.variant == 2 ? "" : TIME_STAMP;

@@ -18,12 +18,23 @@ final class Signature {
         String branch = Pattern.quote(request.get("BHNO"));
         String function = Pattern.quote(request.get("14"));
         if (plain) {
-            pattern.append(branch).append('_').append(identity(request)).append('_').append(function);
+            pattern.append(branch)
+                    .append('_')
+                    .append(identity(request))
+                    .append('_')
+                    .append(function);
         } else {
-            pattern.append(Pattern.quote(request.get("SN"))).append(',')
-                    .append(Pattern.quote(request.get("IP"))).append(',')
-                    .append(Pattern.quote(request.get("21"))).append(',')
-                    .append(branch).append('-').append(identity(request)).append(',').append(function);
+            pattern.append(Pattern.quote(request.get("SN")))
+                    .append(',')
+                    .append(Pattern.quote(request.get("IP")))
+                    .append(',')
+                    .append(Pattern.quote(request.get("21")))
+                    .append(',')
+                    .append(branch)
+                    .append('-')
+                    .append(identity(request))
+                    .append(',')
+                    .append(function);
         }
     }
 

@@ -77,7 +77,8 @@ final class StockDesk {
 
     private StockOrder named(Request request, Account account) throws Refusal {
         StockOrder order = byNumber(request.get("36"));
-        if (order == null || order.account != account || !order.gatewayNumber.equals(request.get("46"))) {
+        if (order == null || order.account != account
+                || !order.gatewayNumber.equals(request.get("46"))) {
             throw Refusal.rejected("查無此委託");
         }
         return order;

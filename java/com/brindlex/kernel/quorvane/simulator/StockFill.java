@@ -72,11 +72,19 @@ final class StockFill {
         if (brokerage == Brokerage.JZG) {
             reply.field("KT", onMargin() ? "12" : isShort() ? "21" : "0");
         }
-        reply.field("79", fee()).field("78", tax()).field("84", 0)
-                .field("81", onMargin() ? loan() : 0).field("82", onMargin() ? ownFunds : 0)
-                .field("85", isShort() ? amount() : 0).field("87", isShort() ? amount() * 90 / 100 : 0)
-                .field("86", 0).field("89", 0).field("88", 0)
-                .field("96", net < 0 ? "-" : "").field("97", Math.abs(net)).close();
+        reply.field("79", fee())
+                .field("78", tax())
+                .field("84", 0)
+                .field("81", onMargin() ? loan() : 0)
+                .field("82", onMargin() ? ownFunds : 0)
+                .field("85", isShort() ? amount() : 0)
+                .field("87", isShort() ? amount() * 90 / 100 : 0)
+                .field("86", 0)
+                .field("89", 0)
+                .field("88", 0)
+                .field("96", net < 0 ? "-" : "")
+                .field("97", Math.abs(net))
+                .close();
     }
 
     private void writeTrade(Reply reply) {

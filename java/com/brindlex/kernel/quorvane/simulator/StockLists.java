@@ -14,7 +14,8 @@ final class StockLists {
     private final StockHoldings holdings;
     private final Brokerage brokerage;
 
-    StockLists(List<StockOrder> orders, List<StockFill> fills, StockHoldings holdings, Brokerage brokerage) {
+    StockLists(List<StockOrder> orders, List<StockFill> fills, StockHoldings holdings,
+            Brokerage brokerage) {
         this.orders = orders;
         this.fills = fills;
         this.holdings = holdings;
@@ -99,10 +100,19 @@ final class StockLists {
         if (stock == null || !stock.credit) {
             throw new Refusal(Refusal.Reason.NO_DATA);
         }
-        return Reply.query(request).record().field("29", stock.code)
-                .field("76", MARGIN_QUOTA).field("77", MARGIN_QUOTA / 2)
-                .field("B8", "60").field("B9", "90").field("A0", "Y").field("A1", "Y").field("A2", "N")
-                .close().end().text();
+        return Reply.query(request)
+                .record()
+                .field("29", stock.code)
+                .field("76", MARGIN_QUOTA)
+                .field("77", MARGIN_QUOTA / 2)
+                .field("B8", "60")
+                .field("B9", "90")
+                .field("A0", "Y")
+                .field("A1", "Y")
+                .field("A2", "N")
+                .close()
+                .end()
+                .text();
     }
 
     private String settlement(Request request, Account account, LocalDate today) throws Refusal {

@@ -28,7 +28,8 @@ final class StockOrder {
     long cancelled;
     private String failure = "";
 
-    StockOrder(Request request, Account account, Stock stock, int sequence, LocalDateTime now) throws Refusal {
+    StockOrder(Request request, Account account, Stock stock, int sequence, LocalDateTime now)
+            throws Refusal {
         this.account = account;
         this.number = String.format("A%04d", sequence);
         this.gatewayNumber = String.format("%010d", sequence);

@@ -87,7 +87,8 @@ final class StockRules {
             signature.with(request.get("32"), request.get("29"), request.get("30"),
                     tradeType == FIXED_PRICE ? "3" : limit ? request.get("31") : priceKind);
         } else {
-            signature.with(request.get("32"), request.get("29"), request.get("27"), request.get("28"));
+            signature.with(
+                    request.get("32"), request.get("29"), request.get("27"), request.get("28"));
             if (tradeType == FIXED_PRICE) {
                 signature.any("[0159]");
             } else {

@@ -11,7 +11,9 @@ final class Texts {
 
     private Texts() {}
 
-    /** A decimal number without sign, at most 18 digits; {@code tag} names the field in a refusal. */
+    /**
+     * A decimal number without sign, at most 18 digits; {@code tag} names the field in a refusal.
+     */
     static long number(String text, String tag) throws Refusal {
         if (!text.matches("[0-9]{1,18}")) {
             throw Refusal.malformed(tag);
@@ -21,7 +23,8 @@ final class Texts {
 
     /** YYYYMMDD. */
     static String date(LocalDate date) {
-        return String.format("%04d%02d%02d", date.getYear(), date.getMonthValue(), date.getDayOfMonth());
+        return String.format(
+                "%04d%02d%02d", date.getYear(), date.getMonthValue(), date.getDayOfMonth());
     }
 
     /** HHMMSS. */

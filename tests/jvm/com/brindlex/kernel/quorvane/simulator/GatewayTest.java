@@ -6,6 +6,7 @@ import static org.junit.jupiter.api.Assertions.assertTrue;
 
 import java.nio.charset.StandardCharsets;
 import java.util.Base64;
+import java.util.regex.Pattern;
 import org.junit.jupiter.api.Test;
 import org.junit.jupiter.params.ParameterizedTest;
 import org.junit.jupiter.params.provider.CsvSource;
@@ -73,7 +74,8 @@ class GatewayTest {
 
     @Test
     void opensAnAccountForSomebodyNew() {
-        String header = Wire.QUERY.replace("IDNO=A123456789|ACNO=1234567|PWD=pass1234", "IDNO=C211112222|PWD=");
+        String header = Wire.QUERY.replace(
+                "IDNO=A123456789|ACNO=1234567|PWD=pass1234", "IDNO=C211112222|PWD=");
         assertAnswer(header + "FUNC=9|NAME=n|ADDRESS=a|TEL=1|TIME=2|ITEM=255|01=", "|68=0000");
         assertAnswer(header + "FUNC=9|NAME=n|ADDRESS=a|TEL=1|TIME=256|ITEM=0|01=", "|68=E001");
         assertAnswer(header + "FUNC=9|NAME=|ADDRESS=a|TEL=1|TIME=2|ITEM=1|01=", "|68=E001");
@@ -146,8 +148,10 @@ class GatewayTest {
     void changesAndCancelsStockOrders() {
         gateway.answer(Wire.buyTwoLots());
         assertAnswer(Wire.change().replace("A0001", "A0009"), "查無此委託");
-        assertAnswer(Wire.change().replace("37=1000", "37=3000").replace("_1000_", "_3000_"), "改量數量錯誤");
-        assertAnswer(Wire.change().replace("29=2330", "29=2317").replace("_2330_", "_2317_"), "與原委託不符");
+        assertAnswer(Wire.change().replace("37=1000", "37=3000").replace("_1000_", "_3000_"),
+                "改量數量錯誤");
+        assertAnswer(Wire.change().replace("29=2330", "29=2317").replace("_2330_", "_2317_"),
+                "與原委託不符");
         assertAnswer(Wire.change(), "|39= |19=S|46=0000000001|");
         assertAnswer(Wire.cancel(), "|19=S|");
         assertAnswer(Wire.cancel1(), "委託已無剩餘數量");
@@ -163,7 +167,8 @@ class GatewayTest {
         gateway.fillStock("A0001", 1000, 99450);
         assertAnswer(Wire.ESCAPED + "|FUNC=3|57=2|SDATE=20240101|EDATE=20240115|01=\n",
                 "|29=2330|47=1000|48=994.50|49=994500|50=20240115|51=134521|01=");
-        assertAnswer(Wire.ESCAPED + "|FUNC=3|57=2|SDATE=20240101|EDATE=20240114|01=\n", "|68=5001|");
+        assertAnswer(
+                Wire.ESCAPED + "|FUNC=3|57=2|SDATE=20240101|EDATE=20240114|01=\n", "|68=5001|");
         assertAnswer(Wire.ESCAPED + "|FUNC=5|01=",
                 "|29=2330|75=0|751=1000|76=0|761=0|77=1000|771=0|PS=0|01=");
         assertAnswer(Wire.ESCAPED + "|FUNC=6|H4=1|SDATE=1|EDATE=|01=", "|79=1417|78=0|84=0|");
@@ -177,7 +182,8 @@ class GatewayTest {
         other.fillStock("A0001", 1000, 99500);
         String positions = other.answer(Wire.ESCAPED + "|FUNC=5|01=");
         assertTrue(positions.contains("|75=0|751=1000|752=0|"), positions);
-        String settlement = other.answer(Wire.ESCAPED + "|FUNC=6|H4=1|SDATE=20240101|EDATE=1130115|01=");
+        String settlement =
+                other.answer(Wire.ESCAPED + "|FUNC=6|H4=1|SDATE=20240101|EDATE=1130115|01=");
         assertTrue(settlement.contains("|KT=0|"), settlement);
     }
 
@@ -208,7 +214,8 @@ class GatewayTest {
         "O4=0, O4=1, 電文格式錯誤 V5",
     })
     void refusesAWrongCombination(String right, String wrong, String text) {
-        String reply = gateway.answer(Wire.buyCallSpread().replaceFirst(java.util.regex.Pattern.quote(right), wrong));
+        String reply = gateway.answer(
+                Wire.buyCallSpread().replaceFirst(Pattern.quote(right), wrong));
         assertTrue(reply.contains("|39=E|"), reply);
         assertTrue(text.endsWith("誤") || reply.contains("|K1=" + text), reply);
     }
@@ -217,7 +224,8 @@ class GatewayTest {
     void holdsFuturesPositionsAndMargin() {
         gateway.answer(Wire.buyFutures());
         gateway.fillFutures("F0001", 2, "18000", "");
-        assertAnswer(Wire.FUTURES.replace("%20", " ") + "FUNC=O|01=", "|33=TXF|29=202402|V8=|34=|32=B|R8=2|48=18000|");
+        assertAnswer(Wire.FUTURES.replace("%20", " ") + "FUNC=O|01=",
+                "|33=TXF|29=202402|V8=|34=|32=B|R8=2|48=18000|");
         assertAnswer(Wire.FUTURES + "FUNC=P|28=3|01=",
                 "|LO=1500000.00|PN=1499900|RA=855900|QY=644000|QX=483000|U5=0|U9=100|RF=232|");
         gateway.answer(Wire.buyFutures().replace("32=B", "32=S").replace("_R_B_", "_R_S_"));
@@ -229,7 +237,8 @@ class GatewayTest {
     @Test
     void answersTheSameRequestsTheSameWay() {
         Gateway again = new Gateway(Wire.CLOCK);
-        for (String request : new String[] {Wire.buyTwoLots(), Wire.change(), Wire.ESCAPED + "|FUNC=5|01="}) {
+        for (String request :
+                new String[] {Wire.buyTwoLots(), Wire.change(), Wire.ESCAPED + "|FUNC=5|01="}) {
             assertEquals(gateway.answer(request), again.answer(request));
         }
     }
