@@ -127,7 +127,7 @@ final class DemoFutures {
                 (sequence, status) -> gatewayjni.QueryFinanceEncode(
                         MARKET, PLATFORM, sequence, SERIAL, ADDRESS, BRANCH, IDENTITY, PASSWORD, 0, status),
                 gatewayjni::QueryFinanceDecode, 1);
-        stage.table(ResultLayout.MARGIN, ResultLayout.list(margin), 1);
+        stage.record(ResultLayout.MARGIN, ResultLayout.list(margin).get(0));
     }
 
     private void positions() {

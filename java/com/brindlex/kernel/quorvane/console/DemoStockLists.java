@@ -35,7 +35,7 @@ final class DemoStockLists {
         String positions = stage.ask("Positions", positions(), gatewayjni::QueryInventoryDecode, 1);
         sections(stage, positions, 3, 1, 1, 1);
         String credit = stage.ask("Credit figures of 2330", credit("2330"), gatewayjni::QueryCreditInfoDecode, 1);
-        stage.table(ResultLayout.CREDIT, ResultLayout.record(credit), 1);
+        stage.record(ResultLayout.CREDIT, ResultLayout.record(credit).get(0));
         stage.ask("Credit figures of a stock that has none", credit("6547"),
                 gatewayjni::QueryCreditInfoDecode, 1, "@@@@@@@!");
         String settled = stage.ask("Settlement of today", settlement("1", ""), gatewayjni::PaymentDecode, 1);

@@ -60,7 +60,7 @@ public final class FieldNames {
     };
 
     private static final String[] ORDER = {
-        "14", "order function (I new, C change, A price, D cancel)",
+        "14", "order function",
         "21", "date",
         "22", "time",
         "23", "request id, 8 digits",
@@ -70,7 +70,7 @@ public final class FieldNames {
         "10", "order date",
         "36", "order number",
         "46", "gateway number",
-        "32", "side (B buy, S sell)",
+        "32", "side",
         "31", "price",
         "M8", "price kind",
         "37", "quantity to take off",
@@ -83,7 +83,7 @@ public final class FieldNames {
 
     private static final String[] STOCK_ORDER = {
         "27", "order kind",
-        "28", "trade type (0 lots, 2 odd lot, 3 fixed price)",
+        "28", "trade type",
         "29", "stock code",
         "30", "quantity, shares",
         "UT", "shares per lot",
@@ -108,7 +108,7 @@ public final class FieldNames {
     };
 
     private static final String[] FUTURES_ORDER = {
-        "27", "price type (1, 3 market)",
+        "27", "price type",
         "28", "trade type",
         "30", "contracts",
         "V6", "combination code",

@@ -29,7 +29,11 @@ public final class Readable {
         /** An order-type code, or two joined by a bar. */
         ORDER_TYPE,
         /** A futures or options contract. */
-        CONTRACT;
+        CONTRACT,
+        /** A date of seven (Republic of China) or eight digits, or two. */
+        DATE,
+        /** A time of six digits, or two. */
+        TIME;
 
         /** The readable form of a value; a value of another form comes back unchanged. */
         public String read(String value) {
@@ -42,6 +46,11 @@ public final class Readable {
                     return orderTypes(value);
                 case CONTRACT:
                     return contract(value);
+                case DATE:
+                    return value.replaceAll(
+                            "([0-9]{3,4})([0-9]{2})([0-9]{2})(?![0-9])", "$1/$2/$3");
+                case TIME:
+                    return value.replaceAll("([0-9]{2})([0-9]{2})([0-9]{2})(?![0-9])", "$1:$2:$3");
                 default:
                     return value;
             }
@@ -87,8 +96,9 @@ public final class Readable {
     }
 
     private static String leg(String[] parts, int index) {
-        StringBuilder text =
-                new StringBuilder(pick(parts[2], index)).append(' ').append(pick(parts[3], index));
+        // positions write a month as a date without a day
+        String month = pick(parts[3], index).replaceFirst("^([0-9]{6})00$", "$1");
+        StringBuilder text = new StringBuilder(pick(parts[2], index)).append(' ').append(month);
         boolean option = parts[1].matches("[OX]") && parts.length > 5;
         if (option) {
             text.append(' ')

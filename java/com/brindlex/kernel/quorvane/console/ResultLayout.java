@@ -12,27 +12,28 @@ public enum ResultLayout {
     ACCOUNTS("class", "label", "account", "branch", "flag"),
     STOCK_ACKNOWLEDGEMENT("gateway no.", "order date", "", "accepted"),
     FUTURES_ACKNOWLEDGEMENT("gateway no.", "order date", "", "accepted", "MT"),
-    STOCK_ORDERS("gateway no.", "order", "type", "stock", "ordered", "state", "filled", "cancelled",
-            "price", "time", "entered", "order date", "N6", "change"),
+    STOCK_ORDERS("~gateway no.", "order", "type", "stock", "ordered", "state", "filled",
+            "cancelled", "price", "time", "~entered", "~order date", "~N6", "~change"),
     STOCK_FILLS("order", "type", "stock", "shares", "price", "amount", "date", "time"),
     CASH_POSITIONS("stock", "opening|change"),
     MARGIN_POSITIONS("stock", "opening|change", "", "", "", "", ""),
     SHORT_POSITIONS("stock", "opening|change", "", "", "", ""),
     OTHER_POSITIONS("stock", "quantity"),
     CREDIT("stock", "margin (76)", "short (77)", "B8", "B9", "A0", "A1", "A2"),
-    SETTLEMENT("date", "", "type", "stock", "quantity", "price", "amount", "fee (79)", "tax (78)",
-            "84", "81/85", "82/87", "86", "89", "88", "sign", "net"),
-    FUTURES_ORDERS(
-            "gateway no.", "order", "legs", "contract", "ordered", "state", "filled", "cancelled",
-            "price", "time", "entered", "order date", "N6", "change", "in force", "MT"),
-    FUTURES_FILLS(
-            "order&gateway no.", "legs", "contract", "open&filled", "price&fill price", "", "",
-            "time&filled at", "MT", "date&fill date"),
+    SETTLEMENT("date", "", "type", "stock", "shares", "price", "amount", "fee", "tax", "~84",
+            "81/85", "82/87", "~86", "~89", "~88", "sign", "net"),
+    FUTURES_ORDERS("~gateway no.", "order", "legs", "contract", "ordered", "state", "filled",
+            "cancelled", "price", "~time", "~entered", "~order date", "~N6", "~change",
+            "~in force", "~MT"),
+    FUTURES_FILLS("~order&gateway no.", "legs", "contract", "open&filled", "price&fill price", "",
+            "", "time&filled at", "~MT", "~date&fill date"),
     FUTURES_POSITIONS("side", "contract", "contracts", "price", "since", "currency"),
     OPTIONS_POSITIONS("side", "contract", "contracts", "price", "since"),
-    MARGIN("currency", "", "LO, 2 decimals", "", "PN", "RA", "LO", "QY", "", "QX", "", "U5", "", "",
-            "", "", "U9", "U5", "", "", "", "", "RF", "", "", "", "", "F0", "F1", "F2", "F3"),
+    MARGIN("currency", "", "LO, 2 decimals", "", "PN", "RA", "LO", "QY", "", "QX", "", "U5", "",
+            "", "", "", "U9", "U5", "", "", "", "", "RF", "", "", "", "", "F0", "F1", "F2", "F3"),
     BALANCE("", "", "", "", "balance", "");
+
+    private static final String MINOR = "~";
 
     private final List<String> columns;
 
@@ -42,29 +43,36 @@ public enum ResultLayout {
 
     /** Column names in order; an empty one marks a position that is always empty. */
     public List<String> columns() {
-        return columns;
+        List<String> names = new ArrayList<>();
+        for (String column : columns) {
+            names.add(column.replace(MINOR, ""));
+        }
+        return names;
+    }
+
+    /** Whether a column belongs in a narrow table: it is neither a minor one nor always empty. */
+    public boolean isMain(int column) {
+        return !columns.get(column).isEmpty() && !columns.get(column).startsWith(MINOR);
     }
 
     /** How the values of a column read: as they stand, or with decimals or names put in. */
     public Readable.Form form(int column) {
         String name = columns.get(column);
-        boolean futures = name().startsWith("FUTURES") || name().startsWith("OPTIONS");
-        if (name.contains("price")) {
-            return futures ? Readable.Form.FOUR_DECIMALS : Readable.Form.TWO_DECIMALS;
+        boolean futures = name().matches("(FUTURES|OPTIONS|MARGIN$).*");
+        if (name.contains("price") || this == MARGIN && column > 0) {
+            return futures && !name.equals("LO, 2 decimals")
+                    ? Readable.Form.FOUR_DECIMALS
+                    : Readable.Form.TWO_DECIMALS;
         }
-        if (this == MARGIN && !name.equals("currency")) {
-            return name.equals("LO, 2 decimals") ? Readable.Form.TWO_DECIMALS
-                                                 : Readable.Form.FOUR_DECIMALS;
+        if (name.matches(".*(date|entered|since).*")) {
+            return Readable.Form.DATE;
         }
-        switch (name) {
-            case "type":
-            case "legs":
-                return Readable.Form.ORDER_TYPE;
-            case "contract":
-                return Readable.Form.CONTRACT;
-            default:
-                return Readable.Form.PLAIN;
+        if (name.contains("time")) {
+            return Readable.Form.TIME;
         }
+        return name.matches("type|legs")
+                ? Readable.Form.ORDER_TYPE
+                : name.equals("contract") ? Readable.Form.CONTRACT : Readable.Form.PLAIN;
     }
 
     /** The records with every value in its readable form. */

@@ -8,6 +8,9 @@ import java.util.List;
 public final class Screen {
     private static final int WIDTH = 100;
 
+    /** Width of one place in a grid. */
+    private static final int CELL = 29;
+
     /** The styles that texts are written in. */
     public enum Style {
         PLAIN(""),
@@ -77,6 +80,36 @@ public final class Screen {
     /** Writes a table of texts, all to the left. */
     public void texts(List<String> columns, List<List<String>> rows) {
         table(columns, rows, false);
+    }
+
+    /** Writes named values, several to a line: the tag or number, the value, what it is. */
+    public void grid(String label, List<List<String>> items) {
+        StringBuilder line = new StringBuilder();
+        int used = 0;
+        String head = label;
+        for (List<String> item : items) {
+            String plain = item.get(0) + "=" + item.get(1) + " " + item.get(2);
+            int cells = width(plain) / CELL + 1;
+            if (used > 0 && used + cells * CELL > WIDTH - 12) {
+                gridLine(head, line);
+                head = "";
+                used = 0;
+            }
+            line.append(styled(Style.LABEL, item.get(0)))
+                    .append(styled(Style.STRONG, "=" + item.get(1)))
+                    .append(styled(Style.DIM, " " + item.get(2)))
+                    .append(" ".repeat(cells * CELL - width(plain)));
+            used += cells * CELL;
+        }
+        if (used > 0) {
+            gridLine(head, line);
+        }
+    }
+
+    private void gridLine(String label, StringBuilder line) {
+        out.println(
+                "  " + styled(Style.LABEL, pad(label, 9)) + " " + line.toString().stripTrailing());
+        line.setLength(0);
     }
 
     private void table(List<String> columns, List<List<String>> rows, boolean numbersRight) {

@@ -117,8 +117,30 @@ final class Stage {
 
     /** Shows the records of a list as a table and checks how many there are. */
     void table(ResultLayout layout, List<List<String>> records, int wanted) {
-        screen.table(layout.columns(), layout.readable(records));
+        List<List<String>> rows = layout.readable(records);
+        List<String> columns = layout.columns();
+        for (int column = columns.size() - 1; column >= 0; column--) {
+            if (!layout.isMain(column)) {
+                columns.set(column, "");
+                for (List<String> row : rows) {
+                    row.set(column, "");
+                }
+            }
+        }
+        screen.table(columns, rows);
         expect(records.size() == wanted, wanted + " records", records.size() + " records");
+    }
+
+    /** Shows a single record as named values. */
+    void record(ResultLayout layout, List<String> record) {
+        List<List<String>> items = new ArrayList<>();
+        List<String> values = layout.readable(List.of(record)).get(0);
+        for (int i = 0; i < values.size(); i++) {
+            if (layout.isMain(i)) {
+                items.add(List.of(layout.columns().get(i), values.get(i), ""));
+            }
+        }
+        screen.grid("shown", items);
     }
 
     /** Checks the text of one field of a list. */
@@ -140,14 +162,20 @@ final class Stage {
         Scene scene = Scene.ofRequest(fields);
         List<List<String>> rows = new ArrayList<>();
         for (WireField field : fields) {
-            if (wholeHeader || !HEADER_TAGS.contains(field.tag())) {
-                String name = FieldNames.name(scene, field.tag());
-                expect(name != null, "a name for tag " + field.tag(), "none");
-                rows.add(List.of(field.tag(), name == null ? "" : name, field.value()));
+            String name = FieldNames.name(scene, field.tag());
+            expect(name != null, "a name for tag " + field.tag(), "none");
+            if (!wholeHeader && field.tag().equals(FieldNames.PAYLOAD)) {
+                screen.grid("fields", rows);
+                screen.labelled("signed", Screen.Style.PLAIN, field.value());
+                rows.clear();
+            } else if (wholeHeader || !HEADER_TAGS.contains(field.tag())) {
+                rows.add(List.of(field.tag(), field.value(), name == null ? "" : name));
             }
         }
-        if (!rows.isEmpty()) {
-            screen.texts(List.of("tag", "field", "value as sent"), rows);
+        if (wholeHeader) {
+            screen.texts(List.of("tag", "value as sent", "what it is"), rows);
+        } else {
+            screen.grid("fields", rows);
         }
     }
 

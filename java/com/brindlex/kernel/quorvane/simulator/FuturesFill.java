@@ -30,7 +30,7 @@ final class FuturesFill {
     }
 
     void write(Reply reply) {
-        order.writeCommon(reply);
+        order.writeCommon(reply, order.ordered - order.open());
         reply.field("47", contracts)
                 .field("48", price1.toPlainString())
                 .field("50", Texts.date(at.toLocalDate()))

@@ -60,14 +60,19 @@ final class FuturesOrder {
         return immediate.equals("1") || fillOrKill.equals("1");
     }
 
-    /** Writes the fields that order book and fills share. */
-    void writeCommon(Reply reply) {
+    /**
+     * Writes the fields that order book and fills share.
+     *
+     * @param gone contracts to report in tag 37: those taken off for the order book, all that are
+     *     no longer open for a fill
+     */
+    void writeCommon(Reply reply, long gone) {
         reply.record().field("46", gatewayNumber).field("36", number);
         leg1.write(reply, true);
         if (leg2 != null) {
             leg2.write(reply, false);
         }
-        reply.field("W3", w3).field("70", ordered).field("37", reduced).field("31", price)
+        reply.field("W3", w3).field("70", ordered).field("37", gone).field("31", price)
                 .field("21", Texts.date(entered.toLocalDate()))
                 .field("22", Texts.time(entered.toLocalTime()))
                 .field("44", Texts.date(entered.toLocalDate()))
@@ -76,7 +81,7 @@ final class FuturesOrder {
 
     /** Writes the order as a record of the order book. */
     void write(Reply reply) {
-        writeCommon(reply);
+        writeCommon(reply, reduced);
         reply.field("O4", fillOrKill)
                 .field("V5", immediate)
                 .field("41", cancelled)
