@@ -45,9 +45,13 @@ struct FrameOptions {
   bool logsResult = true;
 };
 
-// The market of the futures exports: the same Java value serves both markets, and above 100 the
+// The session of a futures encoder: the same Java value serves both markets, and above 100 the
 // request goes to futures.
 inline constexpr jint kFuturesMarketOffset = 100;
+inline HostSession FuturesSession(HostSession session) {
+  session.market = WrapAdd(session.market, kFuturesMarketOffset);
+  return session;
+}
 
 // Characters of the host's strings, in parameter order.
 template <size_t N>
