@@ -1,0 +1,61 @@
+// The futures object's life, its two position texts and the reading of a result code.
+#include "gateway/futures/gateway_fut.h"
+
+#include "gateway/core/messages.h"
+#include "gateway/core/protocol.h"
+#include "gateway/futures/messages.h"
+#include "gateway/futures/reply_code.h"
+
+CGatewayFut::CGatewayFut()
+    : m_nFutDataSize(0),
+      m_nFutDataLen(0),
+      m_pFutData(nullptr),
+      m_nOptDataSize(0),
+      m_nOptDataLen(0),
+      m_pOptData(nullptr) {}
+
+CGatewayFut::~CGatewayFut() {
+  delete[] m_pFutData;
+  m_pFutData = nullptr;
+  delete[] m_pOptData;
+  m_pOptData = nullptr;
+}
+
+void CGatewayFut::AppendFutData(const char* data, int length, bool reset) {
+  AppendHeapText(FutText(), data, length, reset);
+}
+
+void CGatewayFut::AppendOptData(const char* data, int length, bool reset) {
+  AppendHeapText(OptText(), data, length, reset);
+}
+
+char* CGatewayFut::GetResultCode(const char* reply, char* out, int size) {
+  if (out == nullptr || size < 1) return out;
+  memset(out, 0, static_cast<size_t>(size));
+  const std::string_view text = AsText(reply);
+  if (text.empty()) {
+    CopyIfFits(kNoReplyToJudge, out, size);
+    return out;
+  }
+  char scratch[kReplyCodeSize + kRefusalSize + 2];
+  CTextWriter result(scratch, sizeof scratch);
+  WriteReplyCode(ReplyCode(text), text, result);
+  CopyIfFits({result.Text(), result.Length()}, out, size);
+  return out;
+}
+
+char* CGatewayFut::RefuseList(std::string_view reply, std::string_view code, int* status) {
+  *status = -1;
+  CTextWriter answer(m_szBuffer, sizeof m_szBuffer);
+  WriteReplyCode(code, reply, answer);
+  return answer.Text();
+}
+
+bool CGatewayFut::StartQuery(CTextWriter& line, const char* branch, const char* identity,
+                             const char* password, int* status) {
+  const bool written = WriteQueryHead(line, branch, identity, password);
+  if (written && !line.Overflowed()) return true;
+  *status = -1;
+  if (written) line.Replace(kBadParameters);
+  return false;
+}

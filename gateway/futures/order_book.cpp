@@ -1,0 +1,266 @@
+// The futures order book.
+//
+//   reply    ( |00=...|68=code|67=sequence|46=number|... |01= )*
+//   result   count ! record*
+//   record   46 @ 36 @legs @TIMEX& letter & commodity & month & call/put & strike @ quantity
+//            @ state [ & message ] @ filled @ cancelled [ @ price ] @ time @ 21 @ 44 @ N6
+//            @ JV flag @ time in force @ MT !
+//
+// The gateway leaves out what did not change: quantities and the time in force stand until a later
+// record brings others, and the product letter likewise.
+#include "gateway/core/conversions.h"
+#include "gateway/core/log.h"
+#include "gateway/core/messages.h"
+#include "gateway/futures/gateway_fut.h"
+#include "gateway/futures/leg_code.h"
+#include "gateway/futures/messages.h"
+#include "gateway/futures/order_state.h"
+#include "gateway/futures/reply_code.h"
+
+namespace {
+
+// Where no smaller buffer is named for a field, the record is its bound.
+constexpr size_t kAny = kFuturesRecordSize;
+
+constexpr int kPriceDecimals = 4;
+
+enum Field {
+  kO4 = kOwnFields,
+  kV5,
+  kQuantity,
+  kCancelled,
+  kReduced,
+  kFilled,
+  kFailure,
+  kFailureText,
+  kN6,
+  kCallPut,
+  kW3,
+  kSide2,
+  kSide1,
+  kNumber,
+  kReference,
+  kCommodity1,
+  kCommodity2,
+  kMonth1,
+  kMonth2,
+  kCallPut2,
+  kStrike1,
+  kStrike2,
+  kPriceType,
+  kPrice,
+  kTime,
+  kDate,
+  kOrderDate,
+  kJV,
+  kMT
+};
+
+constexpr ListShape kShape = {kFuturesRecordSize, 16, 128, 512};
+
+constexpr CTagTable kTags({{"67"}, {"68"}, {"M2"}, {"O4"}, {"V5"}, {"70"}, {"41"}, {"37"},
+                           {"47"}, {"39"}, {"K1"}, {"N6"}, {"V8"}, {"W3"}, {"EL"}, {"32"},
+                           {"46"}, {"36"}, {"33"}, {"V9"}, {"29"}, {"W0"}, {"W1"}, {"34"},
+                           {"W2"}, {"27"}, {"31"}, {"22"}, {"21"}, {"44"}, {"JV"}, {"MT"}});
+static_assert(OpensListTable(kTags));
+
+// A number that stands until a record brings another.
+class CStanding {
+ public:
+  void Update(const CRecord& record, int field) {
+    if (record.Has(field)) m_nValue = record.Number(field, kAny);
+  }
+  int32_t Value() const { return m_nValue; }
+
+ private:
+  int32_t m_nValue = 0;
+};
+
+// What goes from one record to the next.
+struct Standing {
+  CStanding o4, v5;
+  CStanding quantity, cancelled, reduced, filled;
+  char timeInForce = '\0';
+  const char* product = "";
+};
+
+// A pair that means nothing leaves the letter as it was.
+void UpdateTimeInForce(const CRecord& record, Standing& standing) {
+  standing.o4.Update(record, kO4);
+  standing.v5.Update(record, kV5);
+  const int32_t o4 = standing.o4.Value();
+  const int32_t v5 = standing.v5.Value();
+  if (o4 == 0 && v5 == 0) standing.timeInForce = 'R';
+  if (o4 == 0 && v5 == 1) standing.timeInForce = 'I';
+  if (o4 == 1 && v5 == 0) standing.timeInForce = 'F';
+}
+
+void UpdateQuantities(const CRecord& record, Standing& standing) {
+  standing.quantity.Update(record, kQuantity);
+  standing.cancelled.Update(record, kCancelled);
+  standing.reduced.Update(record, kReduced);
+  standing.filled.Update(record, kFilled);
+}
+
+// "@51" for one leg, "@51|52" for two; two legs with an unknown side have no code at all, and an
+// unusual W3 a bare '@', with the product letter of the record before.
+void AppendLegCodes(CResultText& list, const CRecord& record, bool option, Standing& standing) {
+  const std::string_view w3 = record.Text(kW3, 8);
+  const std::string_view side1 = record.Text(kSide1, kAny);
+  const std::string_view side2 = record.Text(kSide2, kAny);
+  const LegPair* const pair = IsBlank(w3) ? &kUsualLegPair : FindLegPair(w3);
+  if (pair == nullptr || (option && !pair->forOptions)) {
+    list.AppendChar('@');
+    return;
+  }
+  const int first = SideOffset(side1);
+  if (IsBlank(side2)) {
+    standing.product = option ? "O" : "F";
+    list.Append(WIRE("@%d"), pair->buying + (first == 0 ? 0 : 1));
+    return;
+  }
+  standing.product = option ? "X" : "Y";
+  const int second = SideOffset(side2);
+  if (first == kNoSide || second == kNoSide) return;
+  list.Append(WIRE("@%d|%d"), pair->buying + first, pair->buying + second);
+}
+
+// The second of two values stands behind a bar, if there is one.
+void AppendPair(CResultText& list, std::string_view first, std::string_view second) {
+  list.AppendText(first);
+  if (!IsBlank(second)) list.Append(WIRE("|%s"), second);
+  list.AppendChar('&');
+}
+
+// Strikes of these commodities come with a tenth more than is shown, in pairs alone.
+bool StrikesInTenths(std::string_view commodity) {
+  return commodity == "MSO" || commodity == "GTO" || commodity == "TEO";
+}
+
+void AppendStrikes(CResultText& list, const CRecord& record) {
+  const int32_t strike1 = ScalePrice(record.Text(kStrike1, kAny), kPriceDecimals);
+  const std::string_view second = record.Text(kStrike2, kAny);
+  if (IsBlank(second)) {
+    list.Append(WIRE("%d"), strike1);
+    return;
+  }
+  const int unit = StrikesInTenths(record.Text(kCommodity1, kAny)) ? 10 : 1;
+  list.Append(WIRE("%ld|%ld"), strike1 / unit, ScalePrice(second, kPriceDecimals) / unit);
+}
+
+// Futures spreads show their first commodity alone.
+void AppendContract(CResultText& list, const CRecord& record, const char* product) {
+  list.Append(WIRE("@TIMEX&%s&%s"), product, record.Text(kCommodity1, kAny));
+  if (*product == 'X') list.Append(WIRE("|%s"), record.Text(kCommodity2, kAny));
+  list.AppendChar('&');
+  AppendPair(list, record.Text(kMonth1, kAny), record.Text(kMonth2, kAny));
+  AppendPair(list, record.Text(kCallPut, 8), record.Text(kCallPut2, kAny));
+  AppendStrikes(list, record);
+}
+
+// A record without a price type lacks the field.
+void AppendPrice(CResultText& list, const CRecord& record) {
+  if (!record.Has(kPriceType)) return;
+  const int32_t type = record.Number(kPriceType, kAny);
+  if (type == 1) {
+    list.AppendText("@市價");
+  } else if (type == 3) {
+    list.AppendText("@範圍市價");
+  } else {
+    list.Append(WIRE("@%d"), ScalePrice(record.Text(kPrice, kAny), kPriceDecimals));
+  }
+}
+
+const char* JVFlag(std::string_view jv, bool hasMessage) {
+  if (jv == "N") return "2";
+  if (jv == "Y") return "1";
+  return hasMessage ? "2" : "";
+}
+
+// The order's state; only a failed order has a message, which keeps its '!' as the gateway sent it.
+void AppendStateAndQuantities(CResultText& list, const CRecord& record, const Standing& standing,
+                              std::string_view message, int32_t market) {
+  const int32_t quantity = standing.quantity.Value();
+  const int32_t filled = standing.filled.Value();
+  const int32_t cancelled = WrapAdd(standing.cancelled.Value(), standing.reduced.Value());
+  const OrderState state = {quantity,
+                            cancelled,
+                            filled,
+                            standing.timeInForce,
+                            record.Text(kFailure, kAny),
+                            record.Text(kN6, kAny),
+                            message,
+                            market};
+  list.Append(WIRE("@%d@%s"), quantity, OrderStateText(state));
+  if (!message.empty()) list.Append(WIRE("&%s"), message);
+  list.Append(WIRE("@%d@%d"), filled, cancelled);
+}
+
+void LogNumber(std::string_view number) {
+  char scratch[kAny];
+  CTextWriter line(scratch, sizeof scratch);
+  line.AppendText(number);
+  debuglog(line.Text());
+}
+
+// Appends the record; false when it is no kind of order.
+bool AppendOrder(CResultText& list, const CRecord& record, int32_t market, Standing& standing) {
+  const std::string_view callPut = record.Text(kCallPut, 8);
+  const bool option = callPut == "C" || callPut == "P";
+  if (!option && !IsBlank(callPut)) return false;
+  const bool failed = record.Text(kFailure, kAny) == "E";
+  const std::string_view message = failed ? record.Text(kFailureText, 512) : std::string_view();
+
+  list.Append(WIRE("%s@%s"), record.Text(kNumber, kAny), record.Text(kReference, kAny));
+  AppendLegCodes(list, record, option, standing);
+  AppendContract(list, record, standing.product);
+  AppendStateAndQuantities(list, record, standing, message, market);
+  AppendPrice(list, record);
+  const CTransDate date(record.Text(kDate, kAny));
+  const CTransDate orderDate(record.Text(kOrderDate, kAny));
+  list.Append(WIRE("@%s@%s@%s@%s"), FirstSix(record.Text(kTime, kAny)), date.Text(),
+              orderDate.Text(), record.Text(kN6, kAny));
+  const std::string_view mt = record.Text(kMT, kAny);
+  list.Append(WIRE("@%s@%c"), JVFlag(record.Text(kJV, kAny), !message.empty()),
+              standing.timeInForce);
+  list.Append(WIRE("@%s!"), mt.empty() ? " " : mt);
+  return true;
+}
+
+}  // namespace
+
+char* CGatewayFut::QueryOrderEncode(const char* branch, const char* identity, const char* password,
+                                    const char* date, int selection, int* status) {
+  *status = 1;
+  CTextWriter line = StartRequest();
+  if (!StartQuery(line, branch, identity, password, status)) return line.Text();
+  const CTransDate day(AsText(date));
+  if (day.Text().empty()) return Fail(line, status, kBadOrderDate);
+  line.Append(WIRE("FUNC=x|FUNC1=0|SDATE=%s"), day.Text());
+  line.Append(WIRE("||EDATE=%s"), day.Text());  // one day; the doubled bar is the wire's
+  line.Append(WIRE("|28=%d|01="), selection);
+  return FinishEscaped(line, status, kBadParameters);
+}
+
+char* CGatewayFut::QueryOrderDecode(const char* reply, int* status) {
+  *status = 1;
+  const std::string_view text = AsText(reply);
+  if (text.empty()) return Fail(kNoReply, status);
+  CReplyList orders(text, kTags, kShape);
+  if (orders.Verdict() == ListVerdict::kRefused && orders.Code().empty()) return Fail("", status);
+  if (char* const answer = AnswerWithoutData(orders, "0!", status)) return answer;
+
+  CResultText list({m_pData, m_nDataSize, m_nDataLen}, text.size());
+  Standing standing;
+  int count = 0;
+  while (orders.Next()) {
+    const CRecord& record = orders.Record();
+    UpdateTimeInForce(record, standing);
+    if (orders.Code() != kDone) continue;
+    UpdateQuantities(record, standing);
+    LogNumber(record.Text(kNumber, kAny));
+    if (!AppendOrder(list, record, m_nMarket, standing)) return Fail(kLegKindError, status);
+    ++count;
+  }
+  return FinishList(list, count, status);
+}

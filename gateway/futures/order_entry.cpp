@@ -1,0 +1,326 @@
+// Futures and options orders: new, change, cancel, and the gateway's answer to them.
+//
+//   request  <order header> 27 28 29 30 31 M8 32 33 34 O4 V5 V6 V8 [<second leg>]
+//            ( W3 | 36 46 37 ) N6 <signature payload>
+//   reply    |39=blank|19=code|46=number|44=date|MT=flag|K1=refusal
+//   result   46 @ date @ @ accepted @ flag @ !
+#include "gateway/core/conversions.h"
+#include "gateway/core/messages.h"
+#include "gateway/core/protocol.h"
+#include "gateway/futures/futures_order.h"
+#include "gateway/futures/gateway_fut.h"
+
+namespace {
+
+// Room for one value of an order reference: a longer one is dropped.
+constexpr size_t kReferencePartSize = 48;
+
+// Room for a refused order's message.
+constexpr size_t kRefusalSize = 128;
+
+constexpr int kPriceDecimals = 4;
+constexpr char kMarketPrice[] = "00000000.000000";
+
+bool NamesEveryLeg(const FuturesOrder& order) {
+  switch (order.kind) {
+    case OrderKind::kFutures:
+      return order.first.NamesContract();
+    case OrderKind::kOption:
+      return order.first.NamesOption();
+    case OrderKind::kCombination:
+      return order.first.NamesOption() && order.second.NamesOption();
+    case OrderKind::kSpread:
+      return order.first.NamesContract() && order.second.NamesContract();
+  }
+  return false;
+}
+
+// The price as it is sent and signed.
+class CPriceText {
+ public:
+  CPriceText(CGatewayPub& gateway, const FuturesOrder& order) {
+    if (order.IsAtMarket()) {
+      memcpy(m_szPrice, kMarketPrice, sizeof kMarketPrice);
+    } else {
+      gateway.SetPriceString(order.price, kPriceDecimals, m_szPrice, sizeof m_szPrice);
+    }
+  }
+
+  const char* Text() const { return m_szPrice; }
+
+ private:
+  char m_szPrice[16];
+};
+
+// Codes are compared by their first characters, as far as a code reaches.
+bool SameStart(const char* one, const char* other, size_t characters) {
+  const auto start = [characters](const char* text) {
+    const std::string_view whole = AsText(text);
+    return std::string_view(whole.data(), whole.size() < characters ? whole.size() : characters);
+  };
+  return start(one) == start(other);
+}
+
+// How the two legs of an order make one product.
+const char* CombinationCode(const FuturesOrder& order) {
+  const Leg& first = order.first;
+  const Leg& second = order.second;
+  if (order.kind == OrderKind::kSpread) return "7";
+  if (order.kind != OrderKind::kCombination) return "";
+  if (first.side == second.side) {
+    return SameStart(first.commodity, second.commodity, 16) ? "3" : "4";
+  }
+  if (!SameStart(first.callPut, second.callPut, 8)) return "5";
+  return SameStart(first.month, second.month, 16) ? "1" : "2";
+}
+
+// The two values of a reference, joined by '&'; what follows a second '&' is not read.
+struct Reference {
+  explicit Reference(std::string_view text)
+      : first(Bounded(TakePiece(text, '&'), kReferencePartSize)),
+        second(Bounded(TakePiece(text, '&'), kReferencePartSize)) {}
+
+  std::string_view first;
+  std::string_view second;
+};
+
+// W1 carries the call/put and W2 the strike; only a new order repeats its quantity for the leg.
+void WriteSecondLeg(const FuturesOrder& order, CTextWriter& body) {
+  const Leg& leg = order.second;
+  if (order.IsNew()) {
+    body.Append(WIRE("|EL=%c|V9=%s|W0=%s|W1=%s|W2=%s|EM=%ld"), leg.side, leg.commodity, leg.month,
+                leg.callPut, leg.strike, order.quantity);
+  } else {
+    body.Append(WIRE("|EL=%c|V9=%s|W0=%s|W1=%s|W2=%s"), leg.side, leg.commodity, leg.month,
+                leg.callPut, leg.strike);
+  }
+}
+
+void WriteBody(const FuturesOrder& order, const char* price, CTextWriter& body) {
+  const Leg& leg = order.first;
+  body.Append(WIRE("|27=%d|28=0|29=%s|30=%ld|31=%s|M8=|32=%c|33=%s|34=%s"), int{order.priceType},
+              leg.month, order.quantity, price, leg.side, leg.commodity, leg.strike);
+  body.Append(WIRE("|O4=%s|V5=%s|V6=%s|V8=%s"), order.timeInForce == 'F' ? "1" : "0",
+              order.timeInForce == 'I' ? "1" : "0", CombinationCode(order), leg.callPut);
+  if (order.HasTwoLegs()) WriteSecondLeg(order, body);
+  if (order.IsNew()) {
+    body.Append(WIRE("|W3=%c"), order.w3);
+    return;
+  }
+  const Reference reference(AsText(order.reference));
+  body.Append(WIRE("|36=%s|46=%s|37=%ld"), reference.first, reference.second, order.quantity);
+}
+
+// An order and the two texts that its signature payload needs beside it.
+struct Signing {
+  const FuturesOrder& order;
+  std::string_view key;
+  const char* price;
+};
+
+// Values joined by '_', as many as each case has.
+void SignPlain(const Signing& signing, CTextWriter& out) {
+  const FuturesOrder& order = signing.order;
+  const Leg& first = order.first;
+  const Leg& second = order.second;
+  const Reference reference(AsText(order.reference));
+  if (order.IsNew() && order.HasTwoLegs()) {
+    out.Append(WIRE("!!%s_%c_%c_%s_%s_%s_%s_%c_%s_%s_%s_%s_%ld_%s"), signing.key, order.timeInForce,
+               first.side, first.commodity, first.month, first.strike, first.callPut, second.side,
+               second.commodity, second.month, second.strike, second.callPut, order.quantity,
+               signing.price);
+  } else if (order.IsNew()) {
+    out.Append(WIRE("!!%s_%c_%c_%s_%s_%s_%s_%ld_%s"), signing.key, order.timeInForce, first.side,
+               first.commodity, first.month, first.strike, first.callPut, order.quantity,
+               signing.price);
+  } else if (order.function == 'C') {
+    out.Append(WIRE("!!%s_%s_%ld"), signing.key, reference.first, order.quantity);
+  } else {
+    out.Append(WIRE("!!%s_%s"), signing.key, reference.first);
+  }
+}
+
+// Always sixteen places: key, time in force, W3, price type, five of each leg, quantity, price;
+// then the reference of a change or cancel. A leg's call/put stands last here, unlike in the tags.
+void SignInPlaces(const Signing& signing, CTextWriter& out) {
+  const FuturesOrder& order = signing.order;
+  const Leg& first = order.first;
+  const Leg& second = order.second;
+  const Reference reference(AsText(order.reference));
+  if (order.IsNew() && order.HasTwoLegs()) {
+    out.Append(WIRE("|PL=S!!%s,%c,%c,%d,%c,%s,%s,%s,%s,%c,%s,%s,%s,%s,%ld,%s,"), signing.key,
+               order.timeInForce, order.w3, int{order.priceType}, first.side, first.commodity,
+               first.month, first.strike, first.callPut, second.side, second.commodity,
+               second.month, second.strike, second.callPut, order.quantity, signing.price);
+  } else if (order.IsNew()) {
+    out.Append(WIRE("|PL=S!!%s,%c,%c,%d,%c,%s,%s,%s,%s,,,,,,%ld,%s,"), signing.key,
+               order.timeInForce, order.w3, int{order.priceType}, first.side, first.commodity,
+               first.month, first.strike, first.callPut, order.quantity, signing.price);
+  } else if (order.function == 'A') {
+    out.Append(WIRE("|PL=S!!%s,%c,,,,,,,,,,,,,%ld,%s,%s"), signing.key, order.timeInForce,
+               order.quantity, signing.price, reference.first);
+  } else if (order.function == 'C') {
+    out.Append(WIRE("|PL=S!!%s,,,,,,,,,,,,,,%ld,,%s"), signing.key, order.quantity,
+               reference.first);
+  } else {
+    out.Append(WIRE("|PL=S!!%s,,,,,,,,,,,,,,0,,%s"), signing.key, reference.first);
+  }
+}
+
+using Sign = void(const Signing& signing, CTextWriter& out);
+
+// Appends an order's tags to `body` and turns the key in `signature` into its payload; false, and
+// nothing written, when the order does not name what its kind needs.
+bool WriteRecord(CGatewayPub& gateway, const FuturesOrder& order, Sign* sign, CTextWriter& body,
+                 CTextWriter& signature) {
+  if (!NamesEveryLeg(order)) return false;
+  const CPriceText price(gateway, order);
+  WriteBody(order, price.Text(), body);
+  char scratch[CGatewayPub::kBufferSize];
+  CTextWriter key(scratch, sizeof scratch);
+  key.AppendText({signature.Text(), signature.Length()});
+  signature.Replace("");
+  sign({order, {key.Text(), key.Length()}, price.Text()}, signature);
+  return true;
+}
+
+// A public record method: what it returns, and its two buffers.
+int EncodeRecord(CGatewayPub& gateway, const FuturesOrder& order, Sign* sign, char* body,
+                 char* signature) {
+  CTextWriter line = CTextWriter::Continue(body, CGatewayPub::kBufferSize);
+  CTextWriter payload = CTextWriter::Continue(signature, CGatewayPub::kBufferSize);
+  const bool written = WriteRecord(gateway, order, sign, line, payload);
+  const bool fits = !payload.Overflowed();
+  payload.Text();
+  if (!written || !fits) line.Replace(kBadParameters);
+  return EndPublicHead(line, written && fits);
+}
+
+// The host's arguments in their own order.
+FuturesOrder NameOrder(const char* reference, const char* commodity1, const char* commodity2,
+                       const char* month1, const char* month2, const char* strike1,
+                       const char* strike2, const char* callPut1, const char* callPut2, char n6,
+                       char orderKind, char priceType, char function, char w3, char timeInForce,
+                       char side1, char side2, int quantity, int price) {
+  return {reference,
+          {side1, commodity1, month1, strike1, callPut1},
+          {side2, commodity2, month2, strike2, callPut2},
+          static_cast<uint8_t>(n6),
+          OrderKind{static_cast<uint8_t>(orderKind)},
+          static_cast<uint8_t>(priceType),
+          function,
+          w3,
+          timeInForce,
+          quantity,
+          price};
+}
+
+constexpr bool IsAccepted(std::string_view code) {
+  return !code.empty() && std::string_view("STXY").find(code.front()) != std::string_view::npos;
+}
+
+// What follows the accepted flag, by the first character of tag MT.
+const char* FlagEnding(std::string_view flag) {
+  if (flag.empty()) return "@@!";
+  return flag.front() == '0' ? "@0@!" : flag.front() == '1' ? "@1@!" : "@@!";
+}
+
+}  // namespace
+
+char* CGatewayFut::EncodeOrder(OrderHead head, const OrderOrigin& origin, const FuturesOrder& order,
+                               int* status) {
+  *status = 1;
+  CTextWriter line = StartRequest();
+  CTextWriter signature(m_szSignature, sizeof m_szSignature);
+  if (!WriteOrderHead(head, origin, line, signature)) {
+    *status = -1;
+    return line.Text();
+  }
+  Sign* const sign = head == OrderHead::kPlain ? SignPlain : SignInPlaces;
+  if (WriteRecord(*this, order, sign, line, signature)) {
+    line.Append(WIRE("|N6=%d"), int{order.n6});
+    line.AppendText({signature.Text(), signature.Length()});
+    if (signature.Overflowed()) return Fail(line, status, kBadParameters);
+  } else {
+    *status = -1;
+    line.AppendText(kBadParameters);  // the header stays in front of it
+  }
+  return Finish(line, status, kBadParameters);
+}
+
+char* CGatewayFut::SubmitOrderEncode(const char* branch, const char* identity, const char* password,
+                                     const char* reference, const char* orderDate,
+                                     const char* commodity1, const char* commodity2,
+                                     const char* month1, const char* month2, const char* strike1,
+                                     const char* strike2, const char* callPut1,
+                                     const char* callPut2, char n6, char orderKind, char priceType,
+                                     char function, char w3, char timeInForce, char, char side1,
+                                     char side2, int quantity, int, int price, int* status) {
+  return EncodeOrder(OrderHead::kPlain, {function, branch, identity, password, orderDate},
+                     NameOrder(reference, commodity1, commodity2, month1, month2, strike1, strike2,
+                               callPut1, callPut2, n6, orderKind, priceType, function, w3,
+                               timeInForce, side1, side2, quantity, price),
+                     status);
+}
+
+char* CGatewayFut::SubmitOrderEncode1(
+    const char* branch, const char* identity, const char* password, const char* reference,
+    const char* orderDate, const char* commodity1, const char* commodity2, const char* month1,
+    const char* month2, const char* strike1, const char* strike2, const char* callPut1,
+    const char* callPut2, char n6, char orderKind, char priceType, char function, char w3,
+    char timeInForce, char, char side1, char side2, int quantity, int, int price, int* status) {
+  return EncodeOrder(OrderHead::kSigned, {function, branch, identity, password, orderDate},
+                     NameOrder(reference, commodity1, commodity2, month1, month2, strike1, strike2,
+                               callPut1, callPut2, n6, orderKind, priceType, function, w3,
+                               timeInForce, side1, side2, quantity, price),
+                     status);
+}
+
+int CGatewayFut::EncodeSubmitOrderRecord(const char* reference, const char*, const char* commodity1,
+                                         const char* commodity2, const char* month1,
+                                         const char* month2, const char* strike1,
+                                         const char* strike2, const char* callPut1,
+                                         const char* callPut2, char n6, char orderKind,
+                                         char priceType, char function, char w3, char timeInForce,
+                                         char, char side1, char side2, int quantity, int, int price,
+                                         char* body, char* signature) {
+  return EncodeRecord(*this,
+                      NameOrder(reference, commodity1, commodity2, month1, month2, strike1, strike2,
+                                callPut1, callPut2, n6, orderKind, priceType, function, w3,
+                                timeInForce, side1, side2, quantity, price),
+                      SignPlain, body, signature);
+}
+
+int CGatewayFut::EncodeSubmitOrderRecord1(
+    const char* reference, const char*, const char* commodity1, const char* commodity2,
+    const char* month1, const char* month2, const char* strike1, const char* strike2,
+    const char* callPut1, const char* callPut2, char n6, char orderKind, char priceType,
+    char function, char w3, char timeInForce, char, char side1, char side2, int quantity, int,
+    int price, char* body, char* signature) {
+  return EncodeRecord(*this,
+                      NameOrder(reference, commodity1, commodity2, month1, month2, strike1, strike2,
+                                callPut1, callPut2, n6, orderKind, priceType, function, w3,
+                                timeInForce, side1, side2, quantity, price),
+                      SignInPlaces, body, signature);
+}
+
+// An empty reply is told from a failed transport first: the order is under way.
+char* CGatewayFut::SubmitOrderDecode(const char* reply, int* status) {
+  *status = 1;
+  const std::string_view text = AsText(reply);
+  if (text.empty()) return Answer(kOrderInTransit);
+  if (TransportFailed(text, status)) return m_szBuffer;
+  const auto value = [text](std::string_view tag, size_t bound, Blanks blanks = Blanks::kTaken) {
+    return Bounded(FindField(text, tag, blanks), bound);
+  };
+  if (value("39", 256) != " ") return Fail(value("K1", kRefusalSize, Blanks::kSkipped), status);
+  const std::string_view code = value("19", 128);
+  if (!IsAccepted(code)) return Fail(value("K1", kRefusalSize), status);
+
+  const CTransDate date(value("44", 16));
+  CTextWriter record(m_szBuffer, sizeof m_szBuffer);
+  record.Append(WIRE("%s@%s@"), value("46", 128), date.Text());
+  record.AppendText(code.front() == 'X' ? "@0" : "@1");
+  record.AppendText(FlagEnding(value("MT", kBufferSize)));
+  return record.Text();
+}

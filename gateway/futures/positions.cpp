@@ -1,0 +1,182 @@
+// Open positions, in a section of futures and one of options.
+//
+//   reply    68=code|M2=refusal ( |00=...|67=sequence|68=code|33=..|V9=..|... |01= )*
+//   result   <5>!count! futures* <6>!count! options*
+//   futures  32 @ TIMEX&F&33&month @ R8 @ 48 @ 50 @ currency !
+//   spread   32|EL @ TIMEX&Y&33&month|month @ R8 @ 48|W5 @ 50 @ currency !
+//   option   32 @ TIMEX&O&33&month&V8&strike @ R8 @ 48 @ 50 !
+//   pair     32|EL @ TIMEX&X&33|V9&month|month&V8|W1&strike|strike @ R8 @ 48|W5 @ 50 !
+#include "gateway/core/conversions.h"
+#include "gateway/core/messages.h"
+#include "gateway/futures/gateway_fut.h"
+#include "gateway/futures/messages.h"
+#include "gateway/futures/reply_code.h"
+
+namespace {
+
+// No smaller buffer is named for any field: the record is their bound.
+constexpr size_t kAny = kFuturesRecordSize;
+
+constexpr int kPriceDecimals = 4;
+
+// A section is never longer than twice its reply: the shortest record, 16 characters, gives 19, and
+// a price gives less than its field.
+constexpr size_t kSectionPerReply = 2;
+
+constexpr std::string_view kNoOptions = "<6>!0!";
+
+enum Field {
+  kCommodity1 = kOwnFields,
+  kCommodity2,
+  kMonth1,
+  kMonth2,
+  kCallPut1,
+  kCallPut2,
+  kStrike1,
+  kStrike2,
+  kSide1,
+  kSide2,
+  kField48,
+  kW5,
+  kR8,
+  kField50,
+  kCurrency
+};
+
+constexpr CTagTable kTags({{"67"},
+                           {"68"},
+                           {"M2"},
+                           {"33"},
+                           {"V9"},
+                           {"29"},
+                           {"W0"},
+                           {"V8"},
+                           {"W1"},
+                           {"34"},
+                           {"W2"},
+                           {"32"},
+                           {"EL"},
+                           {"48"},
+                           {"W5"},
+                           {"R8"},
+                           {"50"},
+                           {"28"}});
+static_assert(OpensListTable(kTags));
+
+constexpr ListShape kShape = {kFuturesRecordSize, kAny, kReplyCodeSize, kRefusalSize, true};
+
+// One record with its values read.
+struct Position {
+  explicit Position(const CRecord& record)
+      : commodity1(record.Text(kCommodity1, kAny)),
+        commodity2(record.Text(kCommodity2, kAny)),
+        month1(record.Text(kMonth1, kAny)),
+        month2(record.Text(kMonth2, kAny)),
+        callPut1(record.Text(kCallPut1, kAny)),
+        callPut2(record.Text(kCallPut2, kAny)),
+        side1(record.Text(kSide1, kAny)),
+        side2(record.Text(kSide2, kAny)),
+        w5(record.Text(kW5, kAny)),
+        field50(record.Text(kField50, kAny)),
+        currency(record.Text(kCurrency, kAny)),
+        strike1(ScalePrice(record.Text(kStrike1, kAny), kPriceDecimals)),
+        strike2(ScalePrice(record.Text(kStrike2, kAny), kPriceDecimals)),
+        price48(ScalePrice(record.Text(kField48, kAny), kPriceDecimals)),
+        priceW5(ScalePrice(w5, kPriceDecimals)),
+        r8(record.Number(kR8, kAny)) {}
+
+  bool IsOption() const { return callPut1 == "P" || callPut1 == "C"; }
+  bool HasTwoLegs() const { return !commodity2.empty(); }
+
+  std::string_view commodity1, commodity2, month1, month2, callPut1, callPut2, side1, side2, w5,
+      field50, currency;
+  int32_t strike1, strike2, price48, priceW5, r8;
+};
+
+const char* CurrencyName(std::string_view code) {
+  switch (code.empty() ? '\0' : code.front()) {
+    case '1':
+      return "TWD";
+    case '2':
+      return "USD";
+    case '4':
+      return "RMB";
+    default:
+      return "";
+  }
+}
+
+// Each month travels with "00" behind it.
+void AppendFutures(CResultText& list, const Position& position) {
+  const char* const currency = CurrencyName(position.currency);
+  if (position.HasTwoLegs()) {
+    list.Append(WIRE("%s|%s@TIMEX&Y&%s&%s00|%s00@%d@%ld|%ld@%s@%s!"), position.side1,
+                position.side2, position.commodity1, position.month1, position.month2, position.r8,
+                position.price48, position.priceW5, position.field50, currency);
+  } else {
+    list.Append(WIRE("%s@TIMEX&F&%s&%s00@%d@%ld@%s@%s!"), position.side1, position.commodity1,
+                position.month1, position.r8, position.price48, position.field50, currency);
+  }
+}
+
+// Options show no currency. A pair without W5 shows that field empty.
+void AppendOption(CResultText& list, const Position& position) {
+  if (!position.HasTwoLegs()) {
+    list.Append(WIRE("%s@TIMEX&O&%s&%s00&%s&%ld@%d@%ld@%s!"), position.side1, position.commodity1,
+                position.month1, position.callPut1, position.strike1, position.r8, position.price48,
+                position.field50);
+    return;
+  }
+  list.Append(WIRE("%s|%s@TIMEX&X&%s|%s&%s00|%s00&%s|%s&%ld|%ld@%d@%ld|"), position.side1,
+              position.side2, position.commodity1, position.commodity2, position.month1,
+              position.month2, position.callPut1, position.callPut2, position.strike1,
+              position.strike2, position.r8, position.price48);
+  if (!position.w5.empty()) list.Append(WIRE("%ld"), position.priceW5);
+  list.Append(WIRE("@%s!"), position.field50);
+}
+
+}  // namespace
+
+char* CGatewayFut::QueryInventoryEncode(const char* branch, const char* identity,
+                                        const char* password, int* status) {
+  *status = 1;
+  CTextWriter line = StartRequest();
+  for (const char* const text : {branch, identity, password}) {
+    if (AsText(text).empty()) return Fail(line, status, kBadPositionQuery);
+  }
+  if (!StartQuery(line, branch, identity, password, status)) return line.Text();
+  line.AppendText("FUNC=O|01=");
+  return Finish(line, status, kBadParameters);
+}
+
+// The sections grow side by side in the object's two texts, the first with room for both.
+char* CGatewayFut::QueryInventoryDecode(const char* reply, int* status) {
+  *status = 1;
+  const std::string_view text = AsText(reply);
+  if (text.empty()) return Fail(kNoReply, status);
+  const std::string_view code = ReplyCode(text);
+  if (code == kNoData) return Answer("<5>!0!<6>!0!");
+  if (code != kDone) return RefuseList(text, code, status);
+
+  CReplyList positions(text, kTags, kShape);
+  CResultText futures(FutText(), kSectionPerReply * text.size());
+  CResultText options(OptText(), kSectionPerReply * text.size());
+  int futuresCount = 0;
+  int optionsCount = 0;
+  while (positions.NextData()) {
+    const Position position(positions.Record());
+    if (position.IsOption()) {
+      AppendOption(options, position);
+      ++optionsCount;
+    } else {
+      AppendFutures(futures, position);
+      ++futuresCount;
+    }
+  }
+  const char* const section =
+      optionsCount == 0 ? kNoOptions.data() : options.Finish("<6>!", optionsCount);
+  futures.AppendText(AsText(section));
+  char* const result = section == nullptr ? nullptr : futures.Finish("<5>!", futuresCount);
+  if (result == nullptr) *status = -1;
+  return result;
+}
