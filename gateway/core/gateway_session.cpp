@@ -72,7 +72,6 @@ std::string_view CGatewayPub::RequestKind() const {
 
 CGatewayPub::Stamp CGatewayPub::TakeStamp() {
   const time_t now = time(nullptr);
-  tzset();  // localtime_r alone would keep the zone of the process's start
   struct tm local = {};
   localtime_r(&now, &local);
   const uint32_t sequence = static_cast<uint32_t>(m_nSeqNo) % 100;
