@@ -168,15 +168,6 @@ TEST_F(QueryHead, RequestIdIsTheLocalTimeAndTheSequenceNumber) {
   EXPECT_EQ(Field("65"), "0013452199");
 }
 
-// A device that is carried into another zone goes on with that zone's time.
-TEST_F(QueryHead, RequestIdFollowsTheTimeZoneOfTheMoment) {
-  EXPECT_EQ(Write("&"), 1);
-  setenv("TZ", "JST-9", 1);
-  EXPECT_EQ(Write("&"), 1);
-  EnterMarketTimeZone();
-  EXPECT_EQ(Field("65"), "0014452107");
-}
-
 // The identity block, by the lengths of the two parts.
 std::string ExpectedBlock(size_t length1, size_t length2) {
   const std::string account = "15=0|ACNO=0000000|PWD=pw|";
