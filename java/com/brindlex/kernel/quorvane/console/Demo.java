@@ -21,14 +21,26 @@ public final class Demo {
      */
     public static void main(String[] arguments) {
         PrintStream out = new PrintStream(System.out, true, StandardCharsets.UTF_8);
-        Screen screen = new Screen(out, Arrays.asList(arguments).contains("--colour"));
-        Stage stage = new Stage(screen, Clock.systemDefaultZone());
+        boolean colours = Arrays.asList(arguments).contains("--colour");
+        System.exit(play(out, colours, Clock.systemDefaultZone()) ? 0 : 1);
+    }
+
+    /**
+     * Plays the session.
+     *
+     * @param out where everything is shown
+     * @param colours whether {@code out} understands terminal colours
+     * @param clock the gateway's clock; the library reads the clock of the system
+     * @return whether every outcome was what it should be
+     */
+    public static boolean play(PrintStream out, boolean colours, Clock clock) {
+        Stage stage = new Stage(new Screen(out, colours), clock);
         DemoLogin.play(stage);
         DemoStocks.play(stage);
         DemoStockLists.play(stage);
         DemoFutures.play(stage);
         DemoAccount.play(stage);
         DemoCertificates.play(stage);
-        System.exit(stage.close() ? 0 : 1);
+        return stage.close();
     }
 }

@@ -22,7 +22,7 @@ final class DemoAccount {
                 (sequence, status) -> gatewayjni.QueryBankRemainEncode(
                         MARKET, PLATFORM, sequence, SERIAL, ADDRESS, BRANCH, IDENTITY, PASSWORD, status),
                 gatewayjni::QueryBankRemainDecode, 1);
-        stage.record(ResultLayout.BALANCE, ResultLayout.list(balance).get(0));
+        stage.record(ResultLayout.BALANCE, ResultLayout.list(balance));
         stage.field(ResultLayout.list(balance), 0, 4, "1250000");
         stage.ask("Change the password to one that is too short", change("abc"),
                 gatewayjni::ChangePasswordDecode, -1, "[GATEWAY]新密碼不符規定(E007)");

@@ -64,10 +64,11 @@ final class DemoFutures {
         submit("Buy a call spread: a combination of two options",
                 new Ticket(3, low, high, 2, 'F', 1, 1800000), 3, true);
         submit("Buy the calendar spread of two futures", spread, 4, false);
-        stage.note("The exchange fills one of F0001, two of F0002 and all of F0003.");
-        stage.gateway().fillFutures("F0001", 1, "22948", "");
-        stage.gateway().fillFutures("F0002", 2, "120.5", "");
-        stage.gateway().fillFutures("F0003", 1, "310", "130");
+        stage.exchange("The exchange fills one of F0001, two of F0002 and all of F0003.", () -> {
+            stage.gateway().fillFutures("F0001", 1, "22948", "");
+            stage.gateway().fillFutures("F0002", 2, "120.5", "");
+            stage.gateway().fillFutures("F0003", 1, "310", "130");
+        });
 
         stage.ask("Take one contract off the spread", order(spread.with(1, 250000), 'C', 4, false),
                 gatewayjni::FutSubmitOrderDecode, 1, acknowledged(4));
@@ -127,7 +128,7 @@ final class DemoFutures {
                 (sequence, status) -> gatewayjni.QueryFinanceEncode(
                         MARKET, PLATFORM, sequence, SERIAL, ADDRESS, BRANCH, IDENTITY, PASSWORD, 0, status),
                 gatewayjni::QueryFinanceDecode, 1);
-        stage.record(ResultLayout.MARGIN, ResultLayout.list(margin).get(0));
+        stage.record(ResultLayout.MARGIN, ResultLayout.list(margin));
     }
 
     private void positions() {

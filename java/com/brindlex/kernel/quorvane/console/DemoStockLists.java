@@ -35,7 +35,7 @@ final class DemoStockLists {
         String positions = stage.ask("Positions", positions(), gatewayjni::QueryInventoryDecode, 1);
         sections(stage, positions, 3, 1, 1, 1);
         String credit = stage.ask("Credit figures of 2330", credit("2330"), gatewayjni::QueryCreditInfoDecode, 1);
-        stage.record(ResultLayout.CREDIT, ResultLayout.record(credit).get(0));
+        stage.record(ResultLayout.CREDIT, ResultLayout.record(credit));
         stage.ask("Credit figures of a stock that has none", credit("6547"),
                 gatewayjni::QueryCreditInfoDecode, 1, "@@@@@@@!");
         String settled = stage.ask("Settlement of today", settlement("1", ""), gatewayjni::PaymentDecode, 1);
@@ -104,7 +104,7 @@ final class DemoStockLists {
                         BRANCH, IDENTITY, PASSWORD, "2317", stage.today(), 1, 1000, 20000, (byte) 'B', (byte) '0',
                         (byte) 1, (byte) 0, (byte) 0, (byte) 1, status),
                 gatewayjni::SubmitOrderDecode, 1);
-        stage.gateway().fillStock("A0001", 1000, 20000);
+        stage.exchange("The exchange fills it.", () -> stage.gateway().fillStock("A0001", 1000, 20000));
         String positions = stage.ask("Positions", positions(), gatewayjni::QueryInventoryDecodeJZG, 1);
         sections(stage, positions, 2, 1, 1);
         String settled = stage.ask("Settlement of today", settlement("1", ""), gatewayjni::PaymentDecodeJZG, 1);

@@ -64,10 +64,11 @@ final class DemoStocks {
                 new Ticket("2317", 'S', 2, 20100, CASH, LIMIT, LOTS, AT_ONCE), 6, '1');
         submit("Sell one lot of 0050",
                 new Ticket("0050", 'S', 1, 18500, CASH, LIMIT, LOTS, AT_ONCE), 7, '1');
-        stage.note("The exchange fills one lot of A0001 at 994.50 and all of A0007; it refuses A0006.");
-        stage.gateway().fillStock("A0001", LOT, 99450);
-        stage.gateway().fillStock("A0007", LOT, 18505);
-        stage.gateway().failStock("A0006", "交易所退單!");
+        stage.exchange("The exchange fills a lot of A0001 and all of A0007, and refuses A0006.", () -> {
+            stage.gateway().fillStock("A0001", LOT, 99450);
+            stage.gateway().fillStock("A0007", LOT, 18505);
+            stage.gateway().failStock("A0006", "交易所退單!");
+        });
     }
 
     private void submit(String title, Ticket t, int number, char accepted) {

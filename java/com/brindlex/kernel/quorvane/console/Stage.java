@@ -83,6 +83,7 @@ final class Stage {
         showFields(request);
         String reply = gateway.answer(request);
         screen.labelled("reply", Screen.Style.DIM, reply);
+        checkNames(Scene.ofRequest(WireField.cut(request)), WireField.cut(reply));
         String result = decoder.decode(reply, status);
         screen.labelled("result", status[0] == 1 ? Screen.Style.PLAIN : Screen.Style.BAD, result);
         screen.labelled(
@@ -109,10 +110,15 @@ final class Stage {
         expect(text.endsWith(message), message, text);
     }
 
-    /** Notes something that happens outside the device. */
-    void note(String text) {
+    /** Lets the exchange act, outside the device. */
+    void exchange(String text, Runnable action) {
         screen.line("");
         screen.line("  " + screen.styled(Screen.Style.DIM, "· " + text));
+        try {
+            action.run();
+        } catch (IllegalArgumentException impossible) {
+            expect(false, "orders that can be filled", impossible.getMessage());
+        }
     }
 
     /** Shows the records of a list as a table and checks how many there are. */
@@ -132,9 +138,10 @@ final class Stage {
     }
 
     /** Shows a single record as named values. */
-    void record(ResultLayout layout, List<String> record) {
+    void record(ResultLayout layout, List<List<String>> records) {
+        expect(records.size() == 1, "1 record", records.size() + " records");
         List<List<String>> items = new ArrayList<>();
-        List<String> values = layout.readable(List.of(record)).get(0);
+        List<String> values = records.isEmpty() ? List.of() : layout.readable(records).get(0);
         for (int i = 0; i < values.size(); i++) {
             if (layout.isMain(i)) {
                 items.add(List.of(layout.columns().get(i), values.get(i), ""));
@@ -160,10 +167,10 @@ final class Stage {
     private void showFields(String request) {
         List<WireField> fields = WireField.cut(request);
         Scene scene = Scene.ofRequest(fields);
+        checkNames(scene, fields);
         List<List<String>> rows = new ArrayList<>();
         for (WireField field : fields) {
             String name = FieldNames.name(scene, field.tag());
-            expect(name != null, "a name for tag " + field.tag(), "none");
             if (!wholeHeader && field.tag().equals(FieldNames.PAYLOAD)) {
                 screen.grid("fields", rows);
                 screen.labelled("signed", Screen.Style.PLAIN, field.value());
@@ -176,6 +183,15 @@ final class Stage {
             screen.texts(List.of("tag", "value as sent", "what it is"), rows);
         } else {
             screen.grid("fields", rows);
+        }
+    }
+
+    /** Every tag of the wire has a name; a transport marker has no tags. */
+    private void checkNames(Scene scene, List<WireField> fields) {
+        for (WireField field : fields) {
+            boolean named =
+                    FieldNames.name(scene, field.tag()) != null || field.value().startsWith("[");
+            expect(named, "a name for tag " + field.tag(), "none");
         }
     }
 
