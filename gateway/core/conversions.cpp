@@ -65,6 +65,14 @@ CTransDate::CTransDate(std::string_view date) : m_text(date) {
   m_text = {text.Text(), text.Length()};
 }
 
+int32_t RocToWesternDate(int32_t rocDate) {
+  return rocDate == 0 ? 0 : WrapAdd(rocDate, kRocDateOffset);
+}
+
+int32_t RocToWesternDate(std::string_view rocDate) {
+  return RocToWesternDate(ReadInt32(rocDate));
+}
+
 int32_t ScalePrice(std::string_view text, int decimals) {
   if (text.empty() || text.front() != '-') return Scale<Narrow>(text, decimals);
   const std::string_view magnitude = UpTo(From(text, 1), kNegativePriceChars);
@@ -84,11 +92,11 @@ void CGatewayPub::TransDate(char* date) {
 }
 
 int CGatewayPub::RocDateToStandardDate(int rocDate) {
-  return rocDate == 0 ? 0 : WrapAdd(rocDate, kRocDateOffset);
+  return RocToWesternDate(rocDate);
 }
 
 int CGatewayPub::RocDateToStandardDate(const char* rocDate) {
-  return RocDateToStandardDate(ReadInt32(AsText(rocDate)));
+  return RocToWesternDate(AsText(rocDate));
 }
 
 void CGatewayPub::SetPriceString(int value, int decimals, char* out, int outSize) {

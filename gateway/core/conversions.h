@@ -21,6 +21,10 @@ class CTransDate {
   std::string_view m_text;
 };
 
+// See CGatewayPub::RocDateToStandardDate.
+int32_t RocToWesternDate(int32_t rocDate);
+int32_t RocToWesternDate(std::string_view rocDate);
+
 // See CGatewayPub::GetPriceString and GetPriceString2.
 int32_t ScalePrice(std::string_view text, int decimals);
 int64_t ScaleAmount(std::string_view text, int decimals);

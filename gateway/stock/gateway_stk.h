@@ -5,6 +5,7 @@
 
 #include "gateway/core/gateway_pub.h"
 
+struct OrderForm;
 struct StockOrder;
 
 // A session object of CGatewayPub, with its contracts: who owns a returned text, what `*status`
@@ -89,6 +90,14 @@ class CGatewayStk : public CGatewayPub {
                       const char* period, const char* endDate, int* status);
   char* PaymentDecode(const char* reply, int* status);
   char* PaymentDecodeJZG(const char* reply, int* status);
+
+ private:
+  // The one road of the encoders that have a status.
+  char* EncodeOrder(const OrderForm& form, const StockOrder& order, int* status);
+
+  // Whether the gateway's answer refuses an order, or is none: then m_szBuffer tells it and the
+  // status is -1. Otherwise `outcome` is one of "STXY".
+  bool OrderRefused(std::string_view reply, char& outcome, int* status);
 };
 
 #endif  // QUORVANE_GATEWAY_STOCK_GATEWAY_STK_H_

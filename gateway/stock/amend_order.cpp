@@ -1,0 +1,136 @@
+// Cancellations and changes. Behind the header:
+//
+//   body      |10=|36=|46=|28=|29=|31=|32=  and by form 37, N6, 27, UT, 13
+//   payload   !!key_reference_side_code_quantity_, or a tag PL with the columns of a new order's
+//
+// The price goes out as a plain number of hundredths, and neither it nor the quantity is checked.
+#include "gateway/core/conversions.h"
+#include "gateway/core/protocol.h"
+#include "gateway/stock/gateway_stk.h"
+#include "gateway/stock/stock_order.h"
+
+namespace {
+
+// Buffer of one piece of a reference; a longer piece is dropped.
+constexpr size_t kReferenceSize = 40;
+
+// With the payload in tag PL the kinds 6 and 7 pass, too.
+constexpr NumberSet kTaggedKinds = SetOf(0, 1, 2, 3, 4, 5, 6, 7, 8);
+
+const char* FindFaultBehindKind(const StockOrder& order) {
+  if (!kTradeTypes.Has(order.tradeType)) return kTradeTypeError;
+  return IsStockCodeTooLong(order) ? kStockCodeTooLong : nullptr;
+}
+
+const char* FindFault(const StockOrder& order) {
+  return kOrderKinds.Has(order.kind) ? FindFaultBehindKind(order) : kOrderKindError;
+}
+
+const char* FindFaultTagged(const StockOrder& order) {
+  return kTaggedKinds.Has(order.kind) ? FindFaultBehindKind(order) : kOrderKindError;
+}
+
+// What names the order to the broker, and what names it to the gateway.
+struct Reference {
+  std::string_view order, gateway;
+};
+
+Reference SplitReference(const StockOrder& order) {
+  std::string_view rest = AsText(order.reference);
+  const std::string_view first = Bounded(TakePiece(rest, '&'), kReferenceSize);
+  return {first, Bounded(TakePiece(rest, '&'), kReferenceSize)};
+}
+
+// A body begins alike in every form; `rest` are the values of the format's own marks. One piece: a
+// side of NUL loses all that follows it.
+template <class Format, class... Rest>
+void WriteBody(CTextWriter& line, Format format, const StockOrder& order,
+               const Reference& reference, const Rest&... rest) {
+  line.Append(format, RocToWesternDate(AsText(order.date)), reference.order, reference.gateway,
+              order.tradeType, order.stockCode, SentPrice(order), order.side, rest...);
+}
+
+// Sends no quantity, and lots of 1000 whatever the order says.
+void WriteCancel(CTextWriter& line, const StockOrder& order, std::string_view key) {
+  const Reference reference = SplitReference(order);
+  WriteBody(line, WIRE("|10=%08d|36=%s|46=%s|28=%d|29=%s|31=%d|32=%c|N6=%d|27=%d|UT=1000|13=%c"),
+            order, reference, order.n6, order.kind, order.flag13);
+  line.Append(WIRE("!!%s_%s_%c_%s__"), key, reference.order, order.side, order.stockCode);
+}
+
+void WriteChange(CTextWriter& line, const StockOrder& order, std::string_view key) {
+  const Reference reference = SplitReference(order);
+  WriteBody(line,
+            WIRE("|10=%08d|36=%s|46=%s|28=%d|29=%s|31=%d|32=%c|37=%d|N6=%d|27=%d|UT=%d|13=%c"),
+            order, reference, SentQuantity(order), order.n6, order.kind, order.unit, order.flag13);
+  line.Append(WIRE("!!%s_%s_%c_%s_%d_"), key, reference.order, order.side, order.stockCode,
+              SentQuantity(order));
+}
+
+void WriteTaggedBody(CTextWriter& line, const StockOrder& order, const Reference& reference) {
+  WriteBody(line, WIRE("|10=%08d|36=%s|46=%s|28=%d|29=%s|31=%d|32=%c|37=%d|N6=%d|27=%d|UT=%d"),
+            order, reference, SentQuantity(order), order.n6, order.kind, order.unit);
+}
+
+// In tag PL the columns of order kind, price kind and price stay empty, for a cancellation the
+// quantity's, too.
+void WriteTaggedCancel(CTextWriter& line, const StockOrder& order, std::string_view key) {
+  const Reference reference = SplitReference(order);
+  WriteTaggedBody(line, order, reference);
+  line.Append(WIRE("|PL=S!!%s,%c,%s,,%d,,,,%s"), key, order.side, order.stockCode, order.tradeType,
+              reference.order);
+}
+
+void WriteTaggedChange(CTextWriter& line, const StockOrder& order, std::string_view key) {
+  const Reference reference = SplitReference(order);
+  WriteTaggedBody(line, order, reference);
+  line.Append(WIRE("|PL=S!!%s,%c,%s,,%d,,%d,,%s"), key, order.side, order.stockCode,
+              order.tradeType, SentQuantity(order), reference.order);
+}
+
+constexpr OrderForm kCancel = {'D', Payload::kBare, FindFault, WriteCancel};
+constexpr OrderForm kTaggedCancel = {'D', Payload::kTagged, FindFaultTagged, WriteTaggedCancel};
+constexpr OrderForm kChange = {'C', Payload::kBare, FindFault, WriteChange};
+constexpr OrderForm kTaggedChange = {'C', Payload::kTagged, FindFaultTagged, WriteTaggedChange};
+
+}  // namespace
+
+char* CGatewayStk::CancelOrderEncode(const char* branch, const char* identity, const char* password,
+                                     const char* stockCode, const char* date, const char* reference,
+                                     long quantity, long unit, long price, char side, char flag13,
+                                     char orderKind, char unread, char tradeType, char n6,
+                                     int* status) {
+  const StockOrder order(branch, identity, password, stockCode, date, reference, quantity, unit,
+                         price, side, flag13, orderKind, unread, tradeType, n6);
+  return EncodeOrder(kCancel, order, status);
+}
+
+char* CGatewayStk::CancelOrderEncode1(const char* branch, const char* identity,
+                                      const char* password, const char* stockCode, const char* date,
+                                      const char* reference, long quantity, long unit, long price,
+                                      char side, char flag13, char orderKind, char unread,
+                                      char tradeType, char n6, int* status) {
+  const StockOrder order(branch, identity, password, stockCode, date, reference, quantity, unit,
+                         price, side, flag13, orderKind, unread, tradeType, n6);
+  return EncodeOrder(kTaggedCancel, order, status);
+}
+
+char* CGatewayStk::ChangeOrderEncode(const char* branch, const char* identity, const char* password,
+                                     const char* stockCode, const char* date, const char* reference,
+                                     long quantity, long unit, long price, char side, char flag13,
+                                     char orderKind, char unread, char tradeType, char n6,
+                                     int* status) {
+  const StockOrder order(branch, identity, password, stockCode, date, reference, quantity, unit,
+                         price, side, flag13, orderKind, unread, tradeType, n6);
+  return EncodeOrder(kChange, order, status);
+}
+
+char* CGatewayStk::ChangeOrderEncode1(const char* branch, const char* identity,
+                                      const char* password, const char* stockCode, const char* date,
+                                      const char* reference, long quantity, long unit, long price,
+                                      char side, char flag13, char orderKind, char unread,
+                                      char tradeType, char n6, int* status) {
+  const StockOrder order(branch, identity, password, stockCode, date, reference, quantity, unit,
+                         price, side, flag13, orderKind, unread, tradeType, n6);
+  return EncodeOrder(kTaggedChange, order, status);
+}

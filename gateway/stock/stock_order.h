@@ -1,0 +1,87 @@
+// What one stock order is, and the forms that it is sent in.
+#ifndef QUORVANE_GATEWAY_STOCK_STOCK_ORDER_H_
+#define QUORVANE_GATEWAY_STOCK_STOCK_ORDER_H_
+
+#include "gateway/core/number_set.h"
+#include "gateway/core/text_writer.h"
+#include "gateway/stock/messages.h"
+
+// The arguments of one order by name. The host's bytes are unsigned numbers, but for the two that
+// are sent as characters. Texts are the host's and outlive the order.
+struct StockOrder {
+  StockOrder(const char* hostBranch, const char* hostIdentity, const char* hostPassword,
+             const char* hostStockCode, const char* hostDate, const char* hostReference,
+             long hostQuantity, long hostUnit, long hostPrice, char hostSide, char hostFlag13,
+             char hostKind, char hostPriceKind, char hostTradeType, char hostN6)
+      : branch(hostBranch),
+        identity(hostIdentity),
+        password(hostPassword),
+        stockCode(hostStockCode),
+        date(hostDate),
+        reference(hostReference),
+        quantity(static_cast<int>(hostQuantity)),
+        unit(static_cast<int>(hostUnit)),
+        price(static_cast<int>(hostPrice)),
+        side(hostSide),
+        flag13(hostFlag13),
+        kind(NumberOf(hostKind)),
+        priceKind(NumberOf(hostPriceKind)),
+        tradeType(NumberOf(hostTradeType)),
+        n6(NumberOf(hostN6)) {}
+
+  // The number of a host's byte.
+  static int NumberOf(char byte) { return static_cast<unsigned char>(byte); }
+
+  const char* branch;
+  const char* identity;
+  const char* password;
+  const char* stockCode;
+  const char* date;       // Republic of China calendar, or empty
+  const char* reference;  // the order to cancel or change; null in a new order
+  int quantity;           // lots, or shares of an odd lot
+  int unit;               // shares per lot
+  int price;              // hundredths
+  char side;
+  char flag13;
+  int kind;
+  int priceKind;
+  int tradeType;
+  int n6;
+};
+
+// Trade types: lots, an odd lot, lots at the session's fixed price.
+enum TradeType { kLots = 0, kOddLot = 2, kFixedPrice = 3 };
+
+inline constexpr NumberSet kTradeTypes = SetOf(kLots, kOddLot, kFixedPrice);
+inline constexpr NumberSet kOrderKinds = SetOf(0, 1, 2, 3, 4, 5, 8);
+
+inline constexpr size_t kStockCodeChars = 6;
+
+// What goes out for the quantity: shares.
+inline int SentQuantity(const StockOrder& order) {
+  return order.tradeType == kOddLot ? order.quantity : WrapMultiply(order.quantity, order.unit);
+}
+
+// What goes out for the price.
+inline int SentPrice(const StockOrder& order) {
+  return order.tradeType == kFixedPrice ? 0 : order.price;
+}
+
+inline bool IsStockCodeTooLong(const StockOrder& order) {
+  return AsText(order.stockCode).size() > kStockCodeChars;
+}
+
+// Where the signature payload goes: bare behind the last field, or into tag PL. Each has its order
+// header, whose order key opens the payload.
+enum class Payload { kBare, kTagged };
+
+// What one encoder sends. `fault` tells what keeps an order from being sent, null for nothing;
+// `write` appends body and payload to the header.
+struct OrderForm {
+  char function;
+  Payload payload;
+  const char* (*fault)(const StockOrder& order);
+  void (*write)(CTextWriter& line, const StockOrder& order, std::string_view key);
+};
+
+#endif  // QUORVANE_GATEWAY_STOCK_STOCK_ORDER_H_
