@@ -4,14 +4,18 @@
 
 #include <cstdint>
 
-// A set of numbers from 0 to 31.
+// A set of numbers from 0 to 30, or of all numbers there are.
 struct NumberSet {
   uint32_t bits;
 
+  static constexpr uint32_t kAll = 0xffffffff;
+
   constexpr bool Has(int number) const {
-    return number >= 0 && number < 32 && (bits >> number & 1) != 0;
+    return bits == kAll || (number >= 0 && number <= 30 && (bits >> number & 1) != 0);
   }
 };
+
+inline constexpr NumberSet kEveryNumber = {NumberSet::kAll};
 
 template <class... Numbers>
 constexpr NumberSet SetOf(Numbers... numbers) {

@@ -13,4 +13,23 @@ inline constexpr char kQuantityError[] = "[CLIENT] 委託數量不可小於0";
 // Queries that are not sent.
 inline constexpr char kDateError[] = "[CLIENT] 日期輸入錯誤";
 
+// States of an order.
+inline constexpr char kCancelledState[] = "已取消";
+inline constexpr char kProcessingState[] = "正在處理";
+inline constexpr char kReceivedState[] = "委託收到";
+inline constexpr char kFilledState[] = "已成交";
+inline constexpr char kFilledCancelledState[] = "部份成交，其餘已取消";
+inline constexpr char kPartlyFilledState[] = "部份成交";
+inline constexpr char kReservedState[] = "預約單";
+inline constexpr char kAcceptedState[] = "委託成功";
+inline constexpr char kReducedState[] = "已改量";
+inline constexpr char kFailedState[] = "委託失敗";
+inline constexpr char kWaitingState[] = "處理中";
+
+// Prices that are no number.
+inline constexpr char kMarketPrice[] = "市價";
+inline constexpr char kLimitDownPrice[] = "跌停價";
+inline constexpr char kFlatPrice[] = "平盤價";
+inline constexpr char kLimitUpPrice[] = "漲停價";
+
 #endif  // QUORVANE_GATEWAY_STOCK_MESSAGES_H_

@@ -7,9 +7,6 @@
 
 namespace {
 
-// Price kinds: the limit that the order names, or a price that the market names.
-enum PriceKind { kLimit = 0, kLimitDown = 1, kFlat = 5, kLimitUp = 9 };
-
 constexpr NumberSet kPriceKinds = SetOf(kLimit, kLimitDown, kFlat, kLimitUp);
 
 const char* FindFault(const StockOrder& order) {

@@ -26,6 +26,13 @@ inline constexpr OrderTypeRow kOrderTypeRows[] = {
     {SetOf(2, 4), SetOf(3), 13, 14},
 };
 
+// Kinds 5 and 8 in the order book and the fills.
+inline constexpr OrderTypeRow kLiveOrderTypeRows[] = {
+    {SetOf(5), kEveryNumber, 38, 38},
+    {SetOf(8), SetOf(3), 40, 41},
+    {SetOf(8), kEveryNumber, 33, 34},
+};
+
 // The code of the first row that names such an order, or kNoOrderType.
 template <size_t N>
 constexpr int FindOrderType(const OrderTypeRow (&rows)[N], int kind, int tradeType, bool buys) {
@@ -33,6 +40,12 @@ constexpr int FindOrderType(const OrderTypeRow (&rows)[N], int kind, int tradeTy
     if (row.kinds.Has(kind) && row.tradeTypes.Has(tradeType)) return buys ? row.buy : row.other;
   }
   return kNoOrderType;
+}
+
+// The code of an order of the day or of its fills.
+constexpr int FindLiveOrderType(int kind, int tradeType, bool buys) {
+  const int code = FindOrderType(kOrderTypeRows, kind, tradeType, buys);
+  return code != kNoOrderType ? code : FindOrderType(kLiveOrderTypeRows, kind, tradeType, buys);
 }
 
 #endif  // QUORVANE_GATEWAY_STOCK_ORDER_TYPE_CODES_H_

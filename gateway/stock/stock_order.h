@@ -52,6 +52,9 @@ struct StockOrder {
 // Trade types: lots, an odd lot, lots at the session's fixed price.
 enum TradeType { kLots = 0, kOddLot = 2, kFixedPrice = 3 };
 
+// Price kinds: the limit that the order names, or a price that the market names.
+enum PriceKind { kLimit = 0, kLimitDown = 1, kFlat = 5, kLimitUp = 9 };
+
 inline constexpr NumberSet kTradeTypes = SetOf(kLots, kOddLot, kFixedPrice);
 inline constexpr NumberSet kOrderKinds = SetOf(0, 1, 2, 3, 4, 5, 8);
 

@@ -1,0 +1,197 @@
+// The orders of a day.
+//
+//   record   |46=number|36=reference|27=kind|28=trade type|32=side|29=code|70=ordered|41=, 37=
+//            cancelled|47=filled|39=state|K1=text|N6=|31=price|M8=price kind|22=time|21=, 44= date
+//            |JV=may be changed
+//   result   count ! ( 46 @ 36 @ type code @ 29 @ ordered @ state @ filled @ cancelled @ price @
+//            time @ 21 @ 44 @ N6 @ change flag ! )*
+//
+// An order whose type has no code fails the whole list.
+#include "gateway/core/conversions.h"
+#include "gateway/stock/gateway_stk.h"
+#include "gateway/stock/messages.h"
+#include "gateway/stock/order_type_codes.h"
+#include "gateway/stock/stock_list.h"
+#include "gateway/stock/stock_order.h"
+
+namespace {
+
+enum Field {
+  kNumber = kOwnFields,
+  kReference,
+  kKind,
+  kTradeType,
+  kSide,
+  kStockCode,
+  kOrdered,
+  kCancelled,
+  kReduced,
+  kFilled,
+  kState,
+  kText,
+  kN6,
+  kPrice,
+  kPriceKind,
+  kTime,
+  kEntryDate,
+  kOrderDate,
+  kChangeable
+};
+
+constexpr CTagTable kTags({{"67"}, {"68"}, {"M2"}, {"46"}, {"36"}, {"27"}, {"28"}, {"32"},
+                           {"29"}, {"70"}, {"41"}, {"37"}, {"47"}, {"39"}, {"K1"}, {"N6"},
+                           {"31"}, {"M8"}, {"22"}, {"21"}, {"44"}, {"JV"}});
+static_assert(OpensListTable(kTags), "the list frame reads its rows");
+
+constexpr size_t kTextSize = 200;  // of the gateway's text
+
+// What the gateway's text says of an order that it did not fail.
+constexpr std::string_view kAllCancelledText = "全部取消";
+constexpr std::string_view kSentText = "委託已傳送，等待接收回報！";
+
+// What the text of a failed order says while it waits, on the market that shows it.
+constexpr std::string_view kWaitingText = "WAIT ";
+constexpr int kWaitingMarket = 8;
+
+// Kinds that the order book alone knows.
+constexpr OrderTypeRow kBookRows[] = {
+    {SetOf(6), kEveryNumber, 30, 30},
+    {SetOf(7), kEveryNumber, 31, 31},
+};
+
+int TypeCodeOf(const CRecord& record) {
+  const int kind = record.Number(kKind, kFieldSize);
+  const int tradeType = record.Number(kTradeType, kFieldSize);
+  const bool buys = record.Text(kSide, kFieldSize) == "B";
+  const int code = FindLiveOrderType(kind, tradeType, buys);
+  return code != kNoOrderType ? code : FindOrderType(kBookRows, kind, tradeType, buys);
+}
+
+struct Quantities {
+  int ordered, filled, cancelled;
+};
+
+Quantities QuantitiesOf(const CRecord& record) {
+  return {record.Number(kOrdered, kFieldSize), record.Number(kFilled, kFieldSize),
+          WrapAdd(record.Number(kReduced, kFieldSize), record.Number(kCancelled, kFieldSize))};
+}
+
+// The market's number says whose wording its users know for an order on its way.
+bool CallsSentOrdersReceived(int market) {
+  return market == 3 || market == 103;
+}
+
+// The state of an order that did not fail: by the gateway's text, else by what became of it.
+const char* StateOf(const Quantities& order, std::string_view text, bool reserved, int market) {
+  if (text == kAllCancelledText) return kCancelledState;
+  if (text == kSentText) {
+    return CallsSentOrdersReceived(market) ? kReceivedState : kProcessingState;
+  }
+  if (order.cancelled == order.ordered) return kCancelledState;
+  if (order.filled == 0) {
+    if (order.cancelled != 0) return kReducedState;
+    return reserved ? kReservedState : kAcceptedState;
+  }
+  if (order.ordered == order.filled) return kFilledState;
+  if (order.ordered == WrapAdd(order.cancelled, order.filled)) return kFilledCancelledState;
+  return kPartlyFilledState;
+}
+
+// The text of a failed order, with no '!' that would end the record; empty for any other order.
+class CFailure {
+ public:
+  explicit CFailure(const CRecord& record) {
+    if (record.Text(kState, kFieldSize) != "E") return;
+    for (const char c : record.Text(kText, kTextSize)) {
+      m_szText[m_nLength++] = c == '!' ? ' ' : c;
+    }
+  }
+
+  std::string_view Text() const { return {m_szText, m_nLength}; }
+
+ private:
+  char m_szText[kTextSize];
+  size_t m_nLength = 0;
+};
+
+void AppendState(CResultText& list, const CRecord& record, const Quantities& order,
+                 const CFailure& failure, int market) {
+  if (record.Text(kState, kFieldSize) != "E") {
+    const bool reserved = record.Text(kN6, kFieldSize) == "0";
+    list.AppendText(StateOf(order, record.Text(kText, kTextSize), reserved, market));
+  } else if (market == kWaitingMarket && failure.Text() == kWaitingText) {
+    list.AppendText(kWaitingState);
+  } else if (!failure.Text().empty()) {
+    list.Append(WIRE("%s&%s"), kFailedState, failure.Text());
+  }
+}
+
+void AppendPrice(CResultText& list, const CRecord& record) {
+  const int price = ScalePrice(record.Text(kPrice, kFieldSize), 2);
+  switch (record.Number(kPriceKind, kFieldSize)) {
+    case kLimitDown:
+      return list.AppendText(kLimitDownPrice);
+    case kFlat:
+      return list.AppendText(kFlatPrice);
+    case kLimitUp:
+      return list.AppendText(kLimitUpPrice);
+    default:
+      if (price == 0) return list.AppendText(kMarketPrice);
+      return list.Append(WIRE("%d"), price);
+  }
+}
+
+// 1: the order can be changed, 2: it cannot, empty: nothing is known.
+const char* ChangeFlagOf(const CRecord& record, const CFailure& failure) {
+  const std::string_view flag = record.Text(kChangeable, kFieldSize);
+  if (flag == "Y") return "1";
+  if (flag == "N") return "2";
+  return failure.Text().empty() ? "" : "2";
+}
+
+void AppendOrder(CResultText& list, const CRecord& record, int typeCode, int market) {
+  const Quantities order = QuantitiesOf(record);
+  const CFailure failure(record);
+  list.Append(WIRE("%s@%s@%d@%s@%d@"), record.Text(kNumber, kFieldSize),
+              record.Text(kReference, kFieldSize), typeCode, record.Text(kStockCode, kFieldSize),
+              order.ordered);
+  AppendState(list, record, order, failure, market);
+  list.Append(WIRE("@%d@%d@"), order.filled, order.cancelled);
+  AppendPrice(list, record);
+  list.Append(WIRE("@%s@%s@%s@%s@%s!"), FirstSix(record.Text(kTime, kFieldSize)),
+              CTransDate(record.Text(kEntryDate, kFieldSize)).Text(),
+              CTransDate(record.Text(kOrderDate, kFieldSize)).Text(), record.Text(kN6, kFieldSize),
+              ChangeFlagOf(record, failure));
+}
+
+}  // namespace
+
+char* CGatewayStk::QueryOrderEncode(const char* branch, const char* identity, const char* password,
+                                    const char* date, int tradeType, int* status) {
+  *status = 1;
+  CTextWriter line = StartRequest();
+  if (!WriteQueryHead(line, branch, identity, password)) {
+    *status = -1;
+    return line.Text();
+  }
+  if (AsText(date).empty()) return Fail(line, status, kDateError);
+  line.Append(WIRE("|FUNC=2|SDATE=%s|EDATE=%s|28=%d|01=\n"), date, date, tradeType);
+  return FinishEscaped(line, status, kBadParameters);
+}
+
+char* CGatewayStk::QueryOrderDecode(const char* reply, int* status) {
+  *status = 1;
+  const std::string_view text = AsText(reply);
+  LogReply("QueryOrderDecode", text);
+  if (TransportFailed(text, status)) return m_szBuffer;
+  CReplyList orders(text, kTags, kStockListShape);
+  if (char* const answer = AnswerWithoutData(orders, "0!", status)) return answer;
+  CResultText list({m_pData, m_nDataSize, m_nDataLen}, text.size());
+  int count = 0;
+  for (; orders.NextData(); ++count) {
+    const int typeCode = TypeCodeOf(orders.Record());
+    if (typeCode == kNoOrderType) return Fail(kOrderKindError, status);
+    AppendOrder(list, orders.Record(), typeCode, m_nMarket);
+  }
+  return FinishList(list, count, status);
+}
