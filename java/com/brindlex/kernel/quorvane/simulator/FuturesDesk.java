@@ -9,7 +9,7 @@ import java.util.List;
 /** Takes futures and options orders, changes and cancels them, and lets the exchange fill them. */
 final class FuturesDesk {
     private final CustomerBook customers;
-    private final List<FuturesOrder> orders = new ArrayList<>();
+    private final OrderBook<FuturesOrder> orders = new OrderBook<>();
     private final List<FuturesFill> fills = new ArrayList<>();
     private final FuturesLists lists;
 
@@ -34,7 +34,7 @@ final class FuturesDesk {
 
     private String enter(Request request, Account account, LocalDateTime now) throws Refusal {
         FuturesRules.check(request);
-        FuturesOrder order = new FuturesOrder(request, account, orders.size() + 1, now);
+        FuturesOrder order = new FuturesOrder(request, account, orders.next(), now);
         if (lists.margin(account).needed(order) > lists.margin(account).available()) {
             throw Refusal.rejected("保證金不足");
         }
@@ -44,11 +44,7 @@ final class FuturesDesk {
 
     private String change(Request request, Account account, LocalDateTime now) throws Refusal {
         FuturesRules.check(request);
-        FuturesOrder order = byNumber(request.get("36"));
-        if (order == null || order.account != account
-                || !order.gatewayNumber.equals(request.get("46"))) {
-            throw Refusal.rejected("查無此委託");
-        }
+        FuturesOrder order = orders.named(request, account);
         if (!order.leg1.sameContract(new FuturesLeg(request, true))) {
             throw Refusal.rejected("與原委託不符");
         }
@@ -78,15 +74,6 @@ final class FuturesDesk {
         }
     }
 
-    private FuturesOrder byNumber(String number) {
-        for (FuturesOrder order : orders) {
-            if (order.number.equals(number)) {
-                return order;
-            }
-        }
-        return null;
-    }
-
     private static String accepted(Request request, FuturesOrder order, LocalDateTime now) {
         return Reply.order(request).field("39", " ").field("19", order.n6.equals("0") ? 'X' : 'S')
                 .field("46", order.gatewayNumber).field("44", Texts.date(now.toLocalDate()))
@@ -94,7 +81,7 @@ final class FuturesDesk {
     }
 
     void fill(String number, long contracts, String price1, String price2, LocalDateTime at) {
-        FuturesOrder order = existing(number);
+        FuturesOrder order = orders.existing(number);
         boolean whole = contracts == order.open() || !order.fillOrKill.equals("1");
         if (contracts <= 0 || contracts > order.open() || !whole) {
             throw new IllegalArgumentException("the order cannot be filled so: " + number);
@@ -108,14 +95,6 @@ final class FuturesDesk {
     }
 
     void fail(String number, String text) {
-        existing(number).fail(text);
-    }
-
-    private FuturesOrder existing(String number) {
-        FuturesOrder order = byNumber(number);
-        if (order == null) {
-            throw new IllegalArgumentException("no such order: " + number);
-        }
-        return order;
+        orders.existing(number).fail(text);
     }
 }

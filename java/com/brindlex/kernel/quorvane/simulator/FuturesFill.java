@@ -1,7 +1,6 @@
 package com.brindlex.kernel.quorvane.simulator;
 
 import java.math.BigDecimal;
-import java.time.LocalDate;
 import java.time.LocalDateTime;
 
 /** One fill of a futures order: contracts and the price of each leg. */
@@ -22,11 +21,6 @@ final class FuturesFill {
         this.price1 = price1;
         this.price2 = price2;
         this.at = at;
-    }
-
-    boolean within(LocalDate first, LocalDate last) {
-        LocalDate day = at.toLocalDate();
-        return !day.isBefore(first) && !day.isAfter(last);
     }
 
     void write(Reply reply) {

@@ -37,6 +37,10 @@ final class FuturesLeg {
         this.side = side;
     }
 
+    boolean bindsMargin() {
+        return !product.option || side == 'S';
+    }
+
     FuturesLeg opposite() {
         return new FuturesLeg(this, side == 'B' ? 'S' : 'B');
     }

@@ -6,20 +6,21 @@ import java.util.List;
 
 /** Answers order book, fills, positions and margin of a futures account. */
 final class FuturesLists {
-    private final List<FuturesOrder> orders;
+    private final OrderBook<FuturesOrder> orders;
     private final List<FuturesFill> fills;
-    private final LocalDate today;
+    private final Period session;
 
-    FuturesLists(List<FuturesOrder> orders, List<FuturesFill> fills, LocalDate today) {
+    FuturesLists(OrderBook<FuturesOrder> orders, List<FuturesFill> fills, LocalDate today) {
         this.orders = orders;
         this.fills = fills;
-        this.today = today;
+        this.session = new Period(today, LocalDate.MAX);
     }
 
     String answer(Request request, Account account) throws Refusal {
         switch (request.kind()) {
             case FUTURES_ORDER_BOOK:
-                return orderBook(request, account);
+                request.number("28");
+                return orders.list(request, account, Period.ofWestern(request));
             case FUTURES_FILLS:
                 return fillList(request, account);
             case FUTURES_POSITIONS:
@@ -34,38 +35,15 @@ final class FuturesLists {
 
     FuturesMargin margin(Account account) {
         return new FuturesMargin(
-                openPositions(account), fillsOf(account, LocalDate.MIN, LocalDate.MAX));
-    }
-
-    private String orderBook(Request request, Account account) throws Refusal {
-        LocalDate first = westernDate(request, "SDATE");
-        LocalDate last = westernDate(request, "EDATE");
-        request.number("28");
-        Reply reply = Reply.query(request);
-        for (FuturesOrder order : orders) {
-            LocalDate day = order.entered.toLocalDate();
-            if (order.account == account && !day.isBefore(first) && !day.isAfter(last)) {
-                order.write(reply);
-            }
-        }
-        return reply.list();
+                openPositions(account), fillsOf(account, session));
     }
 
     private String fillList(Request request, Account account) throws Refusal {
-        LocalDate first = westernDate(request, "SDATE");
-        LocalDate last = westernDate(request, "EDATE");
         Reply reply = Reply.query(request);
-        for (FuturesFill fill : fillsOf(account, first, last)) {
+        for (FuturesFill fill : fillsOf(account, Period.ofWestern(request))) {
             fill.write(reply);
         }
         return reply.list();
-    }
-
-    private static LocalDate westernDate(Request request, String tag) throws Refusal {
-        if (request.get(tag).length() != 8) {
-            throw Refusal.malformed(tag);
-        }
-        return Texts.date(request.get(tag), tag);
     }
 
     private String positions(Request request, Account account) throws Refusal {
@@ -76,10 +54,10 @@ final class FuturesLists {
         return reply.list();
     }
 
-    private List<FuturesFill> fillsOf(Account account, LocalDate first, LocalDate last) {
+    private List<FuturesFill> fillsOf(Account account, Period period) {
         List<FuturesFill> own = new ArrayList<>();
         for (FuturesFill fill : fills) {
-            if (fill.order.account == account && fill.within(first, last)) {
+            if (fill.order.account == account && period.contains(fill.at)) {
                 own.add(fill);
             }
         }
@@ -89,7 +67,7 @@ final class FuturesLists {
     /** Plays the session's fills: the other side closes first, what is left opens or adds. */
     private List<FuturesPosition> openPositions(Account account) {
         List<FuturesPosition> open = new ArrayList<>();
-        for (FuturesFill fill : fillsOf(account, today, LocalDate.MAX)) {
+        for (FuturesFill fill : fillsOf(account, session)) {
             long left = fill.contracts;
             for (FuturesPosition position : open) {
                 if (position.opposite(fill)) {

@@ -29,9 +29,7 @@ final class FuturesMargin {
 
     /** Margin that an order would bind if it were filled whole. */
     long needed(FuturesOrder order) {
-        boolean binds = !order.leg1.product.option || order.leg1.side == 'S'
-                || order.leg2 != null && order.leg2.side == 'S';
-        return binds ? order.ordered * order.leg1.product.margin : 0;
+        return order.bindsMargin() ? order.ordered * order.leg1.product.margin : 0;
     }
 
     String reply(Request request) {

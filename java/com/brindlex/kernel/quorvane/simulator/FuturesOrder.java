@@ -2,62 +2,43 @@ package com.brindlex.kernel.quorvane.simulator;
 
 import java.time.LocalDateTime;
 
-/** A futures or options order in the broker's book, with one leg or two. */
-final class FuturesOrder {
+/** A futures or options order, with one leg or two. Quantities are contracts. */
+final class FuturesOrder extends BookedOrder {
+    private static final int FIRST_GATEWAY_NUMBER = 5000000;
     private static final String NO_PRICE = "0.0000";
 
-    final Account account;
-    final String number;
-    final String gatewayNumber;
     final FuturesLeg leg1;
 
     /** The second leg, or null. */
     final FuturesLeg leg2;
 
-    final int priceType;
-    final long ordered;
-    final String w3;
-    final String fillOrKill;
-    final String immediate;
     final String n6;
-    final LocalDateTime entered;
+    final String fillOrKill;
     String price;
-    long filled;
-    long reduced;
-    long cancelled;
-    private String failure = "";
+    private final int priceType;
+    private final String w3;
+    private final String immediate;
 
     FuturesOrder(Request request, Account account, int sequence, LocalDateTime now) throws Refusal {
-        this.account = account;
-        this.number = String.format("F%04d", sequence);
-        this.gatewayNumber = String.format("%010d", 5000000 + sequence);
+        super(account, 'F', sequence, FIRST_GATEWAY_NUMBER + sequence, request.number("30"), now);
         this.leg1 = new FuturesLeg(request, true);
         this.leg2 = request.has("EL") ? new FuturesLeg(request, false) : null;
         this.priceType = (int) request.number("27");
-        this.ordered = request.number("30");
         this.w3 = request.get("W3");
         this.fillOrKill = request.get("O4");
         this.immediate = request.get("V5");
         this.n6 = request.get("N6");
         this.price = priceType == 1 || priceType == 3 ? NO_PRICE : request.get("31");
-        this.entered = now;
-    }
-
-    long open() {
-        return failed() ? 0 : ordered - filled - reduced - cancelled;
-    }
-
-    boolean failed() {
-        return !failure.isEmpty();
-    }
-
-    void fail(String text) {
-        failure = text;
     }
 
     /** Whether what is not filled at once is cancelled (immediate or cancel, fill or kill). */
     boolean atOnce() {
         return immediate.equals("1") || fillOrKill.equals("1");
+    }
+
+    /** Whether holding the order binds margin: futures and sold options do. */
+    boolean bindsMargin() {
+        return leg1.bindsMargin() || leg2 != null && leg2.bindsMargin();
     }
 
     /**
@@ -79,18 +60,13 @@ final class FuturesOrder {
                 .field("MT", "0");
     }
 
-    /** Writes the order as a record of the order book. */
+    @Override
     void write(Reply reply) {
         writeCommon(reply, reduced);
-        reply.field("O4", fillOrKill)
-                .field("V5", immediate)
-                .field("41", cancelled)
-                .field("47", filled)
-                .field("39", failed() ? "E" : " ")
-                .field("K1", failure)
-                .field("27", priceType)
-                .field("N6", n6)
-                .field("JV", open() > 0 ? "Y" : "N")
+        reply.field("O4", fillOrKill).field("V5", immediate)
+                .field("41", cancelled).field("47", filled)
+                .field("39", failed() ? "E" : " ").field("K1", failure())
+                .field("27", priceType).field("N6", n6).field("JV", open() > 0 ? "Y" : "N")
                 .close();
     }
 }

@@ -68,8 +68,7 @@ final class FuturesPosition {
 
     /** Margin that the position binds: futures and sold options do, a pair binds one leg's. */
     BigDecimal margin() {
-        boolean binds =
-                !leg1.product.option || leg1.side == 'S' || leg2 != null && leg2.side == 'S';
+        boolean binds = leg1.bindsMargin() || leg2 != null && leg2.bindsMargin();
         return BigDecimal.valueOf(binds ? contracts * leg1.product.margin : 0);
     }
 

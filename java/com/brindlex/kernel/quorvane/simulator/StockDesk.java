@@ -7,11 +7,9 @@ import java.util.List;
 
 /** Takes stock orders, changes and cancels them, and lets the exchange fill them. */
 final class StockDesk {
-    private static final int MAX_NUMBER = 9999;
-
     private final CustomerBook customers;
     private final StockLists lists;
-    private final List<StockOrder> orders = new ArrayList<>();
+    private final OrderBook<StockOrder> orders = new OrderBook<>();
     private final List<StockFill> fills = new ArrayList<>();
 
     StockDesk(CustomerBook customers, Brokerage brokerage, LocalDate today) {
@@ -31,10 +29,10 @@ final class StockDesk {
                 return accepted(request, "", 'S', now);
             case STOCK_CANCEL:
             case STOCK_CANCEL_1:
-                return cancel(request, named(request, party.account), now);
+                return cancel(request, orders.named(request, party.account), now);
             case STOCK_CHANGE:
             case STOCK_CHANGE_1:
-                return reduce(request, named(request, party.account), now);
+                return reduce(request, orders.named(request, party.account), now);
             default:
                 return lists.answer(request, party.account, now.toLocalDate());
         }
@@ -42,10 +40,7 @@ final class StockDesk {
 
     private String enter(Request request, Account account, LocalDateTime now) throws Refusal {
         Stock stock = StockRules.checkNew(request);
-        if (orders.size() == MAX_NUMBER) {
-            throw Refusal.rejected("委託書號已滿");
-        }
-        StockOrder order = new StockOrder(request, account, stock, orders.size() + 1, now);
+        StockOrder order = new StockOrder(request, account, stock, orders.next(), now);
         boolean covered = order.kind != 0 || order.side == 'B'
                 || order.ordered <= lists.sellable(account, stock.code);
         if (!covered) {
@@ -75,31 +70,13 @@ final class StockDesk {
         return accepted(request, order.gatewayNumber, 'S', now);
     }
 
-    private StockOrder named(Request request, Account account) throws Refusal {
-        StockOrder order = byNumber(request.get("36"));
-        if (order == null || order.account != account
-                || !order.gatewayNumber.equals(request.get("46"))) {
-            throw Refusal.rejected("查無此委託");
-        }
-        return order;
-    }
-
-    private StockOrder byNumber(String number) {
-        for (StockOrder order : orders) {
-            if (order.number.equals(number)) {
-                return order;
-            }
-        }
-        return null;
-    }
-
     private static String accepted(Request request, String number, char code, LocalDateTime now) {
         return Reply.order(request).field("39", " ").field("19", code).field("46", number)
                 .field("44", Texts.date(now.toLocalDate())).field("K1", "").text();
     }
 
     void fill(String number, long shares, long price, LocalDateTime at) {
-        StockOrder order = existing(number);
+        StockOrder order = orders.existing(number);
         boolean worse = order.limit() != 0
                 && (order.side == 'B' ? price > order.limit() : price < order.limit());
         if (shares <= 0 || shares > order.open() || worse) {
@@ -110,14 +87,6 @@ final class StockDesk {
     }
 
     void fail(String number, String text) {
-        existing(number).fail(text);
-    }
-
-    private StockOrder existing(String number) {
-        StockOrder order = byNumber(number);
-        if (order == null) {
-            throw new IllegalArgumentException("no such order: " + number);
-        }
-        return order;
+        orders.existing(number).fail(text);
     }
 }

@@ -1,6 +1,5 @@
 package com.brindlex.kernel.quorvane.simulator;
 
-import java.time.LocalDate;
 import java.time.LocalDateTime;
 
 /** One fill of a stock order, with the money that it moves. */
@@ -46,11 +45,6 @@ final class StockFill {
     /** Whether the fill belongs to a short sale (order kinds 2 and 4). */
     boolean isShort() {
         return order.kind == 2 || order.kind == 4;
-    }
-
-    boolean within(LocalDate first, LocalDate last) {
-        LocalDate day = at.toLocalDate();
-        return !day.isBefore(first) && !day.isAfter(last);
     }
 
     /** Writes the fill as a record of the fill list. */

@@ -56,10 +56,10 @@ final class StockHoldings {
         }
     }
 
-    private final LocalDate today;
+    private final Period session;
 
     StockHoldings(LocalDate today) {
-        this.today = today;
+        this.session = new Period(today, LocalDate.MAX);
     }
 
     /** The account's holdings now; the sample account opens with three stocks. */
@@ -71,7 +71,7 @@ final class StockHoldings {
             holdings.put("2330", new Holding().opening(0, 0, 1000, 0));
         }
         for (StockFill fill : fills) {
-            if (fill.order.account == account && fill.within(today, LocalDate.MAX)) {
+            if (fill.order.account == account && session.contains(fill.at)) {
                 holdings.computeIfAbsent(fill.order.stock.code, code -> new Holding()).apply(fill);
             }
         }

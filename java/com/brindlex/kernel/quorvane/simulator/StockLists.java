@@ -6,15 +6,14 @@ import java.util.Map;
 
 /** Answers order book, fills, positions, credit and settlement of a securities account. */
 final class StockLists {
-    private static final String ALL_TRADE_TYPES = "0";
     private static final long MARGIN_QUOTA = 500;
 
-    private final List<StockOrder> orders;
+    private final OrderBook<StockOrder> orders;
     private final List<StockFill> fills;
     private final StockHoldings holdings;
     private final Brokerage brokerage;
 
-    StockLists(List<StockOrder> orders, List<StockFill> fills, StockHoldings holdings,
+    StockLists(OrderBook<StockOrder> orders, List<StockFill> fills, StockHoldings holdings,
             Brokerage brokerage) {
         this.orders = orders;
         this.fills = fills;
@@ -25,7 +24,8 @@ final class StockLists {
     String answer(Request request, Account account, LocalDate today) throws Refusal {
         switch (request.kind()) {
             case STOCK_ORDER_BOOK:
-                return orderBook(request, account);
+                request.number("28");
+                return orders.list(request, account, Period.of(request));
             case STOCK_FILLS:
                 return fillList(request, account);
             case STOCK_POSITIONS:
@@ -50,42 +50,18 @@ final class StockLists {
         return shares;
     }
 
-    private String orderBook(Request request, Account account) throws Refusal {
-        LocalDate first = Texts.date(request.get("SDATE"), "SDATE");
-        LocalDate last = Texts.date(request.get("EDATE"), "EDATE");
-        request.number("28");
-        Reply reply = Reply.query(request);
-        for (StockOrder order : orders) {
-            LocalDate day = order.entered.toLocalDate();
-            boolean wanted = request.get("28").equals(ALL_TRADE_TYPES)
-                    || request.get("28").equals(String.valueOf(order.tradeType));
-            if (order.account == account && wanted && !day.isBefore(first) && !day.isAfter(last)) {
-                order.write(reply);
-            }
-        }
-        return reply.list();
-    }
-
     private String fillList(Request request, Account account) throws Refusal {
         if (!request.get("57").equals("2")) {
             throw Refusal.malformed("57");
         }
-        LocalDate first = westernDate(request, "SDATE");
-        LocalDate last = westernDate(request, "EDATE");
+        Period period = Period.ofWestern(request);
         Reply reply = Reply.query(request);
         for (StockFill fill : fills) {
-            if (fill.order.account == account && fill.within(first, last)) {
+            if (fill.order.account == account && period.contains(fill.at)) {
                 fill.write(reply);
             }
         }
         return reply.list();
-    }
-
-    private static LocalDate westernDate(Request request, String tag) throws Refusal {
-        if (request.get(tag).length() != 8) {
-            throw Refusal.malformed(tag);
-        }
-        return Texts.date(request.get(tag), tag);
     }
 
     private String positions(Request request, Account account) throws Refusal {
@@ -119,18 +95,12 @@ final class StockLists {
         if (!request.get("H4").equals("1")) {
             throw Refusal.malformed("H4");
         }
-        LocalDate first;
-        LocalDate last;
-        if (request.get("SDATE").length() == 1) {
-            first = today.minusDays(daysBack(request));
-            last = today;
-        } else {
-            first = Texts.date(request.get("SDATE"), "SDATE");
-            last = Texts.date(request.get("EDATE"), "EDATE");
-        }
+        Period period = request.get("SDATE").length() == 1
+                ? new Period(today.minusDays(daysBack(request)), today)
+                : Period.of(request);
         Reply reply = Reply.query(request);
         for (StockFill fill : fills) {
-            if (fill.order.account == account && fill.within(first, last)) {
+            if (fill.order.account == account && period.contains(fill.at)) {
                 fill.writeSettlement(reply, brokerage);
             }
         }

@@ -3,58 +3,30 @@ package com.brindlex.kernel.quorvane.simulator;
 import java.math.BigDecimal;
 import java.time.LocalDateTime;
 
-/** A stock order in the broker's book. Quantities are shares, prices hundredths. */
-final class StockOrder {
+/** A stock order. Quantities are shares, prices hundredths. */
+final class StockOrder extends BookedOrder {
     private static final String TAKEN = "委託成功";
 
-    final Account account;
-    final String number;
-    final String gatewayNumber;
     final Stock stock;
     final int kind;
     final int tradeType;
     final char side;
-    final long ordered;
-    final int unit;
-    final int priceKind;
+    final int n6;
+    private final int priceKind;
 
     /** Limit price text; empty when the price kind or the trade type names the price. */
-    final String price;
-
-    final int n6;
-    final LocalDateTime entered;
-    long filled;
-    long reduced;
-    long cancelled;
-    private String failure = "";
+    private final String price;
 
     StockOrder(Request request, Account account, Stock stock, int sequence, LocalDateTime now)
             throws Refusal {
-        this.account = account;
-        this.number = String.format("A%04d", sequence);
-        this.gatewayNumber = String.format("%010d", sequence);
+        super(account, 'A', sequence, sequence, request.number("30"), now);
         this.stock = stock;
         this.kind = (int) request.number("27");
         this.tradeType = (int) request.number("28");
         this.side = request.letter("32", "BS");
-        this.ordered = request.number("30");
-        this.unit = (int) request.number("UT");
         this.priceKind = request.get("M8").isEmpty() ? 0 : (int) request.number("M8");
         this.price = tradeType == 3 || priceKind != 0 ? "" : request.get("31");
         this.n6 = (int) request.number("N6");
-        this.entered = now;
-    }
-
-    long open() {
-        return failed() ? 0 : ordered - filled - reduced - cancelled;
-    }
-
-    boolean failed() {
-        return !failure.isEmpty();
-    }
-
-    void fail(String text) {
-        failure = text;
     }
 
     /** The price that a fill must not be worse than, in hundredths; 0 when there is no limit. */
@@ -62,14 +34,14 @@ final class StockOrder {
         return price.isEmpty() ? 0 : new BigDecimal(price).movePointRight(2).longValueExact();
     }
 
-    /** Writes the order as a record of the order book. */
+    @Override
     void write(Reply reply) {
         reply.record()
                 .field("46", gatewayNumber).field("36", number)
                 .field("27", kind).field("28", tradeType).field("32", side)
                 .field("29", stock.code).field("70", ordered)
                 .field("41", cancelled).field("37", reduced).field("47", filled)
-                .field("39", failed() ? "E" : " ").field("K1", failed() ? failure : TAKEN)
+                .field("39", failed() ? "E" : " ").field("K1", failed() ? failure() : TAKEN)
                 .field("N6", n6).field("31", price).field("M8", priceKind)
                 .field("22", Texts.time(entered.toLocalTime()))
                 .field("21", Texts.date(entered.toLocalDate()))
