@@ -23,6 +23,35 @@ public enum Scene {
     /** The margin account. */
     MARGIN;
 
+    /** The scene of an operation, by the name of its native method. */
+    public static Scene ofOperation(String operation) {
+        if (operation.contains("Cert")) {
+            return CERTIFICATE;
+        }
+        if (operation.startsWith("Fut")) {
+            return operation.startsWith("FutSubmit") ? FUTURES_ORDER : FUTURES_LIST;
+        }
+        switch (operation.replaceFirst("(En|De)code.*", "")) {
+            case "SubmitOrder":
+            case "CancelOrder":
+            case "ChangeOrder":
+            case "CancelChangeOrder":
+                return STOCK_ORDER;
+            case "QueryOrder":
+            case "QueryReply":
+                return STOCK_LIST;
+            case "QueryInventory":
+            case "QueryCreditInfo":
+                return STOCK_POSITION;
+            case "Payment":
+                return SETTLEMENT;
+            case "QueryFinance":
+                return MARGIN;
+            default:
+                return ACCOUNT;
+        }
+    }
+
     /** The scene of a request, by its header and function code. */
     public static Scene ofRequest(List<WireField> fields) {
         if (WireField.value(fields, "F").equals("1")) {

@@ -79,6 +79,26 @@ class ReadingTest {
         assertEquals(Scene.SETTLEMENT, Scene.ofRequest(WireField.cut("F=7|KIND=S|FUNC=6")));
     }
 
+    @ParameterizedTest(name = "{0}")
+    @CsvSource({
+        "AuthEncode, ACCOUNT",
+        "QueryBankRemainDecode, ACCOUNT",
+        "ChangePasswordEncode, ACCOUNT",
+        "GetCertEncode2, CERTIFICATE",
+        "SubmitOrderEncode1, STOCK_ORDER",
+        "CancelChangeOrderDecode, STOCK_ORDER",
+        "QueryOrderDecode, STOCK_LIST",
+        "QueryInventoryDecodeJZG, STOCK_POSITION",
+        "QueryCreditInfoEncode, STOCK_POSITION",
+        "PaymentDecodeJZG, SETTLEMENT",
+        "FutSubmitOrderEncode, FUTURES_ORDER",
+        "FutQueryInventoryDecode, FUTURES_LIST",
+        "QueryFinanceDecode, MARGIN",
+    })
+    void knowsTheSceneOfAnOperation(String operation, Scene scene) {
+        assertEquals(scene, Scene.ofOperation(operation));
+    }
+
     @Test
     void alignsTablesWithWideCharacters() {
         ByteArrayOutputStream bytes = new ByteArrayOutputStream();
