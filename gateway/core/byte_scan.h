@@ -6,6 +6,12 @@
 #include <cstdint>
 #include <cstring>
 
+#if defined(__SSE2__)
+#include <emmintrin.h>
+#elif defined(__aarch64__)
+#include <arm_neon.h>
+#endif
+
 inline constexpr size_t kBarBlock = 64;
 
 // Bit i is set where block[i] is a '|': the rule that BarsOfBlock is held against.
@@ -17,26 +23,53 @@ inline uint64_t BarsOfBlockPlainly(const char* block) {
   return bars;
 }
 
-// The same, eight bytes at a time. A byte of `word` that is zero, a bar, is the only one whose top
-// bit survives; the multiplication then gathers the eight top bits in the highest byte.
+// The same, as fast as the processor family's first generation allows: a block is compared in
+// vectors, and the comparison's result gathered one bit a byte.
+#if defined(__SSE2__)
 inline uint64_t BarsOfBlock(const char* block) {
-#if __BYTE_ORDER__ == __ORDER_LITTLE_ENDIAN__
+  const __m128i bar = _mm_set1_epi8('|');
+  uint64_t bars = 0;
+  for (size_t i = 0; i < kBarBlock; i += 16) {
+    __m128i bytes;
+    memcpy(&bytes, block + i, sizeof bytes);
+    const auto found = static_cast<uint32_t>(_mm_movemask_epi8(_mm_cmpeq_epi8(bytes, bar)));
+    bars |= static_cast<uint64_t>(found) << i;
+  }
+  return bars;
+}
+#elif defined(__aarch64__)
+inline uint64_t BarsOfBlock(const char* block) {
+  const uint8x16_t bar = vdupq_n_u8('|');
+  const uint8x16_t bit = vreinterpretq_u8_u64(vdupq_n_u64(0x8040201008040201U));
+  uint8x16_t found[4];
+  for (size_t i = 0; i < 4; ++i) {
+    const uint8x16_t bytes = vld1q_u8(reinterpret_cast<const uint8_t*>(block) + 16 * i);
+    found[i] = vandq_u8(vceqq_u8(bytes, bar), bit);
+  }
+  const uint8x16_t pairs = vpaddq_u8(vpaddq_u8(found[0], found[1]), vpaddq_u8(found[2], found[3]));
+  return vgetq_lane_u64(vreinterpretq_u64_u8(vpaddq_u8(pairs, pairs)), 0);
+}
+#elif __BYTE_ORDER__ == __ORDER_LITTLE_ENDIAN__
+inline uint64_t BarsOfBlock(const char* block) {
   constexpr uint64_t kBars = 0x7c7c7c7c7c7c7c7cU;
   constexpr uint64_t kLowBits = 0x7f7f7f7f7f7f7f7fU;
   constexpr uint64_t kGather = 0x0002040810204081U;
   uint64_t bars = 0;
-  for (size_t i = 0; i < kBarBlock / 8; ++i) {
+  for (size_t i = 0; i < kBarBlock; i += 8) {
     uint64_t word;
-    memcpy(&word, block + 8 * i, sizeof word);
+    memcpy(&word, block + i, sizeof word);
     word ^= kBars;
+    // Only a byte that is zero now, a bar, keeps its top bit; the product gathers the top bits.
     const uint64_t tops = ~(((word & kLowBits) + kLowBits) | word | kLowBits);
-    bars |= (tops * kGather >> 56) << (8 * i);
+    bars |= (tops * kGather >> 56) << i;
   }
   return bars;
-#else
-  return BarsOfBlockPlainly(block);
-#endif
 }
+#else
+inline uint64_t BarsOfBlock(const char* block) {
+  return BarsOfBlockPlainly(block);
+}
+#endif
 
 // Walks the bars of a text in order. Reads nothing outside the text.
 class CBarScanner {

@@ -67,10 +67,6 @@ int64_t ReadInt64(std::string_view text) {
   return static_cast<int64_t>(negative ? 0 - magnitude : magnitude);
 }
 
-int32_t ReadInt32(std::string_view text) {
-  return static_cast<int32_t>(static_cast<uint32_t>(static_cast<uint64_t>(ReadInt64(text))));
-}
-
 int32_t PowerOfTen32(int exponent) {
   const int64_t power = PowerOfTen64(exponent);
   return power > INT32_MAX ? INT32_MAX : static_cast<int32_t>(power);
@@ -83,17 +79,22 @@ int64_t PowerOfTen64(int exponent) {
 }
 
 size_t DecimalSize(int64_t value, size_t width) {
-  size_t size = value < 0 ? 2 : 1;
-  for (uint64_t rest = Magnitude(value); rest >= 10; rest /= 10) ++size;
+  const uint64_t magnitude = Magnitude(value);
+  size_t size = 1;
+  for (uint64_t bound = 10; magnitude >= bound; bound *= 10) ++size;  // ends at 10^19 at the latest
+  if (value < 0) ++size;
   return size < width ? width : size;
 }
 
 char* WriteDecimal(char* at, int64_t value, size_t width) {
   const size_t size = DecimalSize(value, width);
-  if (value < 0) *at = '-';
+  char* const start = value < 0 ? at + 1 : at;
+  char* digit = at + size;
   uint64_t rest = Magnitude(value);
-  for (size_t i = size; i > (value < 0 ? 1U : 0U); rest /= 10) {
-    at[--i] = static_cast<char>('0' + rest % 10);
-  }
+  for (; rest > UINT32_MAX; rest /= 10) *--digit = static_cast<char>('0' + rest % 10);
+  auto narrow = static_cast<uint32_t>(rest);  // 32-bit division is much the cheaper one
+  for (; digit - start >= 2; narrow /= 100) WriteDigitPair(digit -= 2, narrow % 100);
+  if (digit != start) *start = static_cast<char>('0' + narrow % 10);
+  if (value < 0) *at = '-';
   return at + size;
 }

@@ -13,7 +13,19 @@
 int64_t ReadInt64(std::string_view text);
 
 // As ReadInt64, then narrowed to 32 bits by wrapping: what `atoi` gives where `long` has 64 bits.
-int32_t ReadInt32(std::string_view text);
+inline int32_t ReadInt32(std::string_view text) {
+  constexpr size_t kSafeDigits = 9;
+  uint32_t value = 0;
+  size_t i = 0;
+  for (; i < text.size() && i < kSafeDigits; ++i) {
+    const uint32_t digit = static_cast<unsigned char>(text[i]) - uint32_t{'0'};
+    if (digit > 9) break;
+    value = value * 10 + digit;
+  }
+  const bool complete = i == text.size() || (i > 0 && i < kSafeDigits);
+  if (complete) return static_cast<int32_t>(value);
+  return static_cast<int32_t>(static_cast<uint32_t>(static_cast<uint64_t>(ReadInt64(text))));
+}
 
 constexpr uint64_t PowerOfTen(size_t exponent) {
   return exponent == 0 ? 1 : 10 * PowerOfTen(exponent - 1);

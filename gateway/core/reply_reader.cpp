@@ -71,21 +71,27 @@ inline void CRecord::Index(TagKey key, const char* field, const char* end, const
 }
 
 bool CRecordWalker::Next(CRecord& record) {
-  record.Clear();
+  CBarScanner bars = m_bars;  // a copy of this function's own stays in registers
+  const char* bar = m_pBar;
   const char* opening = nullptr;
-  while (m_pBar != m_bars.End()) {
-    const char* const start = m_pBar;
-    const char* const field = start + 1;
-    m_pBar = m_bars.Next();
-    const TagKey key = TagKeyOf(field, m_pBar);
-    if (key == kClosing) {
-      record.m_bEmpty = opening == nullptr || static_cast<size_t>(start - opening) >= m_nBound;
-      if (record.m_bEmpty) record.Clear();
-      return true;
-    }
-    if (opening != nullptr) record.Index(key, field, m_pBar, m_bars.End());
-    if (key == kOpening && opening == nullptr) opening = start;
-  }
+  bool closed = false;
   record.Clear();
-  return false;
+  while (!closed && bar != bars.End()) {
+    const char* const start = bar;
+    const char* const field = start + 1;
+    bar = bars.Next();
+    const TagKey key = TagKeyOf(field, bar);
+    if (key == kClosing) {
+      closed = true;
+      record.m_bEmpty = opening == nullptr || static_cast<size_t>(start - opening) >= m_nBound;
+    } else if (opening != nullptr) {
+      record.Index(key, field, bar, bars.End());
+    } else if (key == kOpening) {
+      opening = start;
+    }
+  }
+  if (record.m_bEmpty) record.Clear();
+  m_bars = bars;
+  m_pBar = bar;
+  return closed;
 }

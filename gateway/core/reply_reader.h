@@ -50,14 +50,24 @@ constexpr TagKey MakeTagKey(const char* tag) {
   return tag[2] == '\0' ? MakeTagKey(tag[0], tag[1], '=') : MakeTagKey(tag[0], tag[1], tag[2], '=');
 }
 
+// The key of four characters at once.
+inline TagKey LoadTagKey(const char* chars) {
+  TagKey key;
+  memcpy(&key, chars, sizeof key);
+#if __BYTE_ORDER__ != __ORDER_LITTLE_ENDIAN__
+  key = __builtin_bswap32(key);
+#endif
+  return key;
+}
+
 // The key of the field that starts at `field` and ends at `end`; kNoTag when it has no tag of two
 // or three characters.
 inline TagKey TagKeyOf(const char* field, const char* end) {
   const auto size = end - field;
   if (size >= 4) {
-    const TagKey key = MakeTagKey(field[0], field[1], field[2], field[3]);
-    if (field[2] == '=') return key & 0x00ffffff;
-    return field[3] == '=' ? key : kNoTag;
+    const TagKey key = LoadTagKey(field);
+    if ((key >> 16 & 0xff) == '=') return key & 0x00ffffff;
+    return key >> 24 == '=' ? key : kNoTag;
   }
   return size == 3 && field[2] == '=' ? MakeTagKey(field[0], field[1], '=') : kNoTag;
 }
