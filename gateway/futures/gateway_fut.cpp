@@ -53,9 +53,7 @@ char* CGatewayFut::RefuseList(std::string_view reply, std::string_view code, int
 
 bool CGatewayFut::StartQuery(CTextWriter& line, const char* branch, const char* identity,
                              const char* password, int* status) {
-  const bool written = WriteQueryHead(line, branch, identity, password);
-  if (written && !line.Overflowed()) return true;
+  if (WriteQueryHead(line, branch, identity, password)) return true;
   *status = -1;
-  if (written) line.Replace(kBadParameters);
   return false;
 }
