@@ -37,6 +37,15 @@ void AppendHeapText(const HeapText& owner, const char* text, int length, bool re
   owner.length = static_cast<int32_t>(needed);
 }
 
+char* RenewHeapText(const HeapText& owner, size_t size) {
+  char* const block = Allocate(size);
+  if (block == nullptr) return nullptr;
+  Adopt(owner, block, size);
+  owner.length = 0;
+  *block = '\0';
+  return block;
+}
+
 CResultText::CResultText(const HeapText& owner, size_t expected)
     : CWireText(nullptr, nullptr), m_owner(owner), m_nExpected(expected), m_pRecords(nullptr) {
   owner.length = 0;

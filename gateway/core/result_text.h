@@ -18,6 +18,10 @@ struct HeapText {
 // text stays as it was.
 void AppendHeapText(const HeapText& owner, const char* text, int length, bool reset);
 
+// Replaces the text by an empty one that can hold exactly `size` - 1 characters, and returns it for
+// its owner to fill; null, with the old text as it was, when memory runs out.
+char* RenewHeapText(const HeapText& owner, size_t size);
+
 // Writes the records of one list straight into an object's heap text, with room kept before them
 // for what opens the list: the finished list is never copied. A list that memory cannot hold
 // fails once, for good.

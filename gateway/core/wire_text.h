@@ -140,6 +140,14 @@ class CWireText {
 
   void AppendChar(char c) { AppendValue(CharValue{c}); }
 
+  // Hands out the next `count` characters, all of which the caller fills; null when they do not
+  // fit, and then nothing more does.
+  char* Claim(size_t count) {
+    if (!Has(count) && !MakeRoom(count)) return nullptr;
+    m_pAt += count;
+    return m_pAt - count;
+  }
+
   // Printed as "%0<width>d" prints it.
   void AppendPadded(int64_t number, size_t width) { AppendValue(PaddedValue{number, width}); }
 
