@@ -56,6 +56,12 @@ char* CGatewayPub::FinishList(CResultText& records, int count, int* status) {
   return list;
 }
 
+char* CGatewayPub::RenewResult(size_t length, int* status) {
+  char* const room = RenewHeapText({m_pData, m_nDataSize, m_nDataLen}, length);
+  if (room == nullptr) *status = -1;
+  return room;
+}
+
 bool CGatewayPub::TransportFailed(std::string_view reply, int* status) {
   const Transport transport = JudgeTransport(reply);
   if (transport == Transport::kOk) return false;

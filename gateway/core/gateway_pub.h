@@ -115,6 +115,52 @@ class CGatewayPub {
                               int* status);
   char* GetTotalAccountDecode(const char* reply, int* status);
 
+  // Opening an account. `extra1` and `extra2` are not sent; `time` and `item` are codes 0 to 255,
+  // sent unsigned. The result of an accepted request is empty.
+  char* OpenAccountEncode(const char* extra1, const char* identity, const char* extra2,
+                          const char* name, const char* address, const char* tel, char time,
+                          char item, int* status);
+  char* OpenAccountDecode(const char* reply, int* status);
+
+  // Changing the trading password. The result of an accepted request is empty.
+  char* ChangePasswordEncode(const char* branch, const char* identity, const char* password,
+                             const char* newPassword, int* status);
+  char* ChangePasswordDecode(const char* reply, int* status);
+
+  // The balance of the linked bank account: "1!@@@@balance@!", empty and with status 1 also where
+  // the gateway refused to tell.
+  char* QueryBankRemainEncode(const char* branch, const char* identity, const char* password,
+                              int* status);
+  char* QueryBankRemainDecode(const char* reply, int* status);
+
+  // The trading certificate. `certMsg` is the application's own text, sent in Base64; an empty one,
+  // and one that does not fit a request, fail with a message that names the operation. `birth` is
+  // sent as it is.
+  char* ApplyCertEncode(const char* branch, const char* identity, const char* password,
+                        const char* birth, const char* certMsg, int* status);
+  char* ReNewCertEncode(const char* branch, const char* identity, const char* password,
+                        const char* birth, const char* certMsg, int* status);
+  char* RevokeCertEncode(const char* branch, const char* identity, const char* password,
+                         const char* birth, const char* certMsg, int* status);
+  char* GetCertEncode(const char* certMsg, int* status);
+  char* GetCertEncode2(const char* certMsg, int* status);
+  char* GetCertStatusEncode(const char* certMsg, int* status);
+  char* InstallCertOKEncode(const char* certMsg, int* status);
+  char* OpenCertEncode(const char* certMsg, int* status);
+
+  // As the others, for a message of any length.
+  char* RegisterCertEncode(const char* certMsg, int* status);
+
+  // The gateway's text as it came, or "[CERT]code text" with status -1.
+  char* ApplyCertDecode(const char* reply, int* status);
+  char* ReNewCertDecode(const char* reply, int* status);
+  char* RevokeCertDecode(const char* reply, int* status);
+  char* GetCertDecode(const char* reply, int* status);
+  char* GetCertStatusDecode(const char* reply, int* status);
+  char* InstallCertOKDecode(const char* reply, int* status);
+  char* OpenCertDecode(const char* reply, int* status);
+  char* RegisterCertDecode(const char* reply, int* status);
+
   int32_t m_nDataSize;  // capacity of m_pData
   int32_t m_nDataLen;   // characters in m_pData
   char m_szBuffer[kBufferSize];
@@ -178,6 +224,10 @@ class CGatewayPub {
   // Ends a decoder with its list, "count!records"; a null text and status -1 when memory ran out.
   static char* FinishList(CResultText& records, int count, int* status);
 
+  // A long result of `length` characters, to be filled, in m_pData; null and status -1 when memory
+  // ran out.
+  char* RenewResult(size_t length, int* status);
+
   // Whether the reply is a transport failure: then m_szBuffer tells it and the status is -1.
   bool TransportFailed(std::string_view reply, int* status);
 
@@ -204,6 +254,17 @@ class CGatewayPub {
   char* EncodeAccountQuery(const char* branch, const char* identity, const char* password,
                            const char* function, int* status);
   char* ListAccounts(std::string_view reply, bool login, int* status);
+  char* Acknowledge(std::string_view reply, int* status);
+
+  struct CertRequest;
+  struct CertOwner;
+  bool WriteCertHead(CTextWriter& line, const CertRequest& request, const CertOwner& owner,
+                     std::string_view message, int* status);
+  static void WriteCertTail(CTextWriter& line, const CertRequest& request, const CertOwner& owner,
+                            std::string_view message);
+  char* EncodeCert(const CertRequest& request, const CertOwner& owner, const char* certMsg,
+                   int* status);
+  char* DecodeCert(const char* label, const char* reply, int* status);
 };
 
 #endif  // QUORVANE_GATEWAY_CORE_GATEWAY_PUB_H_

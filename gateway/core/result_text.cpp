@@ -37,12 +37,12 @@ void AppendHeapText(const HeapText& owner, const char* text, int length, bool re
   owner.length = static_cast<int32_t>(needed);
 }
 
-char* RenewHeapText(const HeapText& owner, size_t size) {
-  char* const block = Allocate(size);
+char* RenewHeapText(const HeapText& owner, size_t length) {
+  char* const block = Allocate(length + 1);
   if (block == nullptr) return nullptr;
-  Adopt(owner, block, size);
-  owner.length = 0;
-  *block = '\0';
+  Adopt(owner, block, length + 1);
+  owner.length = static_cast<int32_t>(length);
+  block[length] = '\0';
   return block;
 }
 

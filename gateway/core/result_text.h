@@ -18,9 +18,9 @@ struct HeapText {
 // text stays as it was.
 void AppendHeapText(const HeapText& owner, const char* text, int length, bool reset);
 
-// Replaces the text by an empty one that can hold exactly `size` - 1 characters, and returns it for
-// its owner to fill; null, with the old text as it was, when memory runs out.
-char* RenewHeapText(const HeapText& owner, size_t size);
+// Replaces the text by one of `length` characters, all of which its owner fills, and returns it;
+// null, with the old text as it was, when memory runs out.
+char* RenewHeapText(const HeapText& owner, size_t length);
 
 // Writes the records of one list straight into an object's heap text, with room kept before them
 // for what opens the list: the finished list is never copied. A list that memory cannot hold

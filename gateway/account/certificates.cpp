@@ -1,0 +1,209 @@
+// The life of a trading certificate. Every request and every reply takes one road:
+//
+//   request  header FUNC=code|MSG=Base64 of the certificate message[|BIRTH=birth date]|01=
+//   reply    |00=..|68=code|M2=text|01=      result: the text as it came, or "[CERT]code text"
+//
+// The certificate message is the application's own; requests without a birth date name no user.
+#include "gateway/account/base64_utils.h"
+#include "gateway/account/messages.h"
+#include "gateway/core/gateway_pub.h"
+#include "gateway/core/log.h"
+
+namespace {
+
+enum Field { kCode, kText };
+
+constexpr CTagTable kTags({{"68"}, {"M2"}});
+
+// The step lines of one request, which those who read the log go by; null where it has none.
+struct CertSteps {
+  const char* beforeHead = nullptr;
+  const char* afterHead[3] = {};
+  const char* afterTail[2] = {};
+};
+
+constexpr CertSteps kNoSteps;
+constexpr CertSteps kRevokeSteps = {nullptr, {"test1"}, {}};
+constexpr CertSteps kGetCert2Steps = {"GetCertEncode2_1",
+                                      {"GetCertEncode2_3", "GetCertEncode2_4", "GetCertEncode2_5"},
+                                      {"GetCertEncode2__6", "GetCertEncode2__7"}};
+
+void LogStep(const char* step) {
+  if (step != nullptr) debuglog(step);
+}
+
+void LogLength(const char* label, std::string_view message) {
+  char scratch[64];
+  CTextWriter line(scratch, sizeof scratch);
+  line.Append(WIRE("%s Len:%ld"), label, message.size());
+  debuglog(line.Text());
+}
+
+}  // namespace
+
+// What tells one request from another.
+struct CGatewayPub::CertRequest {
+  const char* function;
+  const char* parameterError;  // for a message that cannot be sent
+  bool hasBirth = false;
+  const CertSteps& steps = kNoSteps;
+};
+
+// Whose certificate it is; requests without a birth date do not say.
+struct CGatewayPub::CertOwner {
+  const char* branch = "";
+  const char* identity = "";
+  const char* password = "";
+  const char* birth = "";
+};
+
+// An empty message is refused before the header is made.
+bool CGatewayPub::WriteCertHead(CTextWriter& line, const CertRequest& request,
+                                const CertOwner& owner, std::string_view message, int* status) {
+  *status = 1;
+  if (message.empty()) {
+    Fail(line, status, request.parameterError);
+    return false;
+  }
+  LogStep(request.steps.beforeHead);
+  if (WriteQueryHead(line, owner.branch, owner.identity, owner.password)) return true;
+  *status = -1;
+  return false;
+}
+
+void CGatewayPub::WriteCertTail(CTextWriter& line, const CertRequest& request,
+                                const CertOwner& owner, std::string_view message) {
+  line.Append(WIRE("FUNC=%s|MSG="), request.function);
+  char* const room = line.Claim(CBase64Utils::EncodedSize(message.size()));
+  if (room != nullptr) CBase64Utils::EncodeTo(message.data(), message.size(), room);
+  if (request.hasBirth) line.Append(WIRE("|BIRTH=%s"), owner.birth);
+  line.AppendText("|01=");
+}
+
+char* CGatewayPub::EncodeCert(const CertRequest& request, const CertOwner& owner,
+                              const char* certMsg, int* status) {
+  const std::string_view message = AsText(certMsg);
+  CTextWriter line = StartRequest();
+  if (!WriteCertHead(line, request, owner, message, status)) return line.Text();
+  for (const char* step : request.steps.afterHead) LogStep(step);
+  WriteCertTail(line, request, owner, message);
+  for (const char* step : request.steps.afterTail) LogStep(step);
+  return Finish(line, status, request.parameterError);
+}
+
+char* CGatewayPub::ApplyCertEncode(const char* branch, const char* identity, const char* password,
+                                   const char* birth, const char* certMsg, int* status) {
+  return EncodeCert({"13", kApplyCertParameters, true}, {branch, identity, password, birth},
+                    certMsg, status);
+}
+
+char* CGatewayPub::ReNewCertEncode(const char* branch, const char* identity, const char* password,
+                                   const char* birth, const char* certMsg, int* status) {
+  return EncodeCert({"15", kReNewCertParameters, true}, {branch, identity, password, birth},
+                    certMsg, status);
+}
+
+char* CGatewayPub::RevokeCertEncode(const char* branch, const char* identity, const char* password,
+                                    const char* birth, const char* certMsg, int* status) {
+  return EncodeCert({"18", kRevokeCertParameters, true, kRevokeSteps},
+                    {branch, identity, password, birth}, certMsg, status);
+}
+
+char* CGatewayPub::GetCertEncode(const char* certMsg, int* status) {
+  debuglog("GetCertEncode");
+  return EncodeCert({"11", kGetCertParameters}, {}, certMsg, status);
+}
+
+char* CGatewayPub::GetCertEncode2(const char* certMsg, int* status) {
+  LogLength("regMsg", AsText(certMsg));
+  return EncodeCert({"11", kGetCertParameters, false, kGetCert2Steps}, {}, certMsg, status);
+}
+
+char* CGatewayPub::GetCertStatusEncode(const char* certMsg, int* status) {
+  return EncodeCert({"14", kGetCertStatusParameters}, {}, certMsg, status);
+}
+
+char* CGatewayPub::InstallCertOKEncode(const char* certMsg, int* status) {
+  return EncodeCert({"16", kInstallCertOKParameters}, {}, certMsg, status);
+}
+
+char* CGatewayPub::OpenCertEncode(const char* certMsg, int* status) {
+  return EncodeCert({"17", kOpenCertParameters}, {}, certMsg, status);
+}
+
+// Its message has no limit: the request is written into one heap block of its very size.
+char* CGatewayPub::RegisterCertEncode(const char* certMsg, int* status) {
+  constexpr CertRequest kRequest = {"10", kRegisterCertParameters};
+  const std::string_view message = AsText(certMsg);
+  LogLength("RegisterCertEncode:", message);
+  debuglog(certMsg);
+  CTextWriter head = StartRequest();
+  if (!WriteCertHead(head, kRequest, {}, message, status)) return head.Text();
+  const std::string_view header(head.Text(), head.Length());
+  const size_t length =
+      header.size() + strlen("FUNC=10|MSG=|01=") + CBase64Utils::EncodedSize(message.size());
+  char* const room = RenewResult(length, status);
+  if (room == nullptr) return nullptr;
+  CTextWriter line(room, length + 1);
+  line.AppendText(header);
+  WriteCertTail(line, kRequest, {}, message);
+  return line.Text();
+}
+
+char* CGatewayPub::ApplyCertDecode(const char* reply, int* status) {
+  return DecodeCert("ApplyCertDecode", reply, status);
+}
+
+char* CGatewayPub::ReNewCertDecode(const char* reply, int* status) {
+  return DecodeCert("ReNewCertDecode", reply, status);
+}
+
+char* CGatewayPub::RevokeCertDecode(const char* reply, int* status) {
+  return DecodeCert("RevokeCertDecode", reply, status);
+}
+
+char* CGatewayPub::GetCertDecode(const char* reply, int* status) {
+  return DecodeCert("GetCertDecode", reply, status);
+}
+
+char* CGatewayPub::GetCertStatusDecode(const char* reply, int* status) {
+  return DecodeCert("GetCertStatusDecode", reply, status);
+}
+
+char* CGatewayPub::InstallCertOKDecode(const char* reply, int* status) {
+  return DecodeCert("InstallCertOKDecode", reply, status);
+}
+
+// Logs under the name of the status reply.
+char* CGatewayPub::OpenCertDecode(const char* reply, int* status) {
+  return DecodeCert("GetCertStatusDecode", reply, status);
+}
+
+char* CGatewayPub::RegisterCertDecode(const char* reply, int* status) {
+  return DecodeCert("RegisterCertDecode", reply, status);
+}
+
+// The first record alone is read, whatever its length; without one, code and text are empty.
+char* CGatewayPub::DecodeCert(const char* label, const char* reply, int* status) {
+  const std::string_view text = AsText(reply);
+  LogReply(label, text);
+  *status = 1;
+  if (TransportFailed(text, status)) return m_szBuffer;
+  const size_t bound = text.size() + 20;
+  CRecord record(kTags);
+  CRecordWalker walker(text, bound);
+  walker.Next(record);
+  const std::string_view code = record.Text(kCode, 20);
+  const std::string_view answer = record.Text(kText, bound);
+  const bool accepted = code == "0000";
+  const size_t length = answer.size() + (accepted ? 0 : strlen("[CERT] ") + code.size());
+  char* const room = RenewResult(length, status);
+  if (room == nullptr) return nullptr;
+  CTextWriter result(room, length + 1);
+  if (!accepted) {
+    *status = -1;
+    result.Append(WIRE("[CERT]%s "), code);
+  }
+  result.AppendText(answer);
+  return result.Text();
+}

@@ -1,0 +1,100 @@
+// Account maintenance: opening an account, changing the trading password, the balance of the linked
+// bank account.
+//
+//   request  header FUNC=9|NAME=..|ADDRESS=..|TEL=..|TIME=code|ITEM=code|01=       opening
+//            header FUNC=1|54=password|55=new password|01=                         password
+//            header FUNC=7|01=                                                     balance
+//   reply    |68=code|M2=refusal                               opening, password: result is empty
+//            |00=..|PN=balance|01=                             balance: result 1!@@@@balance@!
+#include "gateway/core/gateway_pub.h"
+#include "gateway/core/messages.h"
+
+namespace {
+
+// Room for the balance record: a longer one reads as empty.
+constexpr size_t kBalanceRecordSize = 200;
+
+enum BalanceField { kBalance };
+
+constexpr CTagTable kBalanceTags({{"PN"}});
+
+// A code that the host passes as one byte, sent as an unsigned number.
+int UnsignedCode(char code) {
+  return static_cast<unsigned char>(code);
+}
+
+}  // namespace
+
+char* CGatewayPub::OpenAccountEncode(const char*, const char* identity, const char*,
+                                     const char* name, const char* address, const char* tel,
+                                     char time, char item, int* status) {
+  *status = 1;
+  CTextWriter line = StartRequest();
+  if (!WriteQueryHead(line, "", identity, "")) {
+    *status = -1;
+    return line.Text();
+  }
+  line.Append(WIRE("FUNC=9|NAME=%s|ADDRESS=%s|TEL=%s"), name, address, tel);
+  line.Append(WIRE("|TIME=%d|ITEM=%d|01="), UnsignedCode(time), UnsignedCode(item));
+  return Finish(line, status, kBadParameters);
+}
+
+// The escape covers the whole request, the header's edition name too; a header that failed is a
+// message for the user and keeps its blanks.
+char* CGatewayPub::ChangePasswordEncode(const char* branch, const char* identity,
+                                        const char* password, const char* newPassword,
+                                        int* status) {
+  *status = 1;
+  CTextWriter line = StartRequest();
+  if (!WriteQueryHead(line, branch, identity, password)) {
+    *status = -1;
+    return line.Text();
+  }
+  line.Append(WIRE("FUNC=1|54=%s|55=%s|01="), password, newPassword);
+  return FinishEscaped(line, status, kBadParameters);
+}
+
+char* CGatewayPub::QueryBankRemainEncode(const char* branch, const char* identity,
+                                         const char* password, int* status) {
+  *status = 1;
+  CTextWriter line = StartRequest();
+  if (!WriteQueryHead(line, branch, identity, password)) {
+    *status = -1;
+    return line.Text();
+  }
+  line.AppendText("FUNC=7|01=");
+  return FinishEscaped(line, status, kBadParameters);
+}
+
+char* CGatewayPub::OpenAccountDecode(const char* reply, int* status) {
+  const std::string_view text = AsText(reply);
+  LogReply("OpenAccountDecode", text);
+  return Acknowledge(text, status);
+}
+
+// Its reply is not logged.
+char* CGatewayPub::ChangePasswordDecode(const char* reply, int* status) {
+  return Acknowledge(AsText(reply), status);
+}
+
+char* CGatewayPub::Acknowledge(std::string_view reply, int* status) {
+  *status = 1;
+  if (TransportFailed(reply, status)) return m_szBuffer;
+  const std::string_view code = Bounded(FindField(reply, "68", Blanks::kTaken), 20);
+  if (code == "0000") return Answer("");
+  return Refuse(Bounded(FindField(reply, "M2", Blanks::kTaken), 200), code, status);
+}
+
+// The result code is not looked at: a refused query shows an empty balance.
+char* CGatewayPub::QueryBankRemainDecode(const char* reply, int* status) {
+  const std::string_view text = AsText(reply);
+  LogReply("QueryBankRemainDecode", text);
+  *status = 1;
+  if (TransportFailed(text, status)) return m_szBuffer;
+  CRecord record(kBalanceTags);
+  CRecordWalker walker(text, kBalanceRecordSize);
+  walker.Next(record);
+  CTextWriter answer = StartRequest();
+  answer.Append(WIRE("1!@@@@%s@!"), record.Text(kBalance, 200));
+  return answer.Text();
+}
