@@ -1,0 +1,202 @@
+// Results that grow: AppendData, and the lists of the decoders.
+
+#include <cstring>
+
+#include "gateway/core/gateway_pub.h"
+#include "gateway/core/result_text.h"
+#include "tests/unit/allocations.h"
+#include "tests/unit/session.h"
+
+namespace gateway_tests {
+namespace {
+
+class HeapTexts : public CSessionTest {
+ protected:
+  void Append(const std::string& text, bool reset = false) {
+    m_gateway.AppendData(text.c_str(), static_cast<int>(text.size()), reset);
+  }
+
+  HeapText Owner() { return {m_gateway.m_pData, m_gateway.m_nDataSize, m_gateway.m_nDataLen}; }
+
+  // Whether every byte behind the text, to the end of the capacity, is zero.
+  bool RestIsZero() const {
+    for (int at = m_gateway.m_nDataLen; at < m_gateway.m_nDataSize; ++at) {
+      if (m_gateway.m_pData[at] != '\0') return false;
+    }
+    return true;
+  }
+
+  CGatewayPub m_gateway;
+};
+
+TEST_F(HeapTexts, FirstAppendAllocatesItsLengthAndFourKilobytes) {
+  for (bool reset : {false, true}) {
+    CGatewayPub gateway;
+    const CAllocations allocations;
+    gateway.AppendData("abc", 3, reset);
+    EXPECT_EQ(allocations.Count(), 1U);
+    EXPECT_EQ(gateway.m_nDataSize, 3 + 4096);
+    EXPECT_EQ(gateway.m_nDataLen, 3);
+    EXPECT_STREQ(gateway.m_pData, "abc");
+  }
+}
+
+TEST_F(HeapTexts, NothingIsDoneForNothing) {
+  m_gateway.AppendData(nullptr, 5, false);
+  m_gateway.AppendData("abc", 0, false);
+  m_gateway.AppendData("abc", -1, false);
+  EXPECT_EQ(m_gateway.m_pData, nullptr);
+  EXPECT_EQ(m_gateway.m_nDataSize, 0);
+  EXPECT_EQ(m_gateway.m_nDataLen, 0);
+  Append("abc");
+  m_gateway.AppendData(nullptr, 5, true);
+  m_gateway.AppendData("x", 0, true);
+  EXPECT_STREQ(m_gateway.m_pData, "abc") << "no reset either";
+  EXPECT_EQ(m_gateway.m_nDataLen, 3);
+}
+
+TEST_F(HeapTexts, TotalBelowTheCapacityStaysAndAtItGrows) {
+  for (int length : {4095, 4096, 4097}) {  // behind 1 character in a capacity of 4097
+    CGatewayPub gateway;
+    gateway.AppendData("a", 1, false);
+    const char* const before = gateway.m_pData;
+    const std::string text(static_cast<size_t>(length), 'b');
+    const CAllocations allocations;
+    gateway.AppendData(text.c_str(), length, false);
+    EXPECT_EQ(allocations.Count(), length == 4095 ? 0U : 1U) << length;
+    EXPECT_EQ(gateway.m_pData == before, length == 4095) << length;
+    EXPECT_EQ(gateway.m_nDataSize, length == 4095 ? 4097 : 1 + length + 4096) << length;
+    EXPECT_EQ(gateway.m_nDataLen, 1 + length);
+    EXPECT_EQ(gateway.m_pData, "a" + text);
+  }
+}
+
+TEST_F(HeapTexts, PiecesAreJoinedAndTheRestIsZero) {
+  std::string expected;
+  for (int piece = 0; piece < 3000; ++piece) {
+    const std::string text = "<" + std::to_string(piece) + ">@!";
+    Append(text);
+    expected += text;
+  }
+  EXPECT_EQ(m_gateway.m_pData, expected);
+  EXPECT_EQ(static_cast<size_t>(m_gateway.m_nDataLen), expected.size());
+  EXPECT_GT(m_gateway.m_nDataSize, m_gateway.m_nDataLen);
+  EXPECT_TRUE(RestIsZero());
+}
+
+TEST_F(HeapTexts, ResetClearsTheTextAndKeepsTheCapacity) {
+  Append(std::string(5000, 'a'));
+  const int capacity = m_gateway.m_nDataSize;
+  Append("xyz", true);
+  EXPECT_STREQ(m_gateway.m_pData, "xyz");
+  EXPECT_EQ(m_gateway.m_nDataLen, 3);
+  EXPECT_EQ(m_gateway.m_nDataSize, capacity);
+  EXPECT_TRUE(RestIsZero());
+}
+
+TEST_F(HeapTexts, AppendWithoutMemoryKeepsTheOldText) {
+  {
+    const CAllocations none(1);
+    Append("abc");
+    EXPECT_EQ(m_gateway.m_pData, nullptr);
+    EXPECT_EQ(m_gateway.m_nDataLen, 0);
+    EXPECT_EQ(m_gateway.m_nDataSize, 0);
+  }
+  Append("abc");
+  const CAllocations none(1);
+  Append(std::string(5000, 'x'));
+  EXPECT_STREQ(m_gateway.m_pData, "abc");
+  EXPECT_EQ(m_gateway.m_nDataLen, 3);
+  Append("d");
+  EXPECT_STREQ(m_gateway.m_pData, "abcd");
+}
+
+TEST_F(HeapTexts, ListOpensWithItsCount) {
+  const struct {
+    const char* opening;
+    int count;
+    const char* expected;
+  } rows[] = {{"", 0, "0!a!b!"},
+              {"", 2, "2!a!b!"},
+              {"", INT32_MAX, "2147483647!a!b!"},
+              {"<0>!", 12, "<0>!12!a!b!"},
+              {"<12345>!", INT32_MIN, "<12345>!-2147483648!a!b!"}};
+  for (const auto& row : rows) {
+    CResultText list(Owner(), 10);
+    list.Append(WIRE("%s!"), "a");
+    list.AppendText("b!");
+    EXPECT_EQ(list.Length(), 4U);
+    const char* const result = list.Finish(row.opening, row.count);
+    EXPECT_STREQ(result, row.expected);
+    EXPECT_FALSE(list.Failed());
+    EXPECT_GE(result, m_gateway.m_pData);
+    EXPECT_LT(result + strlen(result), m_gateway.m_pData + m_gateway.m_nDataSize);
+  }
+}
+
+TEST_F(HeapTexts, EmptyListIsItsOpening) {
+  CResultText list(Owner(), 0);
+  list.AppendText("");
+  list.Append(WIRE("%s"), "");
+  EXPECT_EQ(list.Length(), 0U);
+  EXPECT_STREQ(list.Finish("<0>!", 0), "<0>!0!");
+}
+
+TEST_F(HeapTexts, ListReplacesWhatTheOwnerHeld) {
+  Append("old");
+  CResultText list(Owner(), 10);
+  list.AppendText("new!");
+  EXPECT_STREQ(list.Finish("", 1), "1!new!");
+}
+
+TEST_F(HeapTexts, ListOfTheExpectedSizeTakesOneAllocation) {
+  for (size_t expected : {0U, 1U, 5000U, 100000U}) {
+    const CAllocations allocations;
+    CResultText list(Owner(), expected);
+    for (size_t i = 0; i < expected; ++i) list.AppendChar('x');
+    EXPECT_EQ(list.Finish("", 1), "1!" + std::string(expected, 'x'));
+    EXPECT_EQ(allocations.Count(), 1U) << expected;
+  }
+}
+
+TEST_F(HeapTexts, ListOfEightTimesTheExpectedSizeTakesTwo) {
+  const CAllocations allocations;
+  CResultText list(Owner(), 10000);
+  for (size_t i = 0; i < 20000; ++i) list.AppendText("abcd");
+  EXPECT_EQ(allocations.Count(), 2U);
+  const std::string result = list.Finish("", 7);
+  EXPECT_EQ(result.size(), 80002U);
+  EXPECT_EQ(result.substr(0, 10), "7!abcdabcd");
+  EXPECT_EQ(result.find_first_not_of("abcd", 2), std::string::npos);
+}
+
+TEST_F(HeapTexts, OnePieceLargerThanAllExpectationsFits) {
+  CResultText list(Owner(), 10);
+  list.AppendText("a");
+  list.AppendText(std::string(1000000, 'b'));
+  list.AppendText("c");
+  EXPECT_EQ(list.Finish("", 1), "1!a" + std::string(1000000, 'b') + "c");
+}
+
+TEST_F(HeapTexts, ListWithoutMemoryFailsForGood) {
+  for (size_t failing : {1U, 2U}) {
+    {
+      const CAllocations refused(failing);
+      CResultText list(Owner(), 10);
+      list.AppendText("a");
+      list.AppendText(std::string(10000, 'b'));
+      EXPECT_TRUE(list.Failed());
+      list.AppendText("c");
+      list.Append(WIRE("%s|%d"), "d", 5);
+      EXPECT_EQ(list.Finish("", 1), nullptr);
+    }
+    CResultText list(Owner(), 10);
+    EXPECT_STREQ(list.Finish("", 0), "0!") << "the owner is none the worse";
+  }
+  const CAllocations refused(1);
+  CResultText empty(Owner(), 10);
+  EXPECT_EQ(empty.Finish("", 0), nullptr);
+}
+
+}  // namespace
+}  // namespace gateway_tests

@@ -1,0 +1,330 @@
+// The record reader: tag tables, and records against a plain reading of the same reply.
+
+#include "gateway/core/reply_reader.h"
+
+#include <ctime>
+#include <random>
+
+#include "gateway/core/gateway_pub.h"
+#include "gateway/core/list_frame.h"
+#include "tests/unit/session.h"
+
+namespace gateway_tests {
+namespace {
+
+constexpr TagRow kRows[] = {{"67"},
+                            {"68"},
+                            {"M2"},
+                            {"PN"},
+                            {"17", Blanks::kSkipped},
+                            {"751"},
+                            {"75"},
+                            {"18", Blanks::kSkipped}};
+constexpr CTagTable kTags(kRows);
+constexpr int kRowCount = static_cast<int>(std::size(kRows));
+
+// As many tags as a table holds; the first and the last skip blanks.
+constexpr CTagTable kFullTable({{"A0", Blanks::kSkipped},
+                                {"A1"},
+                                {"A2"},
+                                {"A3"},
+                                {"A4"},
+                                {"A5"},
+                                {"A6"},
+                                {"A7"},
+                                {"A8"},
+                                {"A9"},
+                                {"B0"},
+                                {"B1"},
+                                {"B2"},
+                                {"B3"},
+                                {"B4"},
+                                {"B5"},
+                                {"B6"},
+                                {"B7"},
+                                {"B8"},
+                                {"B9"},
+                                {"750"},
+                                {"751"},
+                                {"752"},
+                                {"753"},
+                                {"754"},
+                                {"755"},
+                                {"756"},
+                                {"757"},
+                                {"758"},
+                                {"759"},
+                                {"75"},
+                                {"76", Blanks::kSkipped}});
+
+std::string TagOfFullTable(int row) {
+  if (row < 20) return std::string(1, row < 10 ? 'A' : 'B') + std::to_string(row % 10);
+  return row < 30 ? "75" + std::to_string(row - 20) : row == 30 ? "75" : "76";
+}
+
+TagKey KeyOf(const std::string& field) {
+  const CGuardedBlock block(EPlacement::kBeforeUnreadable, field.data(), field.size());
+  return TagKeyOf(block.Data(), block.Data() + field.size());
+}
+
+TEST(ReplyReader, FieldsAreToldByTagsOfTwoAndThreeCharacters) {
+  EXPECT_EQ(KeyOf("68="), MakeTagKey("68"));
+  EXPECT_EQ(KeyOf("68=0"), MakeTagKey("68"));
+  EXPECT_EQ(KeyOf("68=0000"), MakeTagKey("68"));
+  EXPECT_EQ(KeyOf("68=="), MakeTagKey("68"));
+  EXPECT_EQ(KeyOf("751="), MakeTagKey("751"));
+  EXPECT_EQ(KeyOf("751=5"), MakeTagKey("751"));
+  EXPECT_NE(KeyOf("751=5"), MakeTagKey("75"));
+  for (const char* field : {"", "6", "68", "=68", "6=8", "68 =", "7511=5", "751", "7511"}) {
+    EXPECT_NE(KeyOf(field), MakeTagKey("68")) << field;
+    EXPECT_NE(KeyOf(field), MakeTagKey("751")) << field;
+    EXPECT_EQ(kTags.Find(KeyOf(field)), CTagTable::kNone) << field;
+  }
+  EXPECT_EQ(TagSize(MakeTagKey("68")), 3U);
+  EXPECT_EQ(TagSize(MakeTagKey("751")), 4U);
+}
+
+TEST(ReplyReader, FullTableFindsEachOfItsTagsAndNoOther) {
+  std::string known;
+  for (int row = 0; row < 32; ++row) {
+    EXPECT_EQ(kFullTable.Find(KeyOf(TagOfFullTable(row) + "=1")), row);
+    EXPECT_EQ(kFullTable.SkipsBlanks(row), row == 0 || row == 31) << row;
+    known += "|" + TagOfFullTable(row) + "|";
+  }
+  for (int first = 1; first < 256; ++first) {
+    for (int second = 1; second < 256; ++second) {
+      const std::string tag = {static_cast<char>(first), static_cast<char>(second)};
+      const bool listed = first != '|' && known.find("|" + tag + "|") != std::string::npos;
+      ASSERT_TRUE(listed || kFullTable.Find(KeyOf(tag + "=1")) == CTagTable::kNone) << tag;
+    }
+  }
+  EXPECT_EQ(kFullTable.Find(kNoTag), CTagTable::kNone);
+}
+
+TEST(ReplyReader, RecordOfAFullTableHoldsEveryField) {
+  std::string reply = "|00=";
+  for (int row = 31; row >= 0; --row)
+    reply += "|" + TagOfFullTable(row) + "=v" + std::to_string(row);
+  reply += "|01=";
+  CRecord record(kFullTable);
+  CRecordWalker walker(reply, 1024);
+  ASSERT_TRUE(walker.Next(record));
+  for (int row = 0; row < 32; ++row) {
+    EXPECT_TRUE(record.Has(row));
+    EXPECT_EQ(record.Text(row, 20), "v" + std::to_string(row));
+  }
+  EXPECT_FALSE(walker.Next(record));
+  for (int row = 0; row < 32; ++row) EXPECT_FALSE(record.Has(row));
+}
+
+TEST(ReplyReader, ValuesAreReadAsTheirBuffersHoldThem) {
+  CRecord record(kTags);
+  CRecordWalker walker("|00=|67=900001|68=0000|17= 12x|75=|01=", 200);
+  ASSERT_TRUE(walker.Next(record));
+  EXPECT_EQ(record.Text(0, 6), "");
+  EXPECT_EQ(record.Number(0, 6), 0);
+  EXPECT_TRUE(record.Has(0)) << "too long to be read, but there";
+  EXPECT_EQ(record.Text(0, 7), "900001");
+  EXPECT_EQ(record.Number(0, 7), 900001);
+  EXPECT_EQ(record.Number(4, 10), 12);
+  EXPECT_FALSE(record.Has(6)) << "there, but empty";
+  EXPECT_EQ(record.Text(6, 10), "");
+  EXPECT_FALSE(record.Has(5));
+  EXPECT_EQ(record.Number(5, 10), 0);
+  EXPECT_EQ(Bounded("abc", 3), "");
+  EXPECT_EQ(Bounded("abc", 4), "abc");
+  EXPECT_EQ(Bounded("", 0), "");
+}
+
+TEST(ReplyReader, LastFieldOfARecordIsNotClosed) {
+  CRecord record(kTags);
+  CRecordWalker walker("|00=|17= |01=|00=|17=|17= |18= |17=5|01=|00=|17= |010=|01=", 200);
+  ASSERT_TRUE(walker.Next(record));
+  EXPECT_EQ(record.Text(4, 10), " ") << "taken as found";
+  ASSERT_TRUE(walker.Next(record));
+  EXPECT_EQ(record.Text(4, 10), "5");
+  EXPECT_FALSE(record.Has(7));
+  ASSERT_TRUE(walker.Next(record));
+  EXPECT_FALSE(record.Has(4)) << "a bar that only looks like the end closes it";
+}
+
+TEST(ReplyReader, RecordOfItsBoundIsDroppedAndTheWalkGoesOn) {
+  const std::string reply = "|00=1234|01=|00=|68=1|01=";  // a record of 8 characters
+  for (size_t bound : {7U, 8U, 9U}) {
+    CRecord record(kTags);
+    CRecordWalker walker(reply, bound);
+    ASSERT_TRUE(walker.Next(record));
+    EXPECT_EQ(record.Empty(), bound <= 8) << bound;
+    ASSERT_TRUE(walker.Next(record));
+    EXPECT_TRUE(record.Empty());
+    EXPECT_FALSE(walker.Next(record));
+    EXPECT_FALSE(walker.Next(record));
+  }
+}
+
+// One reply read by the buffer-copying tokenizers and by the walker: the same records, the same
+// values, the same lengths.
+void ExpectReadAlike(CGatewayPub& gateway, const std::string& reply, int bound) {
+  const CTextAtPageEnd text(reply);
+  CRecord record(kTags);
+  CRecordWalker walker({text, reply.size()}, static_cast<size_t>(bound));
+  int position = 0;
+  bool more = true;
+  while (static_cast<size_t>(position) < reply.size()) {
+    char copy[64];
+    gateway.GetSubString(text, position, copy, bound);
+    if (more) more = walker.Next(record);
+    ASSERT_EQ(record.Empty(), copy[0] == '\0') << reply;
+    for (int row = 0; row < kRowCount; ++row) {
+      const bool skips = kRows[row].blanks == Blanks::kSkipped;
+      char value[5];
+      const int length = gateway.GetToken(kRows[row].tag, copy, value, sizeof value, skips);
+      ASSERT_EQ(record.Has(row), length > 0) << reply << ", " << kRows[row].tag;
+      ASSERT_EQ(record.Text(row, sizeof value), value) << reply << ", " << kRows[row].tag;
+    }
+  }
+  while (more) {  // closing fields without a record behind the last one
+    more = walker.Next(record);
+    ASSERT_TRUE(record.Empty()) << reply;
+  }
+}
+
+TEST(ReplyReader, WalkerAgreesWithTheTokenizersOnGeneratedReplies) {
+  const char* const pieces[] = {"|00=", "|01=", "|17=", "|18=",  "|67=",  "|68=", "|75=",  "|751=",
+                                "|M2=", "|",    "||",   "=",     " ",     "0000", "1",     "23456",
+                                "00=",  "01=",  "68",   "|010=", "|001=", "|75",  "|17= ", "密"};
+  std::mt19937 random(20240115);
+  CGatewayPub gateway;
+  for (int round = 0; round < 15000; ++round) {
+    std::string reply;
+    for (size_t count = random() % 24; count > 0; --count) {
+      // Markers stand often enough for whole records.
+      const size_t piece = random() % 3 == 0 ? random() % 2 : random() % std::size(pieces);
+      reply += pieces[piece];
+    }
+    const int bound = 8 + static_cast<int>(random() % 56);
+    ExpectReadAlike(gateway, reply, bound);
+    if (HasFatalFailure()) return;
+  }
+}
+
+TEST(ReplyReader, WalkerAgreesWithTheTokenizersOnWellFormedReplies) {
+  std::mt19937 random(9);
+  CGatewayPub gateway;
+  for (int round = 0; round < 3000; ++round) {
+    std::string reply = random() % 2 == 0 ? "F=7" : "";
+    for (size_t records = random() % 6; records > 0; --records) {
+      reply += "|00=" + std::string(random() % 3, 'r');
+      for (size_t fields = random() % 6; fields > 0; --fields) {
+        const char* const values[] = {"", " ", "0000", "42", "12345", "123456789"};
+        reply += std::string("|") + kRows[random() % std::size(kRows)].tag + "=" +
+                 values[random() % std::size(values)];
+      }
+      reply += "|01=";
+    }
+    ExpectReadAlike(gateway, reply, 64);
+    if (HasFatalFailure()) return;
+  }
+}
+
+// Total time over replies in hostile order grows with their size, not with its square: sixteen
+// times the reply may take at most sixty-four times as long.
+TEST(ReplyReader, HostileArrangementsOfMarkersAreWalkedInLinearTime) {
+  for (const std::string piece : {"|01=", "|00=", "|01=|00=", "|", "x", "|17=", "|17= ", "|68=0000",
+                                  "|00=|17=|01=", "|00=|01=|01="}) {
+    double seconds[2] = {1e9, 1e9};
+    for (int attempt = 0; attempt < 3; ++attempt) {
+      for (size_t scale : {0U, 1U}) {
+        std::string reply;
+        while (reply.size() < (scale == 0 ? 65536U : 1048576U)) reply += piece;
+        CRecord record(kTags);
+        const std::clock_t start = std::clock();
+        CRecordWalker walker(reply, 200);
+        while (walker.Next(record)) {
+        }
+        for (const Blanks blanks : {Blanks::kTaken, Blanks::kSkipped}) {
+          EXPECT_EQ(FindField(reply, "99", blanks), "");
+          FindField(reply, "17", blanks);
+        }
+        const auto ticks = static_cast<double>(std::clock() - start);
+        seconds[scale] = std::min(seconds[scale], ticks / CLOCKS_PER_SEC);
+      }
+    }
+    EXPECT_LT(seconds[1], 64 * seconds[0] + 0.05) << piece;
+  }
+}
+
+constexpr ListShape kShape = {64, 20, 5, 20};
+constexpr ListShape kStoppingShape = {64, 20, 5, 20, true, 900001};
+
+struct VerdictCase {
+  const char* reply;
+  ListVerdict verdict;
+  const char* code;
+  const char* message;
+};
+
+constexpr VerdictCase kVerdictCases[] = {
+    {"|00=|68=0000|01=", ListVerdict::kData, "0000", ""},
+    {"|00=|68=5001|M2=none|01=", ListVerdict::kNoData, "5001", "none"},
+    {"|00=|68=5002|M2=no|01=", ListVerdict::kRefused, "5002", "no"},
+    {"|00=|M2=no|01=", ListVerdict::kRefused, "", "no"},
+    {"|00=|68=00000|01=", ListVerdict::kRefused, "", ""},
+    {"|00=|68=000|01=", ListVerdict::kRefused, "000", ""},
+    {"|68=0000|00=|01=", ListVerdict::kRefused, "", ""},
+    {"|00=|68=0000", ListVerdict::kRefused, "", ""},
+    {"|01=|00=|68=0000|01=", ListVerdict::kRefused, "", ""},
+    {"", ListVerdict::kRefused, "", ""}};
+
+TEST(ReplyReader, FirstRecordSpeaksForTheList) {
+  for (const VerdictCase& row : kVerdictCases) {
+    const CReplyList list(row.reply, kTags, kShape);
+    EXPECT_EQ(list.Verdict(), row.verdict) << row.reply;
+    EXPECT_EQ(list.Code(), row.code) << row.reply;
+    EXPECT_EQ(list.Message(), row.message) << row.reply;
+  }
+}
+
+// The values of tag 75 that a list with this shape shows.
+std::string ListOf(const std::string& reply, const ListShape& shape) {
+  std::string values;
+  CReplyList list(reply, kTags, shape);
+  while (list.NextData()) values += std::string(list.Record().Text(6, 20)) + ",";
+  EXPECT_FALSE(list.NextData()) << "at its end for good";
+  return values;
+}
+
+std::string RecordText(const std::string& fields) {
+  return "|00=" + fields + "|01=";
+}
+
+TEST(ReplyReader, ListEndsAtItsMarkOrWithTheReply) {
+  const std::string one = RecordText("|67=1|68=0000|75=a"), two = RecordText("|67=2|68=0000|75=b");
+  const std::string refused = RecordText("|67=3|68=1|75=x");
+  const std::string last = RecordText("|67=899999|68=0000|75=l");
+  const std::string edge = RecordText("|67=900000|68=0000|75=e");
+  const std::string over = RecordText("|67=900001|68=0000|75=o");
+  const std::string dropped = RecordText("|68=0000|75=" + std::string(64, 'd'));
+  const struct {
+    std::string reply;
+    const char* plain;
+    const char* stopping;
+  } rows[] = {{one + two, "a,b,", "a,b,"},
+              {one + refused + two, "a,b,", "a,b,"},
+              {one + last + edge + two, "a,l,", "a,l,e,b,"},
+              {one + over + two, "a,", "a,"},
+              {over + one, "", ""},
+              {one + dropped + two, "a,b,", "a,"},
+              {one + "|01=" + two, "a,b,", "a,"},
+              {"|01=" + one, "a,", ""},
+              {one + "|00=|68=0000|75=c", "a,", "a,"},
+              {refused, "", ""},
+              {"", "", ""}};
+  for (const auto& row : rows) {
+    EXPECT_EQ(ListOf(row.reply, kShape), row.plain) << row.reply;
+    EXPECT_EQ(ListOf(row.reply, kStoppingShape), row.stopping) << row.reply;
+  }
+}
+
+}  // namespace
+}  // namespace gateway_tests
