@@ -201,8 +201,10 @@ class CWireText {
   template <class Format, size_t kAt>
   static void WriteLiteral(char*& at) {
     constexpr const WireMark& kMark = kWirePlan<Format>.marks[kAt];
-    memcpy(at, Format::Chars() + kMark.literalAt, kMark.literalSize);
-    at += kMark.literalSize;
+    if constexpr (kMark.literalSize > 0) {  // a list without room yet writes nothing to nowhere
+      memcpy(at, Format::Chars() + kMark.literalAt, kMark.literalSize);
+      at += kMark.literalSize;
+    }
   }
 
   // Writes the text before a mark and the mark's value; false ends the piece.
