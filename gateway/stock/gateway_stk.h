@@ -98,6 +98,13 @@ class CGatewayStk : public CGatewayPub {
   // Whether the gateway's answer refuses an order, or is none: then m_szBuffer tells it and the
   // status is -1. Otherwise `outcome` is one of "STXY".
   bool OrderRefused(std::string_view reply, char& outcome, int* status);
+
+  // What differs between the brokerages' layouts of positions and of settlement, and the lists.
+  struct PositionLayout;
+  struct PaymentLayout;
+  char* ListPositions(const char* reply, const PositionLayout& layout, int* status);
+  static bool AppendPayment(CResultText& list, const CRecord& record, const PaymentLayout& layout);
+  char* ListPayments(const char* reply, const PaymentLayout& layout, int* status);
 };
 
 #endif  // QUORVANE_GATEWAY_STOCK_GATEWAY_STK_H_

@@ -1,0 +1,179 @@
+// The settlement of a period: what an account pays and receives.
+//
+//   request  header |FUNC=6|H4=1|SDATE=period code|EDATE=|01=          a period of a selector
+//            header |FUNC=6|H4=1|SDATE=first day|EDATE=last day|01=    dates as they were given
+//   record   |50=date|27=kind|28=trade type|32=side|29=code|47=..|48=price|49=..|79=..|78=..|84=..
+//            |81=..|82=..|85=..|87=..|86=..|89=..|88=..|96=sign|97=..|KT=type
+//   result   count ! ( date @@ type @ 29 @ 47 @ price @ 49 @ 79 @ 78 @ 84 @ pair @ 86 @ 89 @ 88
+//            @ sign @ 97 ! )*
+//
+// The brokerage JZG says the type itself, in KT; the other layout makes a type code of order kind,
+// trade type and side. The pair is 81 @ 82, 85 @ 87 or 0 @ 0, by the kind or by KT.
+#include <iterator>
+
+#include "gateway/core/conversions.h"
+#include "gateway/core/decimal.h"
+#include "gateway/stock/gateway_stk.h"
+#include "gateway/stock/messages.h"
+#include "gateway/stock/order_type_codes.h"
+#include "gateway/stock/stock_list.h"
+
+namespace {
+
+// No smaller buffer is named for any field: the record is their bound.
+constexpr size_t kAny = kStockListShape.record;
+
+// The period codes of the selectors 1 to 6; the gateway knows no code 3.
+constexpr const char* kPeriodCodes[] = {"1", "2", "4", "5", "6", "7"};
+
+// The code of a period selector, or null when the text is none.
+const char* PeriodCodeOf(const char* period) {
+  const auto row = static_cast<uint32_t>(WrapSubtract(ReadInt32(AsText(period)), 1));
+  return row < std::size(kPeriodCodes) ? kPeriodCodes[row] : nullptr;
+}
+
+enum Field {
+  kDate = kOwnFields,
+  kKind,
+  kTradeType,
+  kSide,
+  kStockCode,
+  k47,
+  kPrice,
+  k49,
+  k79,
+  k78,
+  k84,
+  k81,
+  k82,
+  k85,
+  k87,
+  k86,
+  k89,
+  k88,
+  kSign,
+  k97,
+  kType
+};
+
+constexpr CTagTable kTags({{"67"}, {"68"}, {"M2"}, {"50"}, {"27"}, {"28"}, {"32"}, {"29"},
+                           {"47"}, {"48"}, {"49"}, {"79"}, {"78"}, {"84"}, {"81"}, {"82"},
+                           {"85"}, {"87"}, {"86"}, {"89"}, {"88"}, {"96"}, {"97"}, {"KT"}});
+static_assert(OpensListTable(kTags), "the list frame reads its rows");
+
+// Kinds from 5 on, without regard to trade type and side: `code` is the first kind's, and the
+// others follow in order.
+struct KindRange {
+  int first, last, code;
+};
+
+constexpr KindRange kKindRanges[] = {{5, 17, 19}, {20, 25, 32}, {26, 26, 39}};
+
+int TypeCodeOf(const CRecord& record) {
+  const int kind = record.Number(kKind, kAny);
+  for (const KindRange& range : kKindRanges) {
+    if (kind >= range.first && kind <= range.last) return range.code + (kind - range.first);
+  }
+  return FindOrderType(kOrderTypeRows, kind, record.Number(kTradeType, kAny),
+                       record.Text(kSide, kAny) == "B");
+}
+
+// The two amounts that records of these kinds or types show.
+struct PairRow {
+  NumberSet selectors;
+  int first, second;
+};
+
+void AppendPair(CResultText& list, const CRecord& record, const PairRow (&rows)[2], int selector) {
+  for (const PairRow& row : rows) {
+    if (!row.selectors.Has(selector)) continue;
+    list.Append(WIRE("%s@%s@"), record.Text(row.first, kAny), record.Text(row.second, kAny));
+    return;
+  }
+  list.AppendText("0@0@");
+}
+
+std::string_view TextOrZero(const CRecord& record, int field) {
+  return record.Has(field) ? record.Text(field, kAny) : "0";
+}
+
+}  // namespace
+
+// What tells the two brokerages' replies apart.
+struct CGatewayStk::PaymentLayout {
+  bool hasTypeText;  // KT is the type, else a code is made
+  int selector;      // the field that selects the pair
+  PairRow pairs[2];
+};
+
+char* CGatewayStk::PaymentEncode(const char* branch, const char* identity, const char* password,
+                                 const char* period, const char* endDate, int* status) {
+  *status = 1;
+  CTextWriter line = StartRequest();
+  if (!WriteQueryHead(line, branch, identity, password)) {
+    *status = -1;
+    return line.Text();
+  }
+  line.AppendText("|FUNC=6|H4=1");
+  if (const char* const code = PeriodCodeOf(period)) {
+    line.Append(WIRE("|SDATE=%s|EDATE="), code);
+  } else {
+    if (AsText(period).empty() || AsText(endDate).empty()) return Fail(line, status, kDateError);
+    line.Append(WIRE("|SDATE=%s|EDATE=%s"), period, endDate);
+  }
+  line.AppendText("|01=");
+  return FinishEscaped(line, status, kBadParameters);
+}
+
+char* CGatewayStk::PaymentDecode(const char* reply, int* status) {
+  static constexpr PaymentLayout kLayout = {
+      false, kKind, {{SetOf(1, 3), k81, k82}, {SetOf(2, 4), k85, k87}}};
+  return ListPayments(reply, kLayout, status);
+}
+
+char* CGatewayStk::PaymentDecodeJZG(const char* reply, int* status) {
+  static constexpr PaymentLayout kLayout = {
+      true, kType, {{SetOf(1, 12, 13), k81, k82}, {SetOf(2, 21, 22), k85, k87}}};
+  return ListPayments(reply, kLayout, status);
+}
+
+// False when the record's type has no code. Between date and type stands an empty field; a sign
+// other than a minus is none.
+bool CGatewayStk::AppendPayment(CResultText& list, const CRecord& record,
+                                const PaymentLayout& layout) {
+  list.Append(WIRE("%s@@"), CTransDate(record.Text(kDate, kAny)).Text());
+  if (layout.hasTypeText) {
+    list.AppendText(record.Text(kType, kAny));
+  } else {
+    const int typeCode = TypeCodeOf(record);
+    if (typeCode == kNoOrderType) return false;
+    list.Append(WIRE("%d"), typeCode);
+  }
+  list.Append(WIRE("@%s@%s@%d@%s@%s@%s@%s@"), record.Text(kStockCode, kAny), record.Text(k47, kAny),
+              ScalePrice(record.Text(kPrice, kAny), 2), record.Text(k49, kAny),
+              record.Text(k79, kAny), record.Text(k78, kAny), record.Text(k84, kAny));
+  AppendPair(list, record, layout.pairs, record.Number(layout.selector, kAny));
+  list.Append(WIRE("%s@%s@%s@%s@%s!"), TextOrZero(record, k86), TextOrZero(record, k89),
+              TextOrZero(record, k88), record.Text(kSign, kAny) == "-" ? "-" : "",
+              record.Text(k97, kAny));
+  return true;
+}
+
+// Both layouts log under one name.
+char* CGatewayStk::ListPayments(const char* reply, const PaymentLayout& layout, int* status) {
+  const std::string_view text = AsText(reply);
+  LogReply("PaymentDecode", text);
+  *status = 1;
+  if (TransportFailed(text, status)) return m_szBuffer;
+  CReplyList payments(text, kTags, kStockListShape);
+  if (char* const answer = AnswerWithoutData(payments, "0!", status)) return answer;
+  CResultText list({m_pData, m_nDataSize, m_nDataLen}, text.size());
+  int count = 0;
+  while (payments.NextData()) {
+    const CRecord& record = payments.Record();
+    if (!record.Has(kStockCode)) continue;
+    if (!AppendPayment(list, record, layout)) return Fail(kOrderKindError, status);
+    ++count;
+  }
+  return FinishList(list, count, status);
+}
