@@ -1,0 +1,546 @@
+// Futures and options orders: the body, the signature payload, the answer.
+
+#include <climits>
+
+#include "gateway/futures/gateway_fut.h"
+#include "tests/unit/session.h"
+
+namespace gateway_tests {
+namespace {
+
+const std::string kParameterError = "[CLIENT]傳入的參數錯誤";
+const std::string kAnyPrice = "17500.0000";
+
+struct TOrder {
+  const char* m_szReference = "";
+  const char* m_szDate = "";
+  const char* m_szCommodity1 = "TXO";
+  const char* m_szCommodity2 = "TXO";
+  const char* m_szMonth1 = "202401";
+  const char* m_szMonth2 = "202402";
+  const char* m_szStrike1 = "17500";
+  const char* m_szStrike2 = "17600";
+  const char* m_szCallPut1 = "C";
+  const char* m_szCallPut2 = "P";
+  int m_nN6 = 0;
+  int m_nKind = 1;
+  int m_nPriceType = 2;
+  char m_chFunction = 'I';
+  char m_chW3 = '0';
+  char m_chTimeInForce = 'R';
+  char m_chSide1 = 'B';
+  char m_chSide2 = 'S';
+  int m_nQuantity = 3;
+  int m_nPrice = 175000000;
+};
+
+TOrder OfKind(int kind, char function = 'I') {
+  TOrder order;
+  order.m_nKind = kind;
+  order.m_chFunction = function;
+  order.m_szReference = "A0001&B0002&C";
+  return order;
+}
+
+class FuturesOrder : public CSessionTest {
+ protected:
+  void SetUp() override {
+    CSessionTest::SetUp();
+    m_gateway.m_nMarket = 101;
+    m_gateway.m_nSeqNo = 7;
+    m_gateway.setSerialNumber("SN0001");
+    m_gateway.setLocalIP("10.0.0.1");
+  }
+
+  /// The body or, when the order is refused, the message; the payload goes to m_payload.
+  std::string Record(const TOrder& o, bool inPlaces = false, const std::string& key = "KEY") {
+    const CRoomAtPageEnd body(CGatewayPub::kBufferSize, '\0');
+    const CRoomAtPageEnd signature(CGatewayPub::kBufferSize, '\0');
+    key.copy(signature, key.size());
+    const auto method =
+        inPlaces ? &CGatewayFut::EncodeSubmitOrderRecord1 : &CGatewayFut::EncodeSubmitOrderRecord;
+    m_nReturned = (m_gateway.*method)(
+        o.m_szReference, o.m_szDate, o.m_szCommodity1, o.m_szCommodity2, o.m_szMonth1, o.m_szMonth2,
+        o.m_szStrike1, o.m_szStrike2, o.m_szCallPut1, o.m_szCallPut2, static_cast<char>(o.m_nN6),
+        static_cast<char>(o.m_nKind), static_cast<char>(o.m_nPriceType), o.m_chFunction, o.m_chW3,
+        o.m_chTimeInForce, 'x', o.m_chSide1, o.m_chSide2, o.m_nQuantity, 99, o.m_nPrice, body,
+        signature);
+    m_payload = std::string(signature);
+    return std::string(body);
+  }
+
+  std::string Request(const TOrder& o, bool signedHead = false) {
+    const auto method =
+        signedHead ? &CGatewayFut::SubmitOrderEncode1 : &CGatewayFut::SubmitOrderEncode;
+    m_nStatus = 0;
+    return (m_gateway.*method)(
+        m_branch.c_str(), m_identity.c_str(), "pw", o.m_szReference, o.m_szDate, o.m_szCommodity1,
+        o.m_szCommodity2, o.m_szMonth1, o.m_szMonth2, o.m_szStrike1, o.m_szStrike2, o.m_szCallPut1,
+        o.m_szCallPut2, static_cast<char>(o.m_nN6), static_cast<char>(o.m_nKind),
+        static_cast<char>(o.m_nPriceType), o.m_chFunction, o.m_chW3, o.m_chTimeInForce, 'x',
+        o.m_chSide1, o.m_chSide2, o.m_nQuantity, 99, o.m_nPrice, &m_nStatus);
+  }
+
+  std::string Decode(const std::string& reply) {
+    m_nStatus = 0;
+    return m_gateway.SubmitOrderDecode(CTextAtPageEnd(reply), &m_nStatus);
+  }
+
+  CGatewayFut m_gateway;
+  std::string m_branch = "F008", m_identity = "A123456789&1234567";
+  std::string m_payload;
+  int m_nReturned = -1;
+  int m_nStatus = 0;
+};
+
+std::string ValueOf(const std::string& text, const std::string& tag) {
+  const size_t at = text.find("|" + tag + "=");
+  if (at == std::string::npos) return "(absent)";
+  const size_t from = at + tag.size() + 2;
+  return text.substr(from, text.find('|', from) - from);
+}
+
+TEST_F(FuturesOrder, ObjectStartsWithoutPositionsAndLogsAsItsBaseAlone) {
+  alignas(CGatewayFut) char memory[sizeof(CGatewayFut)];
+  memset(memory, 0x5a, sizeof memory);
+  auto* gateway = new (memory) CGatewayFut;
+  EXPECT_EQ(gateway->m_nFutDataSize, 0);
+  EXPECT_EQ(gateway->m_nFutDataLen, 0);
+  EXPECT_EQ(gateway->m_pFutData, nullptr);
+  EXPECT_EQ(gateway->m_nOptDataSize, 0);
+  EXPECT_EQ(gateway->m_nOptDataLen, 0);
+  EXPECT_EQ(gateway->m_pOptData, nullptr);
+  EXPECT_EQ(sizeof gateway->m_szSignature, 4096U);
+  EXPECT_TRUE(std::has_virtual_destructor_v<CGatewayFut>);
+  gateway->AppendFutData("futures", 7, false);
+  gateway->AppendOptData("options", 7, false);
+  gateway->~CGatewayFut();
+  EXPECT_EQ(m_log.Take(), TLines{"~CGatewayPub"});
+}
+
+TEST_F(FuturesOrder, BodiesOfNewOrders) {
+  const std::string head =
+      "|27=2|28=0|29=202401|30=3|31=17500.0000|M8=|32=B|33=TXO|34=17500|O4=0|V5=0";
+  const std::string leg2 = "|EL=S|V9=TXO|W0=202402|W1=P|W2=17600|EM=3";
+  const std::string expected[] = {head + "|V6=|V8=C|W3=0", head + "|V6=|V8=C|W3=0",
+                                  head + "|V6=5|V8=C" + leg2 + "|W3=0",
+                                  head + "|V6=7|V8=C" + leg2 + "|W3=0"};
+  for (const bool inPlaces : {false, true}) {
+    for (int kind = 1; kind <= 4; ++kind) {
+      EXPECT_EQ(Record(OfKind(kind), inPlaces), expected[kind - 1]) << kind;
+      EXPECT_EQ(m_nReturned, 1);
+    }
+  }
+}
+
+TEST_F(FuturesOrder, BodiesOfChangesAndCancelsNameTheOrder) {
+  const std::string head =
+      "|27=2|28=0|29=202401|30=3|31=17500.0000|M8=|32=B|33=TXO|34=17500|O4=0|V5=0";
+  const std::string leg2 = "|EL=S|V9=TXO|W0=202402|W1=P|W2=17600";
+  const std::string tail = "|36=A0001|46=B0002|37=3";
+  for (const char function : {'C', 'A', 'D', 'x', '\0', 'i'}) {
+    for (const bool inPlaces : {false, true}) {
+      EXPECT_EQ(Record(OfKind(1, function), inPlaces), head + "|V6=|V8=C" + tail);
+      EXPECT_EQ(Record(OfKind(3, function), inPlaces), head + "|V6=5|V8=C" + leg2 + tail);
+      EXPECT_EQ(Record(OfKind(4, function), inPlaces), head + "|V6=7|V8=C" + leg2 + tail);
+    }
+  }
+}
+
+TEST_F(FuturesOrder, PayloadOfEveryCase) {
+  const std::string one = "_R_B_TXO_202401_17500_C";
+  const std::string two = "_S_TXO_202402_17600_P";
+  const std::string one1 = ",R,0,2,B,TXO,202401,17500,C";
+  const std::string two1 = ",S,TXO,202402,17600,P";
+  const struct {
+    int kind;
+    char function;
+    std::string plain, inPlaces;
+  } rows[] = {
+      {1, 'I', one + "_3_17500.0000", one1 + ",,,,,,3,17500.0000,"},
+      {2, 'I', one + "_3_17500.0000", one1 + ",,,,,,3,17500.0000,"},
+      {3, 'I', one + two + "_3_17500.0000", one1 + two1 + ",3,17500.0000,"},
+      {4, 'I', one + two + "_3_17500.0000", one1 + two1 + ",3,17500.0000,"},
+      {1, 'A', "_A0001", ",R,,,,,,,,,,,,,3,17500.0000,A0001"},
+      {3, 'A', "_A0001", ",R,,,,,,,,,,,,,3,17500.0000,A0001"},
+      {1, 'C', "_A0001_3", ",,,,,,,,,,,,,,3,,A0001"},
+      {4, 'C', "_A0001_3", ",,,,,,,,,,,,,,3,,A0001"},
+      {1, 'D', "_A0001", ",,,,,,,,,,,,,,0,,A0001"},
+      {2, '\0', "_A0001", ",,,,,,,,,,,,,,0,,A0001"},
+  };
+  for (const auto& row : rows) {
+    Record(OfKind(row.kind, row.function));
+    EXPECT_EQ(m_payload, "!!KEY" + row.plain) << row.kind << row.function;
+    Record(OfKind(row.kind, row.function), true);
+    EXPECT_EQ(m_payload, "|PL=S!!KEY" + row.inPlaces) << row.kind << row.function;
+    EXPECT_EQ(std::count(m_payload.begin(), m_payload.end(), ','), 16) << m_payload;
+  }
+}
+
+TEST_F(FuturesOrder, EveryKindNamesWhatItNeeds) {
+  using TText = const char* TOrder::*;
+  const struct {
+    const char* name;
+    TText text;
+    bool neededBy[5];
+  } rows[] = {
+      {"commodity 1", &TOrder::m_szCommodity1, {false, true, true, true, true}},
+      {"month 1", &TOrder::m_szMonth1, {false, true, true, true, true}},
+      {"strike 1", &TOrder::m_szStrike1, {false, false, true, true, false}},
+      {"call/put 1", &TOrder::m_szCallPut1, {false, false, true, true, false}},
+      {"commodity 2", &TOrder::m_szCommodity2, {false, false, false, true, true}},
+      {"month 2", &TOrder::m_szMonth2, {false, false, false, true, true}},
+      {"strike 2", &TOrder::m_szStrike2, {false, false, false, true, false}},
+      {"call/put 2", &TOrder::m_szCallPut2, {false, false, false, true, false}},
+  };
+  for (const auto& row : rows) {
+    for (int kind = 1; kind <= 4; ++kind) {
+      for (const char* missing : {"", static_cast<const char*>(nullptr)}) {
+        for (const char function : {'I', 'D'}) {
+          TOrder order = OfKind(kind, function);
+          order.*row.text = missing;
+          const std::string body = Record(order);
+          EXPECT_EQ(m_nReturned, row.neededBy[kind] ? 0 : 1) << row.name << ", kind " << kind;
+          EXPECT_EQ(body == kParameterError, row.neededBy[kind]) << row.name << ", kind " << kind;
+          EXPECT_EQ(m_payload == "KEY", row.neededBy[kind]);
+        }
+      }
+    }
+  }
+}
+
+TEST_F(FuturesOrder, KindOneWithEmptyStrikeAndCallPutPassesAndKindTwoDoesNot) {
+  TOrder order = OfKind(1);
+  order.m_szStrike1 = order.m_szCallPut1 = "";
+  EXPECT_EQ(ValueOf(Record(order), "V6"), "");
+  EXPECT_EQ(m_payload, "!!KEY_R_B_TXO_202401___3_17500.0000");
+  Record(order, true);
+  EXPECT_EQ(m_payload, "|PL=S!!KEY,R,0,2,B,TXO,202401,,,,,,,,3,17500.0000,");
+  order = OfKind(2);
+  order.m_szCallPut1 = "";
+  EXPECT_EQ(Record(order), kParameterError);
+}
+
+TEST_F(FuturesOrder, KindsBesidesTheFourAreRefused) {
+  for (int kind = -128; kind <= 127; ++kind) {
+    Record(OfKind(kind));
+    EXPECT_EQ(m_nReturned, kind >= 1 && kind <= 4 ? 1 : 0) << kind;
+  }
+}
+
+TEST_F(FuturesOrder, PriceTypesOneAndThreeAreAtTheMarketAndAllAreSentUnsigned) {
+  for (int type = -128; type <= 127; ++type) {
+    TOrder order = OfKind(1);
+    order.m_nPriceType = type;
+    const std::string body = Record(order, true);
+    const bool market = type == 1 || type == 3;
+    EXPECT_EQ(ValueOf(body, "31"), market ? "00000000.000000" : kAnyPrice) << type;
+    const std::string printed = std::to_string(type & 0xff);
+    EXPECT_EQ(ValueOf(body, "27"), printed);
+    EXPECT_NE(m_payload.find(",R,0," + printed + ",B,"), std::string::npos) << m_payload;
+  }
+}
+
+TEST_F(FuturesOrder, PricesAndQuantitiesAtTheirEnds) {
+  const struct {
+    int price;
+    const char* text;
+  } prices[] = {{INT_MIN, "-214748.-3648"},
+                {-1, "0.-001"},
+                {0, "0.0000"},
+                {1, "0.0001"},
+                {99, "0.0099"},
+                {100, "0.0100"},
+                {9999, "0.9999"},
+                {10000, "1.0000"},
+                {INT_MAX, "214748.3647"}};
+  for (const auto& row : prices) {
+    TOrder order = OfKind(1);
+    order.m_nPrice = row.price;
+    EXPECT_EQ(ValueOf(Record(order), "31"), row.text);
+    EXPECT_EQ(m_payload, std::string("!!KEY_R_B_TXO_202401_17500_C_3_") + row.text);
+  }
+  for (const int quantity : {INT_MIN, -1, 0, 1, 99, 100, INT_MAX}) {
+    const std::string printed = std::to_string(quantity);
+    TOrder order = OfKind(3);
+    order.m_nQuantity = quantity;
+    const std::string body = Record(order);
+    EXPECT_EQ(ValueOf(body, "30"), printed);
+    EXPECT_EQ(ValueOf(body, "EM"), printed);
+    order.m_chFunction = 'C';
+    EXPECT_EQ(ValueOf(Record(order), "37"), printed);
+    EXPECT_EQ(m_payload, "!!KEY_A0001_" + printed);
+  }
+}
+
+TEST_F(FuturesOrder, TimeInForceSetsOneFlagAtMost) {
+  for (int letter = 0; letter <= 255; ++letter) {
+    TOrder order = OfKind(1);
+    order.m_chTimeInForce = static_cast<char>(letter);
+    const std::string body = Record(order);
+    EXPECT_EQ(ValueOf(body, "O4"), letter == 'F' ? "1" : "0") << letter;
+    EXPECT_EQ(ValueOf(body, "V5"), letter == 'I' ? "1" : "0") << letter;
+  }
+}
+
+TEST_F(FuturesOrder, CombinationCodes) {
+  const std::string sixteen(16, 'c');
+  const std::string eight(8, 'p');
+  const struct {
+    const char* name;
+    char side1, side2;
+    std::string commodity1, commodity2, month1, month2, callPut1, callPut2;
+    const char* code;
+  } rows[] = {
+      {"equal sides, equal commodities", 'B', 'B', "TXO", "TXO", "1", "2", "C", "P", "3"},
+      {"equal sides, other commodities", 'B', 'B', "TXO", "TEO", "1", "1", "C", "C", "4"},
+      {"sides are compared as they are", 'x', 'x', "TXO", "TXO", "1", "1", "C", "C", "3"},
+      {"equal in 16 characters", 'S', 'S', sixteen + "1", sixteen + "2", "1", "1", "C", "C", "3"},
+      {"other in the 16th", 'S', 'S', sixteen.substr(1) + "1", sixteen.substr(1) + "2", "1", "1",
+       "C", "C", "4"},
+      {"one is a start of the other", 'S', 'S', "TXO", "TXO1", "1", "1", "C", "C", "4"},
+      {"other call/put", 'B', 'S', "TXO", "TXO", "1", "1", "C", "P", "5"},
+      {"call/put other in the 8th", 'B', 'S', "TXO", "TXO", "1", "1", eight.substr(1) + "1",
+       eight.substr(1) + "2", "5"},
+      {"call/put equal in 8", 'B', 'S', "TXO", "TXO", "1", "1", eight + "1", eight + "2", "1"},
+      {"equal months", 'B', 'S', "TXO", "TXO", "202401", "202401", "C", "C", "1"},
+      {"commodities do not matter then", 'S', 'B', "TXO", "TEO", "202401", "202401", "P", "P", "1"},
+      {"other months", 'B', 'S', "TXO", "TXO", "202401", "202402", "C", "C", "2"},
+      {"months equal in 16", 'B', 'S', "TXO", "TXO", sixteen + "1", sixteen + "2", "C", "C", "1"},
+  };
+  for (const auto& row : rows) {
+    TOrder order = OfKind(3);
+    order.m_chSide1 = row.side1;
+    order.m_chSide2 = row.side2;
+    order.m_szCommodity1 = row.commodity1.c_str();
+    order.m_szCommodity2 = row.commodity2.c_str();
+    order.m_szMonth1 = row.month1.c_str();
+    order.m_szMonth2 = row.month2.c_str();
+    order.m_szCallPut1 = row.callPut1.c_str();
+    order.m_szCallPut2 = row.callPut2.c_str();
+    EXPECT_EQ(ValueOf(Record(order), "V6"), row.code) << row.name;
+    order.m_nKind = 4;
+    EXPECT_EQ(ValueOf(Record(order), "V6"), "7") << row.name;
+    order.m_nKind = 2;
+    EXPECT_EQ(ValueOf(Record(order), "V6"), "") << row.name;
+  }
+}
+
+TEST_F(FuturesOrder, NulCharacterEndsItsOwnPieceAlone) {
+  TOrder order = OfKind(3);
+  order.m_chSide1 = '\0';
+  EXPECT_EQ(Record(order),
+            "|27=2|28=0|29=202401|30=3|31=17500.0000|M8=|32=|O4=0|V5=0|V6=5|V8=C"
+            "|EL=S|V9=TXO|W0=202402|W1=P|W2=17600|EM=3|W3=0");
+  EXPECT_EQ(m_payload, "!!KEY_R_");
+  Record(order, true);
+  EXPECT_EQ(m_payload, "|PL=S!!KEY,R,0,2,");
+
+  order = OfKind(4);
+  order.m_chSide2 = '\0';
+  EXPECT_EQ(Record(order),
+            "|27=2|28=0|29=202401|30=3|31=17500.0000|M8=|32=B|33=TXO|34=17500|O4=0|V5=0|V6=7|V8=C"
+            "|EL=|W3=0");
+  EXPECT_EQ(m_payload, "!!KEY_R_B_TXO_202401_17500_C_");
+
+  order = OfKind(1);
+  order.m_chW3 = '\0';
+  EXPECT_EQ(ValueOf(Record(order, true), "W3"), "");
+  EXPECT_EQ(m_payload, "|PL=S!!KEY,R,");
+  Record(order);
+  EXPECT_EQ(m_payload, "!!KEY_R_B_TXO_202401_17500_C_3_17500.0000");
+
+  order = OfKind(1, 'A');
+  order.m_chTimeInForce = '\0';
+  Record(order, true);
+  EXPECT_EQ(m_payload, "|PL=S!!KEY,");
+  order.m_chFunction = 'I';
+  Record(order);
+  EXPECT_EQ(m_payload, "!!KEY_");
+}
+
+TEST_F(FuturesOrder, ReferenceValuesOfOneTo47Characters) {
+  const std::string fits(47, 'r');
+  const std::string tooLong(48, 'r');
+  const struct {
+    std::string reference, first, second;
+  } rows[] = {
+      {"", "", ""},
+      {"A", "A", ""},
+      {"A&", "A", ""},
+      {"&B", "", "B"},
+      {"A&B", "A", "B"},
+      {"A&B&C", "A", "B"},
+      {"A&&C", "A", ""},
+      {"&", "", ""},
+      {fits + "&" + fits, fits, fits},
+      {tooLong + "&B", "", "B"},
+      {"A&" + tooLong, "A", ""},
+      {std::string(5000, 'x') + "&B", "", "B"},
+      {tooLong, "", ""},
+  };
+  for (const auto& row : rows) {
+    TOrder order = OfKind(1, 'D');
+    order.m_szReference = row.reference.c_str();
+    const std::string body = Record(order);
+    EXPECT_EQ(ValueOf(body, "36"), row.first);
+    EXPECT_EQ(ValueOf(body, "46"), row.second);
+    EXPECT_EQ(m_payload, "!!KEY_" + row.first);
+  }
+}
+
+TEST_F(FuturesOrder, RecordGoesBehindWhatTheBodyHeldAndFailsAlone) {
+  const CRoomAtPageEnd body(CGatewayPub::kBufferSize, '\0');
+  const CRoomAtPageEnd signature(CGatewayPub::kBufferSize, '\0');
+  const auto encode = [&](char kind, const char* commodity) {
+    return m_gateway.EncodeSubmitOrderRecord("", "", commodity, "", "1", "", "", "", "", "", 0,
+                                             kind, 1, 'I', 'w', 'R', 0, 'B', 0, 1, 0, 0, body,
+                                             signature);
+  };
+  strcpy(body, "before");
+  EXPECT_EQ(encode(1, "T"), 1);
+  EXPECT_STREQ(body,
+               "before|27=1|28=0|29=1|30=1|31=00000000.000000|M8=|32=B|33=T|34=|O4=0|V5=0|V6=|V8="
+               "|W3=w");
+  EXPECT_EQ(encode(9, "T"), 0);
+  EXPECT_EQ(std::string(body), kParameterError);
+  const std::string huge(5000, 'T');
+  EXPECT_EQ(encode(1, huge.c_str()), 0);
+  EXPECT_EQ(std::string(body), kParameterError);
+}
+
+TEST_F(FuturesOrder, PayloadThatDoesNotFitIsAParameterError) {
+  EXPECT_EQ(Record(OfKind(1), false, std::string(4000, 'k')).substr(0, 4), "|27=");
+  EXPECT_EQ(m_payload.size(), 2 + 4000 + strlen("_R_B_TXO_202401_17500_C_3_17500.0000"));
+  EXPECT_EQ(Record(OfKind(1), false, std::string(4095, 'k')), kParameterError);
+  EXPECT_EQ(m_nReturned, 0);
+}
+
+const std::string kHead =
+    "F=1|KIND=F|BHNO=F008|CB=1|IP=10.0.0.1|11=NO DEFINE|VER=24369|SN=SN0001|65=0013452107|14=I"
+    "|15=0|IDNO=A123456789|ACNO=1234567|PWD=pw|21=20240115|22=134521|23=13452107|24=5|V4=";
+const std::string kBody =
+    "|27=2|28=0|29=202401|30=3|31=17500.0000|M8=|32=B|33=TXO|34=17500|O4=0|V5=0|V6=|V8=C|W3=0";
+
+TEST_F(FuturesOrder, RequestIsHeaderBodyN6AndPayload) {
+  TOrder order = OfKind(2);
+  order.m_szDate = "1130116";
+  order.m_nN6 = -1;
+  EXPECT_EQ(Request(order), kHead + "|44=20240116" + kBody +
+                                "|N6=255!!F008_1234567_A123456789_I_R_B_TXO_202401_17500_C_3_"
+                                "17500.0000");
+  EXPECT_EQ(m_nStatus, 1);
+  EXPECT_STREQ(m_gateway.m_szSignature,
+               "!!F008_1234567_A123456789_I_R_B_TXO_202401_17500_C_3_17500.0000");
+  EXPECT_EQ(m_log.Take(), TLines{kHead + "|44=20240116"});
+  EXPECT_EQ(Request(order, true),
+            kHead + kBody +
+                "|N6=255|PL=S!!SN0001,10.0.0.1,20240115,F008-1234567,A123456789,I,R,0,2,B,TXO,"
+                "202401,17500,C,,,,,,3,17500.0000,");
+  EXPECT_EQ(m_nStatus, 1);
+  EXPECT_EQ(m_log.Take(), TLines{kHead});
+}
+
+TEST_F(FuturesOrder, N6IsSentUnsigned) {
+  for (int n6 = -128; n6 <= 127; ++n6) {
+    TOrder order = OfKind(1);
+    order.m_nN6 = n6;
+    const std::string request = Request(order, true);
+    EXPECT_EQ(ValueOf(request, "N6"), std::to_string(n6 & 0xff));
+  }
+}
+
+TEST_F(FuturesOrder, RefusedBodyStandsBehindItsHeader) {
+  for (const bool signedHead : {false, true}) {
+    EXPECT_EQ(Request(OfKind(5), signedHead), kHead + kParameterError);
+    EXPECT_EQ(m_nStatus, -1);
+  }
+}
+
+TEST_F(FuturesOrder, RefusedHeaderIsItsMessageAlone) {
+  for (const bool signedHead : {false, true}) {
+    m_identity = "1";
+    EXPECT_EQ(Request(OfKind(1), signedHead), "[CLIENT] 帳號或身份證字號輸入錯誤");
+    EXPECT_EQ(m_nStatus, -1);
+    m_identity = "1234567";
+    m_gateway.setLocalIP("");
+    EXPECT_EQ(Request(OfKind(1), signedHead), "[CLIENT] 無法取得IP，請確認網路連線是否正常！");
+    EXPECT_EQ(m_nStatus, -1);
+    m_gateway.setLocalIP("10.0.0.1");
+  }
+}
+
+TEST_F(FuturesOrder, RequestOfTheBuffersSizeIsWholeAndALongerOneAParameterError) {
+  for (const bool signedHead : {false, true}) {
+    TOrder order = OfKind(1);
+    const std::string bare = Request(order, signedHead);
+    // The commodity stands in the request twice.
+    const size_t room = (CGatewayPub::kBufferSize - 1 - bare.size()) / 2;
+    std::string commodity = "TXO" + std::string(room, 'X');
+    order.m_szCommodity1 = commodity.c_str();
+    const std::string longest = Request(order, signedHead);
+    EXPECT_EQ(longest.size(), bare.size() + 2 * room);
+    EXPECT_EQ(m_nStatus, 1);
+    commodity += "X";
+    order.m_szCommodity1 = commodity.c_str();
+    EXPECT_EQ(Request(order, signedHead), kParameterError);
+    EXPECT_EQ(m_nStatus, -1);
+    for (const size_t size : {4096U, 65536U}) {
+      m_branch.assign(size, 'b');
+      EXPECT_EQ(Request(OfKind(1), signedHead), kParameterError);
+      EXPECT_EQ(Request(OfKind(0), signedHead), kParameterError);
+      EXPECT_EQ(m_nStatus, -1);
+      m_branch = "F008";
+    }
+  }
+}
+
+struct TAnswer {
+  const char* name;
+  std::string reply, result;
+  int status;
+};
+
+TEST_F(FuturesOrder, Answers) {
+  const std::string good = "F=1|39= |19=S|46=A0001|44=1130115";
+  const TAnswer rows[] = {
+      {"empty reply", "", "委託單傳送中!!", 1},
+      {"gateway down", "[GATEWAY]error", "[GATEWAY]主機連線失敗", -1},
+      {"broker down", good + "|[BROKER]timeout", "[BROKER]主機連線失敗", -1},
+      {"S", good, "A0001@20240115@@1@@!", 1},
+      {"T", "|39= |19=T|46=A|44=", "A@@@1@@!", 1},
+      {"Y", "|39= |19=Y|46=A|44=20240115", "A@1130115@@1@@!", 1},
+      {"X is not accepted", "|39= |19=X|46=A|44=1130115|MT=1", "A@20240115@@0@1@!", 1},
+      {"first character of 19 judges", "|39= |19=XS|46=A", "A@@@0@@!", 1},
+      {"first character of 19 judges, accepted", "|39= |19=SX|46=A", "A@@@1@@!", 1},
+      {"first character of MT", good + "|MT=0x", "A0001@20240115@@1@0@!", 1},
+      {"other MT", good + "|MT=2", "A0001@20240115@@1@@!", 1},
+      {"lower case is no such code", "|39= |19=s|K1=no", "no", -1},
+      {"empty 19", "|39= |19=|K1=no", "no", -1},
+      {"no 19", "|39= |K1=no", "no", -1},
+      {"19 takes the first K1 as it is", "|39= |19=N|K1= |K1=no", " ", -1},
+      {"no 39", "|19=S|46=A|K1=no", "no", -1},
+      {"39 of two blanks", "|39=  |19=S|46=A|K1=no", "no", -1},
+      {"empty 39", "|39=|19=S|46=A|K1=no", "no", -1},
+      {"39 passes over blank K1", "|39=E|K1=|K1= |K1=no", "no", -1},
+      {"39 without K1", "|39=E", "", -1},
+      {"39 at the very start is not found", "39= |19=S|46=A|K1=no", "no", -1},
+      {"K1 of 127", "|39=E|K1=" + std::string(127, 'k'), std::string(127, 'k'), -1},
+      {"K1 of 128 is dropped", "|39=E|K1=" + std::string(128, 'k'), "", -1},
+      {"46 of 127", "|39= |19=S|46=" + std::string(127, 'n'), std::string(127, 'n') + "@@@1@@!", 1},
+      {"46 of 128 is dropped", "|39= |19=S|46=" + std::string(128, 'n'), "@@@1@@!", 1},
+      {"44 of 15", "|39= |19=S|44=123456789012345", "@123456789012345@@1@@!", 1},
+      {"44 of 16 is dropped", "|39= |19=S|44=1234567890123456", "@@@1@@!", 1},
+      {"19 of 127", "|39= |19=S" + std::string(126, 'x'), "@@@1@@!", 1},
+      {"19 of 128 is dropped", "|39= |19=S" + std::string(127, 'x') + "|K1=no", "no", -1},
+  };
+  for (const TAnswer& row : rows) {
+    EXPECT_EQ(Decode(row.reply), row.result) << row.name;
+    EXPECT_EQ(m_nStatus, row.status) << row.name;
+  }
+  EXPECT_STREQ(m_gateway.SubmitOrderDecode(nullptr, &m_nStatus), "委託單傳送中!!");
+  EXPECT_EQ(m_log.Take(), TLines{});
+}
+
+}  // namespace
+}  // namespace gateway_tests
