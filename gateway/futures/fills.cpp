@@ -117,10 +117,7 @@ char* CGatewayFut::QueryReplyEncode(const char* branch, const char* identity, co
 char* CGatewayFut::QueryReplyDecode(const char* reply, int* status) {
   *status = 1;
   const std::string_view text = AsText(reply);
-  if (text.empty()) return Fail(kNoReply, status);
-  const std::string_view code = ReplyCode(text);
-  if (code == kNoData) return Answer("0!");
-  if (code != kDone) return RefuseList(text, code, status);
+  if (char* const answer = AnswerWithoutRecords(text, "0!", status)) return answer;
 
   CReplyList fills(text, kTags, kShape);
   CResultText list({m_pData, m_nDataSize, m_nDataLen}, text.size());

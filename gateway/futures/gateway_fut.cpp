@@ -44,7 +44,12 @@ char* CGatewayFut::GetResultCode(const char* reply, char* out, int size) {
   return out;
 }
 
-char* CGatewayFut::RefuseList(std::string_view reply, std::string_view code, int* status) {
+char* CGatewayFut::AnswerWithoutRecords(std::string_view reply, std::string_view noData,
+                                        int* status) {
+  if (reply.empty()) return Fail(kNoReply, status);
+  const std::string_view code = ReplyCode(reply);
+  if (code == kDone) return nullptr;
+  if (code == kNoData) return Answer(noData);
   *status = -1;
   CTextWriter answer(m_szBuffer, sizeof m_szBuffer);
   WriteReplyCode(code, reply, answer);

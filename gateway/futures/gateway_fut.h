@@ -121,8 +121,10 @@ class CGatewayFut : public CGatewayPub {
   bool StartQuery(CTextWriter& line, const char* branch, const char* identity, const char* password,
                   int* status);
 
-  // Ends a list of fills or positions that the reply as a whole refuses, in GetResultCode's words.
-  char* RefuseList(std::string_view reply, std::string_view code, int* status);
+  // Ends the decoder of a list of fills or positions that the reply as a whole refuses, in
+  // GetResultCode's words, or that has nothing to show, which the user interface knows as `noData`.
+  // Null when there are records to read.
+  char* AnswerWithoutRecords(std::string_view reply, std::string_view noData, int* status);
 };
 
 #endif  // QUORVANE_GATEWAY_FUTURES_GATEWAY_FUT_H_

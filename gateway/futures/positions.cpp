@@ -153,10 +153,7 @@ char* CGatewayFut::QueryInventoryEncode(const char* branch, const char* identity
 char* CGatewayFut::QueryInventoryDecode(const char* reply, int* status) {
   *status = 1;
   const std::string_view text = AsText(reply);
-  if (text.empty()) return Fail(kNoReply, status);
-  const std::string_view code = ReplyCode(text);
-  if (code == kNoData) return Answer("<5>!0!<6>!0!");
-  if (code != kDone) return RefuseList(text, code, status);
+  if (char* const answer = AnswerWithoutRecords(text, "<5>!0!<6>!0!", status)) return answer;
 
   CReplyList positions(text, kTags, kShape);
   CResultText futures(FutText(), kSectionPerReply * text.size());
