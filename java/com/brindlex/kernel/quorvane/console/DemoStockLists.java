@@ -109,7 +109,7 @@ final class DemoStockLists {
         sections(stage, positions, 2, 1, 1);
         String settled = stage.ask("Settlement of today", settlement("1", ""), gatewayjni::PaymentDecodeJZG, 1);
         List<List<String>> records = ResultLayout.list(settled);
-        stage.table(ResultLayout.SETTLEMENT, records, 1);
+        stage.table(ResultLayout.SETTLEMENT_JZG, records, 1);
         stage.field(records, 0, 2, "12");
         stage.use(standard);
     }

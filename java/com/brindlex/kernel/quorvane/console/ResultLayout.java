@@ -22,6 +22,8 @@ public enum ResultLayout {
     CREDIT("stock", "margin (76)", "short (77)", "B8", "B9", "A0", "A1", "A2"),
     SETTLEMENT("date", "", "type", "stock", "shares", "price", "amount", "fee", "tax", "~84",
             "81/85", "82/87", "~86", "~89", "~88", "sign", "net"),
+    SETTLEMENT_JZG("date", "", "KT", "stock", "shares", "price", "amount", "fee", "tax", "~84",
+            "81/85", "82/87", "~86", "~89", "~88", "sign", "net"),
     FUTURES_ORDERS("~gateway no.", "order", "legs", "contract", "ordered", "state", "filled",
             "cancelled", "price", "~time", "~entered", "~order date", "~N6", "~change",
             "~in force", "~MT"),
