@@ -171,6 +171,15 @@ TEST_F(StockLists, RecordTooLongForItsBufferIsSkipped) {
   EXPECT_EQ(ReadFills(tooLong + fits), (Answer{"[GATEWAY]", -1})) << "first";
 }
 
+TEST_F(StockLists, CodeAndSequenceHaveBuffersOf20Bytes) {
+  const std::string code(19, 'E');
+  EXPECT_EQ(ReadFills(Record({{"68", code}})), (Answer{"[GATEWAY](" + code + ")", -1}));
+  EXPECT_EQ(ReadFills(Record({{"68", code + "E"}})), (Answer{"[GATEWAY]", -1}));
+  const std::string sequence = std::string(13, '0') + "900000";
+  EXPECT_EQ(ReadFills(Record(With(kFill, "67", sequence))), (Answer{"0!", 1}));
+  EXPECT_EQ(ReadFills(Record(With(kFill, "67", "0" + sequence))).text.substr(0, 2), "1!");
+}
+
 TEST_F(StockLists, OneOrderWithoutACodeFailsTheWholeList) {
   EXPECT_EQ(ReadBook(Record(kOrder) + Record(With(kOrder, "27", "9")) + kEnd),
             (Answer{kKindError, -1}));
