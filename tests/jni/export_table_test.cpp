@@ -2,7 +2,6 @@
 
 #include <gtest/gtest.h>
 
-#include <iostream>
 #include <set>
 #include <string>
 
@@ -10,9 +9,6 @@
 
 namespace gateway_tests {
 namespace {
-
-/// True once all operations exist; a missing export is then a failure.
-constexpr bool kAllExportsExist = false;
 
 TEST(ExportTable, HoldsEachMethodOnce) {
   std::set<std::string_view> names;
@@ -39,15 +35,7 @@ TEST(ExportTable, EachMethodIsExported) {
   for (const TExport& row : AllExports()) {
     if (row.EntryPoint() == nullptr) missing.append(" ").append(row.m_szName);
   }
-  if (kAllExportsExist) {
-    EXPECT_EQ(missing, "");
-  } else if (!missing.empty()) {
-    std::cout << "not exported yet:" << missing << '\n';
-  }
-  EXPECT_NE(FindExport("AuthEncode")->EntryPoint(), nullptr);
-  EXPECT_NE(FindExport("AuthDecode")->EntryPoint(), nullptr);
-  EXPECT_NE(FindExport("GetTotalAccountEncode")->EntryPoint(), nullptr);
-  EXPECT_NE(FindExport("GetTotalAccountDecode")->EntryPoint(), nullptr);
+  EXPECT_EQ(missing, "");
 }
 
 }  // namespace
