@@ -162,7 +162,7 @@ public final class Screen {
     }
 
     /** Columns that a text takes: characters of the East Asian scripts take two. */
-    static int width(String text) {
+    public static int width(String text) {
         return text.codePoints().map(c -> isWide(c) ? 2 : 1).sum();
     }
 

@@ -4,10 +4,18 @@ package com.brindlex.kernel.quorvane.typed;
 public final class Fault {
     private final int offset;
     private final String text;
+    private final boolean shape;
 
+    /** A value that is wrong. */
     Fault(int offset, String text) {
+        this(offset, text, false);
+    }
+
+    /** A value that is wrong, or a whole record or list that has another shape. */
+    Fault(int offset, String text, boolean shape) {
         this.offset = offset;
         this.text = text;
+        this.shape = shape;
     }
 
     /** Characters before the place. */
@@ -18,6 +26,11 @@ public final class Fault {
     /** What is wrong there. */
     public String text() {
         return text;
+    }
+
+    /** Whether a record or list has another shape than its table; else a value is wrong. */
+    public boolean isShape() {
+        return shape;
     }
 
     @Override

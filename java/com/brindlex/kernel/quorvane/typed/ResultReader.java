@@ -58,7 +58,7 @@ final class ResultReader {
     }
 
     private void fault(int offset, String what) {
-        faults.add(new Fault(offset, what));
+        faults.add(new Fault(offset, what, true));
     }
 
     /** One record; a text without fields is a message: the order is on its way. */

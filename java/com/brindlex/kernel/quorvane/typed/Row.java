@@ -72,9 +72,8 @@ public final class Row {
         List<String> fields = split(record, '@', Integer.MAX_VALUE);
         table.fillGaps(fields);
         if (fields.size() != table.positions()) {
-            faults.add(new Fault(offset,
-                    "a record of " + fields.size() + " fields where " + table.positions()
-                            + " make a " + table.name()));
+            faults.add(new Fault(offset, "a record of " + fields.size() + " fields; "
+                    + table.name() + " has " + table.positions(), true));
         }
         List<Cell<?>> cells = new ArrayList<Cell<?>>();
         int at = offset;

@@ -187,7 +187,7 @@ class ResultTest {
     void damageHasAPlace() {
         assertEquals("[at character 1: 2 records announced, 1 there]",
                 faults(Operation.QUERY_ORDER_DECODE, "2!" + ORDER));
-        assertEquals("[at character 3: a record of 13 fields where 14 make a stock order]",
+        assertEquals("[at character 3: a record of 13 fields; stock order has 14]",
                 faults(Operation.QUERY_ORDER_DECODE, "1!" + ORDER.replace("@2!", "!")));
         assertEquals("[at character 19: ordered is no whole number]",
                 faults(Operation.QUERY_ORDER_DECODE, "1!" + ORDER.replace("5000", "5O00")));
