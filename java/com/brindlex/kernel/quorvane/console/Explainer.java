@@ -21,7 +21,8 @@ public final class Explainer {
     private static final Pattern LENGTH = Pattern.compile("(\\w+): Len:([0-9]+)|regMsg Len:[0-9]+");
     private static final Pattern LOG_MARK = Pattern.compile(
             "~CGateway\\w+|\\[(?:strResult2?|status)\\].*|test1"
-            + "|(?:gatewayjni_)?GetCertEncode2?(?:_+[0-9])?|Java_com_brindlex_kernel_quorvane_gatewayjni_\\w+");
+            + "|(?:gatewayjni_)?GetCertEncode2?(?:_+[0-9])?"
+            + "|Java_com_brindlex_kernel_quorvane_gatewayjni_\\w+");
     private static final Pattern RESULT = Pattern.compile(
             "(?s)[0-9]{1,9}!.*|<[0-9]>!.*|[^|]*@.*!|[^|=]*@[^|=]*@[^=]*");
     private static final Pattern FIELDS =

@@ -12,10 +12,10 @@ final class RequestForm {
      *
      * @param operations the operations with that form
      * @param reach characters that are in order
-     * @param agreement pieces of the form that stand anywhere in the text
+     * @param agreement pieces of the form that stand anywhere in the text, less those that do not
      * @param expected what should stand there; null when the whole text is in order
      */
-    record Match(List<Operation> operations, int reach, long agreement, String expected) {
+    record Match(List<Operation> operations, int reach, int agreement, String expected) {
         boolean isWhole() {
             return expected == null;
         }
@@ -33,7 +33,7 @@ final class RequestForm {
 
     /** Finds the operations whose form the text follows longest. */
     static Match match(String text, Operation hint) {
-        Match best = new Match(List.of(), 0, 0, "F=");
+        Match best = new Match(List.of(), 0, Integer.MIN_VALUE, "F=");
         for (Operation operation : Operation.values()) {
             if (hint == null || operation == hint) {
                 for (String form : operation.requestForms()) {
@@ -48,7 +48,7 @@ final class RequestForm {
     private static Match better(Match best, Match found) {
         int order = Boolean.compare(found.isWhole(), best.isWhole());
         order = order == 0 ? Integer.compare(found.reach(), best.reach()) : order;
-        order = order == 0 ? Long.compare(found.agreement(), best.agreement()) : order;
+        order = order == 0 ? Integer.compare(found.agreement(), best.agreement()) : order;
         if (order == 0 && !best.operations().containsAll(found.operations())) {
             List<Operation> both = new ArrayList<>(best.operations());
             both.addAll(found.operations());
@@ -69,8 +69,8 @@ final class RequestForm {
     private Match follow(String form, Operation operation) {
         String[] literals = form.replace("~", "").split("\\*", -1);
         walk(literals);
-        long agreement =
-                Arrays.stream(literals).filter(part -> text.contains(part.trim())).count();
+        int agreement = Arrays.stream(literals)
+                                .mapToInt(part -> text.contains(part.trim()) ? 1 : -1).sum();
         return new Match(List.of(operation), reach, agreement, expected);
     }
 

@@ -71,8 +71,8 @@ class RandomReplyTest {
             String good = decoder.decode(reply(decoder, random)).text();
             int at = random.nextInt(good.length() + 1);
             int to = Math.min(good.length(), at + random.nextInt(2));
-            touch(Result.of(decoder, 1,
-                    good.substring(0, at) + garbage(random, random.nextInt(2)) + good.substring(to)));
+            String middle = garbage(random, random.nextInt(2));
+            touch(Result.of(decoder, 1, good.substring(0, at) + middle + good.substring(to)));
         }
     }
 

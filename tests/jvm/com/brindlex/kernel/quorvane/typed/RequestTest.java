@@ -166,7 +166,8 @@ class RequestTest {
         Encoded none = Requests.login(SESSION.withLocalAddress(""), USER).encode();
         assertFalse(none.isSuccess());
         assertEquals(Message.Source.CLIENT, none.message().source());
-        Encoded notice = Requests.stockNotice(SESSION, Credentials.of("9A01", "", "", "x")).encode();
+        Credentials nobody = Credentials.of("9A01", "", "", "x");
+        Encoded notice = Requests.stockNotice(SESSION, nobody).encode();
         assertFalse(notice.isSuccess());
         assertEquals(-1, notice.status());
     }

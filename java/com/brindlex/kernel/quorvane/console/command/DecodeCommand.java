@@ -1,0 +1,58 @@
+package com.brindlex.kernel.quorvane.console.command;
+
+import com.brindlex.kernel.quorvane.typed.Operation;
+import com.brindlex.kernel.quorvane.typed.Result;
+import java.util.concurrent.Callable;
+import picocli.CommandLine.Command;
+import picocli.CommandLine.Model.CommandSpec;
+import picocli.CommandLine.Option;
+import picocli.CommandLine.ParameterException;
+import picocli.CommandLine.Parameters;
+import picocli.CommandLine.ParentCommand;
+import picocli.CommandLine.Spec;
+
+/** Reads a reply. */
+@Command(name = "decode", mixinStandardHelpOptions = true, sortOptions = false,
+        description = "Reads a reply and shows its rows.")
+final class DecodeCommand implements Callable<Integer> {
+    @ParentCommand
+    private Quorvane parent;
+
+    @Spec
+    private CommandSpec spec;
+
+    @Parameters(index = "0", paramLabel = "OPERATION", converter = Quorvane.OperationName.class,
+            description = "The decoder, for example AuthDecode.")
+    private Operation operation;
+
+    @Parameters(index = "1", arity = "0..1", paramLabel = "FILE", defaultValue = "-",
+            description = "The reply; the standard input without it or for '-'.")
+    private String file;
+
+    @Option(names = "--market", paramLabel = "INT", defaultValue = "0",
+            description = "Market code, for the stock order book.")
+    private int market;
+
+    @Option(names = "--raw", description = "Write the bare result text.")
+    private boolean raw;
+
+    @Override
+    public Integer call() {
+        if (operation.isEncoder()) {
+            throw new ParameterException(spec.commandLine(), operation.method()
+                            + " builds requests; its replies are read by " + operation.decoders());
+        }
+        Terminal terminal = parent.terminal();
+        // the line feed that ends a file is no part of the reply
+        String reply = Terminal.read(spec, file).replaceFirst("\\r?\\n\\z", "");
+        Result result = operation.decode(market, reply);
+        if (terminal.isJson()) {
+            terminal.json(Shown.json(result));
+        } else if (raw) {
+            terminal.raw(result.text());
+        } else {
+            Shown.result(terminal, result);
+        }
+        return result.isSuccess() ? 0 : 1;
+    }
+}

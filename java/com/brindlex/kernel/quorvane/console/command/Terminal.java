@@ -1,0 +1,69 @@
+package com.brindlex.kernel.quorvane.console.command;
+
+import com.brindlex.kernel.quorvane.console.Json;
+import com.brindlex.kernel.quorvane.console.Screen;
+import com.brindlex.kernel.quorvane.console.Screen.Style;
+import java.io.IOException;
+import java.io.PrintStream;
+import java.nio.charset.StandardCharsets;
+import java.nio.file.Files;
+import java.nio.file.NoSuchFileException;
+import java.nio.file.Path;
+import picocli.CommandLine;
+import picocli.CommandLine.Model.CommandSpec;
+
+/** Where commands read and write: texts with colours, or JSON. */
+final class Terminal {
+    private final PrintStream out;
+    private final PrintStream err;
+    private final boolean json;
+    private final Screen screen;
+
+    Terminal(boolean json, boolean colours) {
+        this.out = new PrintStream(System.out, true, StandardCharsets.UTF_8);
+        this.err = new PrintStream(System.err, true, StandardCharsets.UTF_8);
+        this.json = json;
+        this.screen = new Screen(out, colours);
+    }
+
+    boolean isJson() {
+        return json;
+    }
+
+    Screen screen() {
+        return screen;
+    }
+
+    /** Writes a value as JSON. */
+    void json(Object value) {
+        out.println(Json.write(value));
+    }
+
+    void line(String text) {
+        out.println(text);
+    }
+
+    /** Writes a text exactly, with a line feed behind it when it has none. */
+    void raw(String text) {
+        out.print(text.endsWith("\n") ? text : text + "\n");
+        out.flush();
+    }
+
+    void error(String text) {
+        err.println(screen.styled(Style.BAD, text));
+    }
+
+    /** Reads a whole file, or the standard input for {@code -}. */
+    static String read(CommandSpec spec, String file) {
+        try {
+            byte[] bytes = file.equals("-") ? System.in.readAllBytes()
+                                            : Files.readAllBytes(Path.of(file));
+            return new String(bytes, StandardCharsets.UTF_8);
+        } catch (NoSuchFileException missing) {
+            throw new CommandLine.ParameterException(spec.commandLine(), "no file " + file);
+        } catch (IOException broken) {
+            throw new CommandLine.ParameterException(
+                    spec.commandLine(), "cannot read " + file + ": " + broken.getMessage());
+        }
+    }
+}

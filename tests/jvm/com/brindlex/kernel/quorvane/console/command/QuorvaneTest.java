@@ -1,0 +1,199 @@
+package com.brindlex.kernel.quorvane.console.command;
+
+import static org.junit.jupiter.api.Assertions.assertEquals;
+import static org.junit.jupiter.api.Assertions.assertFalse;
+import static org.junit.jupiter.api.Assertions.assertTrue;
+
+import com.brindlex.kernel.quorvane.typed.Argument;
+import com.brindlex.kernel.quorvane.typed.Operation;
+import java.io.ByteArrayInputStream;
+import java.io.ByteArrayOutputStream;
+import java.io.InputStream;
+import java.io.PrintStream;
+import java.io.PrintWriter;
+import java.io.StringWriter;
+import java.nio.charset.StandardCharsets;
+import java.util.ArrayList;
+import java.util.List;
+import org.junit.jupiter.api.Test;
+import picocli.CommandLine;
+
+/** The commands as a user runs them: what they write, and their exit codes. */
+class QuorvaneTest {
+    private static final String[] DEVICE = {"--serial-no", "SN1", "--local-ip", "10.0.0.1"};
+    private static final String[] USER = {
+        "--branch", "9A01", "--identity", "A123456789&1234567", "--password", "pass1234",
+    };
+    private static final String REPLY =
+            "F=7|68=0000|00=1|67=1|68=0000|07=S|M5=王小明|16=9A00|17=123|18=4567|69=1|01=\n";
+
+    /** What a command did. */
+    private record Run(int code, String out, String err) {}
+
+    private static Run run(String input, String... arguments) {
+        InputStream in = System.in;
+        PrintStream out = System.out;
+        PrintStream err = System.err;
+        ByteArrayOutputStream written = new ByteArrayOutputStream();
+        ByteArrayOutputStream complained = new ByteArrayOutputStream();
+        StringWriter usage = new StringWriter();
+        StringWriter help = new StringWriter();
+        System.setIn(new ByteArrayInputStream(input.getBytes(StandardCharsets.UTF_8)));
+        System.setOut(new PrintStream(written, true, StandardCharsets.UTF_8));
+        System.setErr(new PrintStream(complained, true, StandardCharsets.UTF_8));
+        try {
+            CommandLine command = Quorvane.commandLine();
+            command.setErr(new PrintWriter(usage, true));
+            command.setOut(new PrintWriter(help, true));
+            int code = command.execute(arguments);
+            return new Run(code, written.toString(StandardCharsets.UTF_8) + help,
+                    complained.toString(StandardCharsets.UTF_8) + usage);
+        } finally {
+            System.setIn(in);
+            System.setOut(out);
+            System.setErr(err);
+        }
+    }
+
+    private static String[] words(String first, String second, String[]... more) {
+        List<String> all = new ArrayList<>(List.of(first, second));
+        for (String[] some : more) {
+            all.addAll(List.of(some));
+        }
+        return all.toArray(new String[0]);
+    }
+
+    @Test
+    void listsAllOperations() {
+        Run list = run("", "operations");
+        Run json = run("", "operations", "--json");
+        assertEquals(0, list.code);
+        assertEquals(0, json.code);
+        for (Operation operation : Operation.values()) {
+            assertTrue(list.out.contains(operation.method()), operation.method());
+            assertTrue(json.out.contains("\"" + operation.method() + "\""), operation.method());
+        }
+    }
+
+    @Test
+    void showsEachOperation() {
+        for (Operation operation : Operation.values()) {
+            Run shown = run("", "operations", operation.method().toLowerCase());
+            assertEquals(0, shown.code, shown.err);
+            for (Argument argument : operation.allArguments()) {
+                assertTrue(shown.out.contains(argument.name()), shown.out);
+            }
+        }
+    }
+
+    @Test
+    void encodesWhatItIsGiven() {
+        Run login = run("", words("encode", "AuthEncode", DEVICE, USER));
+        assertEquals(0, login.code, login.err);
+        assertTrue(login.out.startsWith("F=7|KIND=S|BHNO=9A01|CB=1|IP=10.0.0.1|"), login.out);
+        assertTrue(login.out.endsWith("|PWD=pass1234|FUNC=0|01=\n"), login.out);
+    }
+
+    @Test
+    void everyEncoderHasItsHelp() {
+        for (Operation operation : Operation.values()) {
+            if (operation.isEncoder()) {
+                Run help = run("", "encode", operation.method(), "--help");
+                assertEquals(0, help.code);
+                for (Argument argument : operation.allArguments()) {
+                    assertTrue(help.out.contains("--" + Options.dashed(argument.name())), help.out);
+                }
+            }
+        }
+    }
+
+    @Test
+    void aRefusedRequestFails() {
+        Run refused = run("", words("encode", "AuthEncode", USER,
+                new String[] {"--serial-no", "SN1", "--local-ip", ""}));
+        assertEquals(1, refused.code);
+        assertEquals("", refused.out);
+        assertTrue(refused.err.contains("[CLIENT]"), refused.err);
+        Run json = run("", words("encode", "AuthEncode", USER,
+                new String[] {"--serial-no", "SN1", "--local-ip", "", "--json"}));
+        assertEquals(1, json.code);
+        assertTrue(json.out.contains("\"status\": -1"), json.out);
+    }
+
+    @Test
+    void badUsageIsSaid() {
+        String[][] wrong = {
+            {}, {"nothing"}, {"encode"}, {"encode", "NoEncode"}, {"encode", "AuthEncode"},
+            {"decode"}, {"decode", "NoDecode"}, {"decode", "AuthEncode"},
+            {"decode", "AuthDecode", "/no/such/file"}, {"explain", "--operation", "None"},
+            {"operations", "None"}, {"simulate", "--brokerage", "NONE"},
+            words("encode", "AuthEncode", DEVICE, USER, new String[] {"--market", "one"}),
+            words("encode", "AuthEncode", DEVICE, USER, new String[] {"--colour", "red"}),
+        };
+        for (String[] arguments : wrong) {
+            Run bad = run("", arguments);
+            assertEquals(2, bad.code, String.join(" ", arguments));
+            assertFalse(bad.err.isBlank(), String.join(" ", arguments));
+            assertFalse(bad.err.contains("Exception"), bad.err);
+        }
+    }
+
+    @Test
+    void decodesFromTheStandardInput() {
+        Run shown = run(REPLY, "decode", "AuthDecode");
+        assertEquals(0, shown.code, shown.err);
+        assertTrue(shown.out.contains("王小明"), shown.out);
+        Run raw = run(REPLY, "decode", "AuthDecode", "--raw", "-");
+        assertEquals("1!<S>@王小明@1234567@9A00@1!\n", raw.out);
+        Run json = run(REPLY, "--json", "decode", "AuthDecode");
+        assertTrue(json.out.contains("\"account\": \"1234567\""), json.out);
+        Run failed = run("F=7|68=9999|M2=密碼錯誤|", "decode", "OpenAccountDecode", "--json");
+        assertEquals(1, failed.code);
+        assertTrue(failed.out.contains("\"code\": \"9999\""), failed.out);
+    }
+
+    @Test
+    void explainsSoundAndDamagedLines() {
+        Run sound = run("D/gatewayjni(  77): " + REPLY, "explain");
+        assertEquals(0, sound.code, sound.out);
+        assertTrue(sound.out.contains("label of the account") || sound.out.contains("M5"));
+        Run damaged = run(REPLY.replace("|01=", ""), "explain", "--json");
+        assertEquals(1, damaged.code);
+        assertTrue(damaged.out.contains("is not closed"), damaged.out);
+        assertEquals(1, run("\n\n", "explain").code);
+    }
+
+    @Test
+    void coloursOnlyWhenAsked() {
+        assertFalse(run("2!x", "explain").out.contains("\033["));
+        assertTrue(run("2!x", "explain", "--colour", "always").out.contains("\033["));
+        assertFalse(run("2!x", "explain", "--colour", "always", "--json").out.contains("\033["));
+    }
+
+    @Test
+    void playsASession() {
+        Run session = run("AuthEncode\nSubmitOrder --stock-code 2330 --quantity 2 --price 99500 "
+                        + "--side B --n6 1\nfill A0001 1000 99500\nQueryReply\nquit\nbogus\n",
+                "simulate");
+        assertEquals(0, session.code, session.err);
+        assertTrue(session.out.contains("台北證券"), session.out);
+        assertTrue(session.out.contains("995.00"), session.out);
+        Run wrong = run("AuthEncode --password wrong\nbogus\nset x y\nfill A\nfill A0009 1 1\n",
+                "simulate");
+        assertEquals(1, wrong.code);
+        assertTrue(wrong.err.contains("bogus"), wrong.err);
+    }
+
+    @Test
+    void aRequestOfTheConsoleExplainsItself() {
+        Run login = run("", words("encode", "AuthEncode", DEVICE, USER));
+        Run explained = run(login.out, "explain");
+        assertEquals(0, explained.code, explained.out);
+        assertTrue(explained.out.contains("request: login"), explained.out);
+        Run damaged = run(login.out.replace("|IDNO=", "|IDNA="), "explain");
+        assertEquals(1, damaged.code);
+        assertTrue(damaged.out.contains("IDNO"), damaged.out);
+        assertTrue(damaged.out.contains("operation AuthEncode"), damaged.out);
+        assertTrue(damaged.out.contains("^"), damaged.out);
+    }
+}
