@@ -21,8 +21,7 @@
 #include <type_traits>
 #include <utility>
 
-#include "gateway/core/log.h"
-#include "gateway/core/text_writer.h"
+#include "gateway/core/gateway_pub.h"
 
 // What the host passes first to every encoder.
 struct HostSession {
@@ -53,152 +52,59 @@ inline HostSession FuturesSession(HostSession session) {
   return session;
 }
 
-// Characters of the host's strings, in parameter order.
-template <size_t N>
-class CHostTexts {
+// What the VM lends for one call, and how it is given back: everything in the frame that does not
+// depend on the operation.
+class CEntryCall {
  public:
-  CHostTexts(JNIEnv* env, const jstring (&strings)[N]) : m_pEnv(env) {
-    for (size_t i = 0; i < N && m_bLent; ++i) {
-      m_strings[i] = strings[i];
-      if (strings[i] == nullptr) continue;
-      m_texts[i] = env->GetStringUTFChars(strings[i], nullptr);
-      m_bLent = m_texts[i] != nullptr;
-    }
-  }
-  CHostTexts(const CHostTexts&) = delete;
-  CHostTexts& operator=(const CHostTexts&) = delete;
+  static constexpr size_t kMaxTexts = 15;
 
-  // False when the VM could not lend one of them; the later ones were not asked for then.
-  bool Lent() const { return m_bLent; }
+  CEntryCall(JNIEnv* env, const FrameOptions& options) : m_pEnv(env), m_options(options) {}
+  CEntryCall(const CEntryCall&) = delete;
+  CEntryCall& operator=(const CEntryCall&) = delete;
 
-  const char* operator[](size_t i) const { return m_texts[i]; }
+  // Asks for the characters of `count` strings, then for the elements of `status` (null for none).
+  // False when the VM could not lend them all: what it lent is given back, the call returns null.
+  bool Borrow(const jstring* strings, size_t count, jintArray status);
 
-  void Release(size_t i) {
-    if (m_texts[i] != nullptr) m_pEnv->ReleaseStringUTFChars(m_strings[i], m_texts[i]);
-    m_texts[i] = nullptr;
-  }
+  // A borrowed text, by the string's place.
+  const char* Text(size_t i) const { return m_texts[i]; }
 
-  // Gives back whatever was lent; the call that cannot go on returns what this returns.
-  jstring ReleaseAll() {
-    for (size_t i = 0; i < N; ++i) Release(i);
-    return nullptr;
-  }
+  // The element that the method writes.
+  int* Status() { return m_pElements != nullptr ? m_pElements : &m_nOwnStatus; }
+
+  // Stores the session data in the object, its texts being the first two borrowed.
+  void FillSession(CGatewayPub& object, const HostSession& session) const;
+
+  // Logs the result, gives everything back and makes the Java string.
+  jstring Finish(const char* result);
 
  private:
+  void Release(size_t i);
+  void LogStep();
+
   JNIEnv* m_pEnv;
-  jstring m_strings[N] = {};
-  const char* m_texts[N] = {};
-  bool m_bLent = true;
-};
-
-// The element of the host's status array that the method writes.
-class CHostStatus {
- public:
-  CHostStatus(JNIEnv* env, jintArray array) : m_pEnv(env), m_array(array) {
-    if (array != nullptr) m_pElements = env->GetIntArrayElements(array, nullptr);
-  }
-  CHostStatus(const CHostStatus&) = delete;
-  CHostStatus& operator=(const CHostStatus&) = delete;
-
-  bool Lent() const { return m_array == nullptr || m_pElements != nullptr; }
-
-  int* Pointer() { return m_pElements != nullptr ? m_pElements : &m_nOwn; }
-
-  void Release() {
-    if (m_pElements != nullptr) m_pEnv->ReleaseIntArrayElements(m_array, m_pElements, 0);
-    m_pElements = nullptr;
-  }
-
- private:
-  JNIEnv* m_pEnv;
-  jintArray m_array;
+  const FrameOptions& m_options;
+  size_t m_nTexts = 0;
+  jstring m_strings[kMaxTexts];
+  const char* m_texts[kMaxTexts];
+  jintArray m_status = nullptr;
   jint* m_pElements = nullptr;
-  jint m_nOwn = 0;
-};
-
-// For an export without a status array: nothing is asked of the VM.
-class CNoStatus {
- public:
-  CNoStatus(JNIEnv*, jintArray) {}
-  static bool Lent() { return true; }
-  static void Release() {}
-};
-
-// Numbers the log lines of an export that has a step label; the others log nothing.
-class CStepLog {
- public:
-  explicit CStepLog(const char* label) : m_pLabel(label) {}
-
-  void Next() {
-    if (m_pLabel == nullptr) return;
-    char scratch[64];
-    CTextWriter line(scratch, sizeof scratch);
-    line.Append(WIRE("%s%d"), m_pLabel, m_nStep++);
-    debuglog(line.Text());
-  }
-
- private:
-  const char* m_pLabel;
+  jint m_nOwnStatus = 0;
   int m_nStep = 0;
 };
 
-// Runs one call. `fill(object, texts)` stores the session data; `call(object, texts, status)` runs
-// the method and returns its text, owned by the object.
-template <class Gateway, class Status, size_t N, class Fill, class Call>
-jstring RunEntry(JNIEnv* env, const jstring (&strings)[N], jintArray statusArray,
-                 const FrameOptions& options, const Fill& fill, const Call& call) {
-  if (options.opening != nullptr) debuglog(options.opening);
-  CHostTexts<N> texts(env, strings);
-  if (!texts.Lent()) return texts.ReleaseAll();
-  Status status(env, statusArray);
-  if (!status.Lent()) return texts.ReleaseAll();
-
-  Gateway object;
-  fill(object, texts);
-  const char* const result = call(object, texts, status);
-
-  CStepLog steps(options.stepLabel);
-  steps.Next();
-  if (options.logsResult) debuglog(result);
-  steps.Next();
-  for (size_t i = 0; i + options.keptTexts < N; ++i) {
-    texts.Release(i);
-    steps.Next();
-  }
-  status.Release();
-  steps.Next();
-  return env->NewStringUTF(result == nullptr ? "" : result);
+// A Java argument as its method takes it; strings were borrowed before and are found by place.
+inline const char* MethodArgument(const CEntryCall& call, size_t place, jstring) {
+  return call.Text(place);
 }
-
-// A Java argument as its method takes it; strings were fetched before and are found by position.
-template <size_t N>
-const char* MethodArgument(const CHostTexts<N>& texts, size_t position, jstring) {
-  return texts[position];
-}
-template <size_t N>
-jint MethodArgument(const CHostTexts<N>&, size_t, jint value) {
+inline jint MethodArgument(const CEntryCall&, size_t, jint value) {
   return value;
 }
-template <size_t N>
-char MethodArgument(const CHostTexts<N>&, size_t, jbyte value) {
+inline char MethodArgument(const CEntryCall&, size_t, jbyte value) {
   return static_cast<char>(value);
 }
-template <size_t N>
-char MethodArgument(const CHostTexts<N>&, size_t, jchar value) {
+inline char MethodArgument(const CEntryCall&, size_t, jchar value) {
   return static_cast<char>(static_cast<unsigned char>(value & 0xff));  // the low byte alone
-}
-
-// Calls `method` with the Java arguments `args` converted one for one, and the status pointer last
-// unless the export has no status.
-template <class Gateway, class... Parameters, size_t N, class Status, size_t... kAt, class... Args>
-const char* CallMethod(Gateway& object, char* (Gateway::*method)(Parameters...),
-                       const CHostTexts<N>& texts, Status& status, std::index_sequence<kAt...>,
-                       Args... args) {
-  if constexpr (std::is_same_v<Status, CNoStatus>) {
-    return (object.*method)(MethodArgument(texts, kSessionTexts + kAt, args)...);
-  } else {
-    return (object.*method)(MethodArgument(texts, kSessionTexts + kAt, args)..., status.Pointer());
-  }
 }
 
 inline void Collect(jstring*& at, jstring string) {
@@ -207,45 +113,53 @@ inline void Collect(jstring*& at, jstring string) {
 template <class NoString>
 void Collect(jstring*&, NoString) {}
 
+// Whether an export gives its method a status pointer.
+enum class StatusUse { kGiven, kNone };
+
+// Calls `method` with the Java arguments `args` converted one for one, and the status pointer last.
+template <StatusUse kStatus, class Gateway, class Method, size_t... kAt, class... Args>
+const char* CallMethod(Gateway& object, Method method, CEntryCall& call,
+                       std::index_sequence<kAt...>, Args... args) {
+  if constexpr (kStatus == StatusUse::kNone) {
+    return (object.*method)(MethodArgument(call, kSessionTexts + kAt, args)...);
+  } else {
+    return (object.*method)(MethodArgument(call, kSessionTexts + kAt, args)..., call.Status());
+  }
+}
+
 // The frame of an encoder. `args` are its operation parameters in Java order, strings first.
-template <class Status, class Gateway, class... Parameters, class... Args>
+template <StatusUse kStatus, class Gateway, class... Parameters, class... Args>
 jstring RunEncoder(JNIEnv* env, const FrameOptions& options, const HostSession& session,
-                   char* (Gateway::*method)(Parameters...), jintArray statusArray, Args... args) {
+                   char* (Gateway::*method)(Parameters...), jintArray status, Args... args) {
   constexpr size_t kTexts = (kSessionTexts + ... + (std::is_same_v<Args, jstring> ? 1 : 0));
+  static_assert(kTexts <= CEntryCall::kMaxTexts, "an entry point has at most kMaxTexts strings");
   jstring strings[kTexts] = {session.serialNo, session.localIP};
   jstring* at = strings + kSessionTexts;
   (Collect(at, args), ...);
-  const auto fill = [&](Gateway& object, const CHostTexts<kTexts>& texts) {
-    object.m_nMarket = session.market;
-    object.m_nPlatform = session.platform;
-    object.m_nSeqNo = session.seqNo;
-    object.setSerialNumber(texts[0]);
-    object.setLocalIP(texts[1]);
-    if (options.loggedText < kTexts) debuglog(texts[kSessionTexts + options.loggedText]);
-  };
-  const auto call = [&](Gateway& object, const CHostTexts<kTexts>& texts, Status& status) {
-    return CallMethod(object, method, texts, status, std::index_sequence_for<Args...>(), args...);
-  };
-  return RunEntry<Gateway, Status>(env, strings, statusArray, options, fill, call);
+  CEntryCall call(env, options);
+  if (!call.Borrow(strings, kTexts, status)) return nullptr;
+  Gateway object;
+  call.FillSession(object, session);
+  return call.Finish(
+      CallMethod<kStatus>(object, method, call, std::index_sequence_for<Args...>(), args...));
 }
 
 // An encoder whose status goes into the host's array.
 template <class Gateway, class... Parameters, class... Args>
 jstring Encode(JNIEnv* env, const HostSession& session, char* (Gateway::*method)(Parameters...),
                jintArray status, Args... args) {
-  return RunEncoder<CHostStatus>(env, FrameOptions(), session, method, status, args...);
+  return RunEncoder<StatusUse::kGiven>(env, FrameOptions(), session, method, status, args...);
 }
 
 // The frame of a decoder: of the session data it has none but, in one export, the market.
 template <class Gateway>
 jstring Decode(JNIEnv* env, char* (Gateway::*method)(const char*, int*), jstring reply,
-               jintArray statusArray, const FrameOptions& options = {}, jint market = 0) {
-  const jstring strings[] = {reply};
-  const auto fill = [&](Gateway& object, const CHostTexts<1>&) { object.m_nMarket = market; };
-  const auto call = [&](Gateway& object, const CHostTexts<1>& texts, CHostStatus& status) {
-    return (object.*method)(texts[0], status.Pointer());
-  };
-  return RunEntry<Gateway, CHostStatus>(env, strings, statusArray, options, fill, call);
+               jintArray status, const FrameOptions& options = {}, jint market = 0) {
+  CEntryCall call(env, options);
+  if (!call.Borrow(&reply, 1, status)) return nullptr;
+  Gateway object;
+  object.m_nMarket = market;
+  return call.Finish((object.*method)(call.Text(0), call.Status()));
 }
 
 // An export's linkage, return type and name.

@@ -8,9 +8,9 @@ GATEWAY_EXPORT(ApplyCertEncode)
  jintArray status) {
   FrameOptions options;
   options.loggedText = 1;  // the identity field: whose application the log is about
-  return RunEncoder<CHostStatus>(env, options, {market, platform, seqNo, serialNo, localIP},
-                                 &CGatewayPub::ApplyCertEncode, status, branch, identity, password,
-                                 birth, certMsg);
+  return RunEncoder<StatusUse::kGiven>(env, options, {market, platform, seqNo, serialNo, localIP},
+                                       &CGatewayPub::ApplyCertEncode, status, branch, identity,
+                                       password, birth, certMsg);
 }
 
 GATEWAY_EXPORT(ApplyCertDecode)(JNIEnv* env, jclass, jstring reply, jintArray status) {
@@ -37,9 +37,9 @@ GATEWAY_EXPORT(RevokeCertEncode)
   // A call for good is in the log before anything can fail, and then whose certificate it is.
   options.opening = "Java_com_brindlex_kernel_quorvane_gatewayjni_RevokeCertEncode";
   options.loggedText = 1;
-  return RunEncoder<CHostStatus>(env, options, {market, platform, seqNo, serialNo, localIP},
-                                 &CGatewayPub::RevokeCertEncode, status, branch, identity, password,
-                                 birth, certMsg);
+  return RunEncoder<StatusUse::kGiven>(env, options, {market, platform, seqNo, serialNo, localIP},
+                                       &CGatewayPub::RevokeCertEncode, status, branch, identity,
+                                       password, birth, certMsg);
 }
 
 GATEWAY_EXPORT(RevokeCertDecode)(JNIEnv* env, jclass, jstring reply, jintArray status) {
@@ -59,8 +59,8 @@ GATEWAY_EXPORT(GetCertEncode2)
   FrameOptions options;
   // The messages are long: the log shows how far a call came, to its last release.
   options.stepLabel = "gatewayjni_GetCertEncode2_";
-  return RunEncoder<CHostStatus>(env, options, {market, platform, seqNo, serialNo, localIP},
-                                 &CGatewayPub::GetCertEncode2, status, certMsg);
+  return RunEncoder<StatusUse::kGiven>(env, options, {market, platform, seqNo, serialNo, localIP},
+                                       &CGatewayPub::GetCertEncode2, status, certMsg);
 }
 
 GATEWAY_EXPORT(GetCertDecode)(JNIEnv* env, jclass, jstring reply, jintArray status) {

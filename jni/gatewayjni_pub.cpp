@@ -31,9 +31,9 @@ GATEWAY_EXPORT(OpenAccountEncode)
   FrameOptions options;
   options.keptTexts =
       3;  // name, address and telephone stay with the VM, as the app's builds expect
-  return RunEncoder<CHostStatus>(env, options, {market, platform, seqNo, serialNo, localIP},
-                                 &CGatewayPub::OpenAccountEncode, status, extra1, identity, extra2,
-                                 name, address, tel, time, item);
+  return RunEncoder<StatusUse::kGiven>(env, options, {market, platform, seqNo, serialNo, localIP},
+                                       &CGatewayPub::OpenAccountEncode, status, extra1, identity,
+                                       extra2, name, address, tel, time, item);
 }
 
 GATEWAY_EXPORT(OpenAccountDecode)(JNIEnv* env, jclass, jstring reply, jintArray status) {

@@ -26,9 +26,9 @@ GATEWAY_EXPORT(SubmitOrderEncode1)
 GATEWAY_EXPORT(SubmitOrderEncode2)
 (JNIEnv* env, jclass, jint market, jint platform, jint seqNo, jstring serialNo, jstring localIP,
  jstring branch, jstring identity, jstring password, jbyte function, jbyte tradeType) {
-  return RunEncoder<CNoStatus>(env, FrameOptions(), {market, platform, seqNo, serialNo, localIP},
-                               &CGatewayStk::SubmitOrderEncode2, nullptr, branch, identity,
-                               password, function, tradeType);
+  return RunEncoder<StatusUse::kNone>(
+      env, FrameOptions(), {market, platform, seqNo, serialNo, localIP},
+      &CGatewayStk::SubmitOrderEncode2, nullptr, branch, identity, password, function, tradeType);
 }
 
 GATEWAY_EXPORT(CancelOrderEncode)

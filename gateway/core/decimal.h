@@ -63,7 +63,7 @@ inline constexpr char kDigitPairs[] =
     "949596979899";
 
 inline void WriteDigitPair(char* at, uint32_t value) {
-  memcpy(at, kDigitPairs + 2 * value, 2);
+  memcpy(at, kDigitPairs + size_t{2} * value, 2);
 }
 
 // Writes the last `kCount` digits of `value`, zero-padded on the left; returns the place behind.
@@ -89,9 +89,9 @@ inline char* WriteShortNumber(char* at, uint32_t value) {
 
 // Number of characters of `value` as printf's "%0<width>d" prints it (width 0: plain "%d"): the
 // sign counts as one character of the width and stands before the zeros.
-size_t DecimalSize(int64_t value, size_t width);
+__attribute__((noinline)) size_t DecimalSize(int64_t value, size_t width);
 
 // Writes that many characters at `at`; returns the place behind them.
-char* WriteDecimal(char* at, int64_t value, size_t width);
+__attribute__((noinline)) char* WriteDecimal(char* at, int64_t value, size_t width);
 
 #endif  // QUORVANE_GATEWAY_CORE_DECIMAL_H_

@@ -87,41 +87,40 @@ class CTagTable {
   template <size_t N>
   constexpr explicit CTagTable(const TagRow (&rows)[N]) {
     static_assert(N <= kMaxTags, "a table holds at most kMaxTags tags");
-    while (!Place(rows, N)) m_nFactor += 2;
+    while (!Place(rows, N)) m_nFactor = m_nFactor * 747796405 + 2;  // odd, and far from the last
   }
 
   // The row of the tag with this key, or kNone.
   constexpr int Find(TagKey key) const {
-    const Entry& entry = m_entries[PlaceOf(key)];
-    return entry.key == key ? entry.row : kNone;
+    const size_t place = PlaceOf(key);
+    return m_keys[place] == key ? m_rows[place] : kNone;
   }
 
   bool SkipsBlanks(int row) const { return (m_nSkips >> row & 1) != 0; }
 
  private:
-  static constexpr size_t kPlaces = 256;
+  static constexpr size_t kPlaces = 128;
 
-  struct Entry {
-    TagKey key = 0xffffffff;  // no field has this key
-    int row = kNone;
-  };
-
-  constexpr size_t PlaceOf(TagKey key) const { return key * m_nFactor >> 24; }
+  constexpr size_t PlaceOf(TagKey key) const { return key * m_nFactor >> 25; }
 
   // Whether every tag found a place of its own with the present factor.
   constexpr bool Place(const TagRow* rows, size_t count) {
-    for (Entry& entry : m_entries) entry = Entry();
+    for (TagKey& key : m_keys) key = kVacant;
     for (size_t row = 0; row < count; ++row) {
-      Entry& entry = m_entries[PlaceOf(MakeTagKey(rows[row].tag))];
-      if (entry.row != kNone) return false;
-      entry.key = MakeTagKey(rows[row].tag);
-      entry.row = static_cast<int>(row);
+      const TagKey key = MakeTagKey(rows[row].tag);
+      const size_t place = PlaceOf(key);
+      if (m_keys[place] != kVacant) return false;
+      m_keys[place] = key;
+      m_rows[place] = static_cast<uint8_t>(row);
       if (rows[row].blanks == Blanks::kSkipped) m_nSkips |= 1U << row;
     }
     return true;
   }
 
-  Entry m_entries[kPlaces] = {};
+  static constexpr TagKey kVacant = 0xffffffff;  // no field has this key
+
+  TagKey m_keys[kPlaces] = {};
+  uint8_t m_rows[kPlaces] = {};
   uint32_t m_nFactor = 0x9e3779b1;
   uint32_t m_nSkips = 0;  // bit per row
 };
@@ -135,7 +134,7 @@ class CRecord {
   bool Empty() const { return m_bEmpty; }
 
   // Whether the field is there and not empty, even if its value is too long to be read.
-  bool Has(int row) const { return (m_nPresent >> row & 1) != 0 && m_values[row].size() > 0; }
+  bool Has(int row) const { return (m_nPresent >> row & 1) != 0 && !m_values[row].empty(); }
 
   // The value as a buffer of `bound` bytes holds it; empty when absent or dropped.
   std::string_view Text(int row, size_t bound) const {
