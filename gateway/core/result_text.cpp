@@ -47,12 +47,15 @@ char* RenewHeapText(const HeapText& owner, size_t length) {
 }
 
 CResultText::CResultText(const HeapText& owner, size_t expected)
-    : CWireText(nullptr, nullptr), m_owner(owner), m_nExpected(expected), m_pRecords(nullptr) {
+    : CWireText(&m_cNoRoom, &m_cNoRoom),
+      m_owner(owner),
+      m_nExpected(expected),
+      m_pRecords(&m_cNoRoom) {
   owner.length = 0;
 }
 
 char* CResultText::Finish(std::string_view opening, int count) {
-  if (m_pRecords == nullptr) MakeRoom(0);
+  if (m_pRecords == &m_cNoRoom) MakeRoom(0);
   if (m_bFailed) return nullptr;
   const size_t size = opening.size() + DecimalSize(count, 0) + 1;
   char* const start = m_pRecords - size;
@@ -67,7 +70,8 @@ char* CResultText::Finish(std::string_view opening, int count) {
 bool CResultText::MakeRoom(size_t count) {
   if (m_bFailed) return false;
   const size_t used = Length();
-  if (m_pRecords != nullptr) m_nExpected *= 8;
+  if (m_pRecords != &m_cNoRoom)
+    m_nExpected = m_nExpected < INT32_MAX / 8 ? 8 * m_nExpected : INT32_MAX;
   if (m_nExpected < used + count) m_nExpected = used + count;
   const size_t size = kOpeningRoom + m_nExpected + kSlack;
   char* const block = Allocate(size);

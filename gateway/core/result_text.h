@@ -30,6 +30,8 @@ class CResultText : public CWireText<CResultText> {
   // `owner`'s text is replaced. `expected` is a fair guess of the list's size: a first allocation
   // holds that much, and a second eight times as much, more than any reply of that size can give.
   CResultText(const HeapText& owner, size_t expected);
+  CResultText(const CResultText&) = delete;
+  CResultText& operator=(const CResultText&) = delete;
 
   bool Failed() const { return m_bFailed; }
 
@@ -49,6 +51,7 @@ class CResultText : public CWireText<CResultText> {
   HeapText m_owner;
   size_t m_nExpected;
   char* m_pRecords;
+  char m_cNoRoom = '\0';  // what the text points to before its first allocation; never written
   bool m_bFailed = false;
 };
 
