@@ -1,0 +1,126 @@
+// What calls ask of the heap: nothing for a request, at most two blocks for an answer of any size.
+
+#include <gtest/gtest.h>
+
+#include <cstdlib>
+#include <initializer_list>
+#include <new>
+#include <string>
+#include <vector>
+
+#include "tests/heap/counting_heap.h"
+#include "tests/support/bare_host.h"
+#include "tests/support/call_table.h"
+#include "tests/support/golden_file.h"
+#include "tests/support/sample_replies.h"
+
+namespace gateway_tests {
+namespace {
+
+constexpr int kMostOfDecoder = 2;
+
+/// The blocks that one call takes from the heap.
+int AllocationsOf(const TExport& row, const TArguments& arguments) {
+  jint status = 0;
+  std::vector<jvalue> values;
+  for (const TArgument& argument : arguments) {
+    jvalue value{};
+    switch (argument.m_chLetter) {
+      case 'S':
+        value.l = argument.m_Text ? BareText(argument.m_Text->c_str()) : nullptr;
+        break;
+      case 'b':
+        value.b = static_cast<jbyte>(argument.m_nNumber);
+        break;
+      case 'c':
+        value.c = static_cast<jchar>(argument.m_nNumber);
+        break;
+      default:
+        value.i = static_cast<jint>(argument.m_nNumber);
+    }
+    values.push_back(value);
+  }
+  values.emplace_back().l = BareStatus(&status);
+  void* const entryPoint = row.EntryPoint();
+  JNIEnv* const env = BareHost();
+  EXPECT_NE(entryPoint, nullptr) << row.m_szName;
+  if (entryPoint == nullptr) return 0;
+
+  const CHeapCount count;
+  row.m_pCall(entryPoint, env, values.data());
+  return count.Allocations();
+}
+
+int AllocationsOfReply(std::string_view decoder, const std::string& reply) {
+  const TExport* const row = FindExport(decoder);
+  TArguments arguments = {TArgument::Text(reply)};
+  if (row->m_szShape.front() == 'i') arguments.insert(arguments.begin(), TArgument::Int(0));
+  return AllocationsOf(*row, arguments);
+}
+
+int MostOf(const TExport& row) {
+  if (row.IsDecoder()) return kMostOfDecoder;
+  return row.m_szName == "RegisterCertEncode" ? kMostOfDecoder : 0;  // a message of any length
+}
+
+TEST(Heap, CountsWhatIsAskedOfIt) {
+  const CHeapCount count;
+  void* volatile block = malloc(1);
+  block = realloc(block, 100000);
+  free(block);
+  block = calloc(1, 1);
+  free(block);
+  ::operator delete(::operator new(7));
+  EXPECT_EQ(count.Allocations(), 4);
+}
+
+TEST(Heap, CountsWhatTheLibraryAsksOfIt) {
+  EXPECT_GT(AllocationsOfReply("QueryOrderDecode", SampleList("QueryOrderDecode", 20)), 0);
+}
+
+TEST(Heap, IsLeftAloneByRequestsAndHardlyUsedByAnswers) {
+  const TGoldenCases golden = ReadGoldenCases(TEST_VECTORS);
+  ASSERT_FALSE(golden.m_Cases.empty());
+  for (const TGoldenCase& one : golden.m_Cases) {
+    const TExport* const row = FindExport(one.m_Operation);
+    ASSERT_NE(row, nullptr) << one.Where();
+    EXPECT_LE(AllocationsOf(*row, one.m_Arguments), MostOf(*row)) << one.Where();
+  }
+}
+
+class HeapOfList : public testing::TestWithParam<std::string_view> {};
+
+TEST_P(HeapOfList, GrowsInAtMostTwoBlocksWhateverTheSize) {
+  for (size_t records : std::initializer_list<size_t>{0, 1, 2, 20, 100, 1000, 20000}) {
+    EXPECT_LE(AllocationsOfReply(GetParam(), SampleList(GetParam(), records)), kMostOfDecoder)
+        << records << " records";
+  }
+}
+
+INSTANTIATE_TEST_SUITE_P(Heap, HeapOfList, testing::ValuesIn(kListDecoders),
+                         [](const auto& list) { return std::string(list.param); });
+
+TEST(Heap, IsHardlyUsedByAnswersWithoutAList) {
+  int answers = 0;
+  for (const TExport& row : AllExports()) {
+    const std::string reply = SampleAnswer(row.m_szName);
+    if (reply.empty()) continue;
+    ++answers;
+    EXPECT_LE(AllocationsOfReply(row.m_szName, reply), kMostOfDecoder) << row.m_szName;
+  }
+  EXPECT_EQ(answers, 16);  // with the lists, every decoder
+}
+
+TEST(Heap, TakesAThirdBlockForNoRecordThatIsLongerThanItsReply) {
+  // Each of these records of a few bytes shows ten characters and more.
+  std::string reply = "|00=1|67=1|68=0000|M3=";
+  for (int i = 0; i < 5000; ++i) reply += "|00=|68=0000|01=";
+  EXPECT_LE(AllocationsOfReply("AuthDecode", reply), kMostOfDecoder);
+  EXPECT_LE(AllocationsOfReply("QueryOrderDecode", reply), kMostOfDecoder);
+  EXPECT_LE(AllocationsOfReply("FutQueryOrderDecode", reply), kMostOfDecoder);
+  EXPECT_LE(AllocationsOfReply("FutQueryReplyDecode", reply), kMostOfDecoder);
+  EXPECT_LE(AllocationsOfReply("FutQueryInventoryDecode", reply), kMostOfDecoder);
+}
+
+}  // namespace
+}  // namespace gateway_tests
