@@ -74,8 +74,9 @@ bool CGatewayPub::WriteCertHead(CTextWriter& line, const CertRequest& request,
 void CGatewayPub::WriteCertTail(CTextWriter& line, const CertRequest& request,
                                 const CertOwner& owner, std::string_view message) {
   line.Append(WIRE("FUNC=%s|MSG="), request.function);
-  char* const room = line.Claim(CBase64Utils::EncodedSize(message.size()));
-  if (room != nullptr) CBase64Utils::EncodeTo(message.data(), message.size(), room);
+  line.AppendWritten(CBase64Utils::EncodedSize(message.size()), [message](char* out) {
+    CBase64Utils::EncodeTo(message.data(), message.size(), out);
+  });
   if (request.hasBirth) line.Append(WIRE("|BIRTH=%s"), owner.birth);
   line.AppendText("|01=");
 }

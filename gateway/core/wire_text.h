@@ -140,12 +140,12 @@ class CWireText {
 
   void AppendChar(char c) { AppendValue(CharValue{c}); }
 
-  // Hands out the next `count` characters, all of which the caller fills; null when they do not
-  // fit, and then nothing more does.
-  char* Claim(size_t count) {
-    if (!Has(count) && !MakeRoom(count)) return nullptr;
+  // Appends `count` characters that `write(char*)` writes in place, if they fit.
+  template <class Write>
+  void AppendWritten(size_t count, const Write& write) {
+    if (!Has(count) && !MakeRoom(count)) return;
+    write(m_pAt);
     m_pAt += count;
-    return m_pAt - count;
   }
 
   // Printed as "%0<width>d" prints it.
