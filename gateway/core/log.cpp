@@ -1,10 +1,6 @@
 #include "gateway/core/log.h"
 
-#ifdef QUORVANE_NO_LOG
-
-void debuglog(const char*) {}
-
-#else
+#ifndef QUORVANE_NO_LOG
 
 #include <android/log.h>
 
