@@ -1,6 +1,7 @@
-# Four interface targets, so that every flag stands in one place:
+# Five interface targets, so that every flag stands in one place:
 #   quorvane_flags          whatever is compiled here, the tests included
 #   quorvane_library_flags  what goes into libquorvane.so
+#   quorvane_test_flags     what goes into test programs
 #   quorvane_hardening      how a shared library is linked
 #   quorvane_link_flags     how libquorvane.so is linked
 
@@ -19,7 +20,7 @@ if(QUORVANE_SANITIZE)
   # The vptr check needs the type information that the library is built without.
   set(sanitize -fsanitize=${QUORVANE_SANITIZE} -fno-sanitize=vptr -fno-sanitize-recover=all
                -fno-omit-frame-pointer)
-  target_compile_options(quorvane_flags INTERFACE ${sanitize} -O1)
+  target_compile_options(quorvane_flags INTERFACE ${sanitize})
   target_link_options(quorvane_flags INTERFACE ${sanitize})
 endif()
 if(QUORVANE_COVERAGE)
@@ -31,6 +32,14 @@ add_library(quorvane_library_flags INTERFACE)
 target_compile_options(quorvane_library_flags INTERFACE
     -fno-exceptions -fno-rtti -ffunction-sections -fdata-sections -fstack-protector-strong
     $<$<AND:$<CONFIG:Release>,$<NOT:$<BOOL:${instrumented}>>>:-U_FORTIFY_SOURCE -D_FORTIFY_SOURCE=2>)
+if(QUORVANE_SANITIZE)
+  target_compile_options(quorvane_library_flags INTERFACE -O1)
+endif()
+
+# Test programs take far longer to optimize than they run.
+add_library(quorvane_test_flags INTERFACE)
+target_link_libraries(quorvane_test_flags INTERFACE quorvane_flags)
+target_compile_options(quorvane_test_flags INTERFACE -O0)
 
 # Both page sizes are set: the first aligns the segments, the second the end of the read-only data
 # after relocation, and a device with 16 KiB pages needs the two alike.
