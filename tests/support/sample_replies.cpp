@@ -80,16 +80,16 @@ void AddStockOrder(CRecordText& record, int number) {
   const bool failed = state == 0;
   const int reduced = state < 3 ? 1000 * dice.Roll(2) : 0;
   const int filled = state == 3 ? quantity : state > 5 ? quantity / 2 : 0;
-  record.Add("46", number, 12).Add("36", "20240115-" + std::to_string(100000 + number));
+  record.Add("46", number, 12).Add("36", "20240115-9A00-" + std::to_string(10000000 + number));
   AddStockKind(record);
-  record.Add("70", quantity).Add("41", failed ? 0 : reduced).Add("37", 0).Add("47", filled);
+  record.Add("70", quantity).Add("41", failed ? 0 : reduced).Add("47", filled);
   record.Add("39", failed ? "E" : " ");
   record.Add("K1", failed       ? "委託價格超過漲跌停範圍!請重新輸入"
                    : state == 1 ? "全部取消"
                    : state == 2 ? "委託已傳送，等待接收回報！"
                                 : "委託成功，已送達交易所");
   record.Add("N6", dice.Roll(6) == 0 ? "0" : "1").AddPrice("31", 1000 + dice.Roll(90000));
-  record.Add("M8", dice.Roll(9) == 0 ? 9 : 0).AddTime("22", "123").Add("21", 1130115);
+  record.Add("M8", dice.Roll(9) == 0 ? 9 : 0).AddTime("22", "123456").Add("21", 1130115);
   record.Add("44", 1130115).Add("JV", dice.Roll(3) == 0 ? "Y" : "N");
 }
 
@@ -129,15 +129,15 @@ void AddPayment(CRecordText& record, bool brokerage) {
   record.Add("97", dice.Roll(2000000));
 }
 
-/// The fields of a contract: one leg, or two (`pair`) with the second leg's fields filled.
+/// The fields of a contract: one leg, or two (`pair`), which have fields of their own.
 void AddContract(CRecordText& record, bool option, bool pair) {
   CDice& dice = record.Dice();
-  record.Add("33", option ? "TXO" : "TXF").Add("V9", pair ? (option ? "TXO" : "TXF") : "");
-  record.Add("29", "202402").Add("W0", pair ? "202403" : "");
-  record.Add("V8", option ? "C" : "").Add("W1", option && pair ? "P" : "");
-  record.Add("34", option ? 17000 + 100 * dice.Roll(20) : 0);
-  record.Add("W2", option && pair ? "17500" : "");
-  record.Add("32", dice.Pick(kSides)).Add("EL", pair ? dice.Pick(kSides) : "");
+  const char* const commodity = option ? "TXO" : "TXF";
+  record.Add("33", commodity).Add("29", "202402").Add("V8", option ? "C" : " ");
+  record.Add("34", option ? 17000 + 100 * dice.Roll(20) : 0).Add("32", dice.Pick(kSides));
+  if (!pair) return;
+  record.Add("V9", commodity).Add("W0", "202403").Add("EL", dice.Pick(kSides));
+  if (option) record.Add("W1", "P").Add("W2", "17500");
 }
 
 void AddFuturesOrder(CRecordText& record, int number) {
@@ -145,14 +145,14 @@ void AddFuturesOrder(CRecordText& record, int number) {
   const int quantity = 1 + dice.Roll(9);
   const int state = dice.Roll(8);
   record.Add("O4", 0).Add("V5", dice.Roll(4) == 0 ? 1 : 0);
-  record.Add("46", number, 8).Add("36", number + 7, 10);
+  record.Add("46", number, 12).Add("36", "20240115-F004-" + std::to_string(10000000 + number));
   AddContract(record, dice.Roll(3) == 0, dice.Roll(5) == 0);
   record.Add("W3", dice.Pick({"", "0", "1"})).Add("70", quantity);
-  record.Add("41", state == 1 ? quantity : 0).Add("37", 0);
+  record.Add("41", state == 1 ? quantity : 0);
   record.Add("47", state == 2 ? quantity : 0).Add("39", state == 0 ? "E" : " ");
-  record.Add("K1", state == 0 ? "保證金不足!請入金" : "").Add("N6", state == 3 ? "0" : "1");
+  record.Add("K1", state == 0 ? "保證金不足!請入金" : "委託成功").Add("N6", state == 3 ? "0" : "1");
   record.Add("27", dice.Roll(4) == 0 ? 1 : 2).Add("31", 17000 + dice.Roll(900));
-  record.AddTime("22", "789").Add("21", 1130115).Add("44", 1130115);
+  record.AddTime("22", "789012").Add("21", 1130115).Add("44", 1130115);
   record.Add("JV", dice.Pick({"Y", "N", ""})).Add("MT", dice.Pick({"0", "1", ""}));
 }
 
