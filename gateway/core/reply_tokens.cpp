@@ -54,6 +54,7 @@ void CGatewayPub::CheckError(const char* reply, int* status, char* message, int 
 }
 
 void CGatewayPub::MakeErrorMsg(char* message) {
+  if (message == nullptr) return;
   const char* const source = SourceOf(AsText(message));
   const size_t size = strlen(source);
   if (size == 0) return;

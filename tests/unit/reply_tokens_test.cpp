@@ -345,6 +345,10 @@ TEST_F(ReplyTokens, MakeErrorMsgNamesASourceWhereNoneIs) {
   }
 }
 
+TEST_F(ReplyTokens, MakeErrorMsgTakesNull) {
+  m_gateway.MakeErrorMsg(nullptr);
+}
+
 TEST_F(ReplyTokens, MakeErrorMsgCutsNoMessage) {
   for (size_t length : {190U, 191U, 199U, 200U, 201U, 4000U}) {
     const std::string text(length, 'm');
