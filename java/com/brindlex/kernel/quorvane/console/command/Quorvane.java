@@ -44,6 +44,7 @@ public final class Quorvane {
         root.addSubcommand(new DecodeCommand());
         root.addSubcommand(new ExplainCommand());
         root.addSubcommand(new SimulateCommand());
+        root.addSubcommand(new DocumentsCommand());
         root.setCaseInsensitiveEnumValuesAllowed(true);
         root.setUsageHelpAutoWidth(true);
         root.setParameterExceptionHandler(Quorvane::badUsage);
