@@ -20,7 +20,9 @@ public final class Credentials {
      */
     public static Credentials of(
             String branch, String idNumber, String account, String password) {
-        return new Credentials(branch, idNumber + "&" + account, password);
+        // an account alone must stand first: behind an empty first part nothing is looked at
+        String identity = idNumber.isEmpty() ? account + "&" : idNumber + "&" + account;
+        return new Credentials(branch, identity, password);
     }
 
     /** Branch code. */
