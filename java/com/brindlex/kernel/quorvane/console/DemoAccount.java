@@ -9,6 +9,9 @@ import static com.brindlex.kernel.quorvane.console.Stage.PLATFORM;
 import static com.brindlex.kernel.quorvane.console.Stage.SERIAL;
 
 import com.brindlex.kernel.quorvane.gatewayjni;
+import com.brindlex.kernel.quorvane.typed.BankBalance;
+import com.brindlex.kernel.quorvane.typed.Operation;
+import com.brindlex.kernel.quorvane.typed.Result;
 
 /** Bank balance, password change and account opening. */
 final class DemoAccount {
@@ -18,23 +21,23 @@ final class DemoAccount {
 
     static void play(Stage stage) {
         stage.screen.title("Account maintenance");
-        String balance = stage.ask("Balance of the linked bank account",
+        Result balance = stage.ask("Balance of the linked bank account",
                 (sequence, status) -> gatewayjni.QueryBankRemainEncode(
                         MARKET, PLATFORM, sequence, SERIAL, ADDRESS, BRANCH, IDENTITY, PASSWORD, status),
-                gatewayjni::QueryBankRemainDecode, 1);
-        stage.record(ResultLayout.BALANCE, ResultLayout.list(balance));
-        stage.field(ResultLayout.list(balance), 0, 4, "1250000");
+                Operation.QUERY_BANK_REMAIN_DECODE, 1);
+        stage.record(balance.rows());
+        stage.field(balance.rows(), 0, BankBalance.BALANCE, "1250000");
         stage.ask("Change the password to one that is too short", change("abc"),
-                gatewayjni::ChangePasswordDecode, -1, "[GATEWAY]新密碼不符規定(E007)");
+                Operation.CHANGE_PASSWORD_DECODE, -1, "[GATEWAY]新密碼不符規定(E007)");
         stage.ask("Change the password to one with a blank", change(NEW_PASSWORD),
-                gatewayjni::ChangePasswordDecode, 1, "");
+                Operation.CHANGE_PASSWORD_DECODE, 1, "");
         stage.ask("Log in with the old password", DemoLogin.login(IDENTITY, PASSWORD, ADDRESS),
-                gatewayjni::AuthDecode, -1, "密碼錯誤");
+                Operation.AUTH_DECODE, -1, "密碼錯誤");
         stage.ask("Log in with the new one", DemoLogin.login(IDENTITY, NEW_PASSWORD, ADDRESS),
-                gatewayjni::AuthDecode, 1);
-        stage.ask("Apply for an account", open("C211112222&"), gatewayjni::OpenAccountDecode, 1, "");
+                Operation.AUTH_DECODE, 1);
+        stage.ask("Apply for an account", open("C211112222&"), Operation.OPEN_ACCOUNT_DECODE, 1, "");
         stage.ask("Apply for an account that exists", open("A123456789&"),
-                gatewayjni::OpenAccountDecode, -1, "[GATEWAY]客戶已開戶(E007)");
+                Operation.OPEN_ACCOUNT_DECODE, -1, "[GATEWAY]客戶已開戶(E007)");
     }
 
     private static Stage.Encoder change(String wanted) {

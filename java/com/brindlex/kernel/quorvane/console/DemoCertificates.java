@@ -9,6 +9,7 @@ import static com.brindlex.kernel.quorvane.console.Stage.PLATFORM;
 import static com.brindlex.kernel.quorvane.console.Stage.SERIAL;
 
 import com.brindlex.kernel.quorvane.gatewayjni;
+import com.brindlex.kernel.quorvane.typed.Operation;
 import java.time.LocalDate;
 import java.time.format.DateTimeFormatter;
 
@@ -35,27 +36,27 @@ final class DemoCertificates {
         stage.screen.title("The life of a certificate");
         LocalDate end = LocalDate.now(stage.clock).plusDays(365);
         stage.ask("Apply with a wrong date of birth", holder(gatewayjni::ApplyCertEncode, "19800102"),
-                gatewayjni::ApplyCertDecode, -1, "[CERT]E007 出生日期錯誤");
+                Operation.APPLY_CERT_DECODE, -1, "[CERT]E007 出生日期錯誤");
         stage.ask("Apply", holder(gatewayjni::ApplyCertEncode, BIRTH),
-                gatewayjni::ApplyCertDecode, 1, state("已核發", end));
+                Operation.APPLY_CERT_DECODE, 1, state("已核發", end));
         stage.ask("Ask for its state", plain(gatewayjni::GetCertStatusEncode),
-                gatewayjni::GetCertStatusDecode, 1, state("已核發", end));
+                Operation.GET_CERT_STATUS_DECODE, 1, state("已核發", end));
         stage.ask("Confirm that it is installed", plain(gatewayjni::InstallCertOKEncode),
-                gatewayjni::InstallCertOKDecode, 1, state("已安裝", end));
+                Operation.INSTALL_CERT_OK_DECODE, 1, state("已安裝", end));
         stage.ask("Confirm that it is opened", plain(gatewayjni::OpenCertEncode),
-                gatewayjni::OpenCertDecode, 1, state("已開通", end));
+                Operation.OPEN_CERT_DECODE, 1, state("已開通", end));
         LocalDate later = end.plusDays(365);
         stage.ask("Renew", holder(gatewayjni::ReNewCertEncode, BIRTH),
-                gatewayjni::ReNewCertDecode, 1, state("已開通", later));
-        stage.ask("Fetch", plain(gatewayjni::GetCertEncode), gatewayjni::GetCertDecode, 1, state("已開通", later));
+                Operation.RENEW_CERT_DECODE, 1, state("已開通", later));
+        stage.ask("Fetch", plain(gatewayjni::GetCertEncode), Operation.GET_CERT_DECODE, 1, state("已開通", later));
         stage.ask("Fetch, the form for long messages", plain(gatewayjni::GetCertEncode2),
-                gatewayjni::GetCertDecode, 1, state("已開通", later));
+                Operation.GET_CERT_DECODE, 1, state("已開通", later));
         stage.ask("Register", plain(gatewayjni::RegisterCertEncode),
-                gatewayjni::RegisterCertDecode, 1, state("已開通", later));
+                Operation.REGISTER_CERT_DECODE, 1, state("已開通", later));
         stage.ask("Revoke", holder(gatewayjni::RevokeCertEncode, BIRTH),
-                gatewayjni::RevokeCertDecode, 1, state("已廢止", later));
+                Operation.REVOKE_CERT_DECODE, 1, state("已廢止", later));
         stage.ask("Fetch what was revoked", plain(gatewayjni::GetCertEncode),
-                gatewayjni::GetCertDecode, -1, "[CERT]E007 憑證狀態不符 已廢止");
+                Operation.GET_CERT_DECODE, -1, "[CERT]E007 憑證狀態不符 已廢止");
         stage.refusedHere("Fetch with an empty message",
                 (sequence, status) -> gatewayjni.GetCertEncode(
                         MARKET, PLATFORM, sequence, SERIAL, ADDRESS, "", status),

@@ -7,14 +7,17 @@ import static com.brindlex.kernel.quorvane.console.Stage.PLATFORM;
 import static com.brindlex.kernel.quorvane.console.Stage.SERIAL;
 
 import com.brindlex.kernel.quorvane.gatewayjni;
+import com.brindlex.kernel.quorvane.typed.Contracts;
+import com.brindlex.kernel.quorvane.typed.FuturesFills;
+import com.brindlex.kernel.quorvane.typed.FuturesOrders;
+import com.brindlex.kernel.quorvane.typed.Operation;
+import com.brindlex.kernel.quorvane.typed.Result;
 import java.time.LocalDate;
-import java.util.List;
 
 /** Futures and options: orders of one leg and two, and every list that shows them. */
 final class DemoFutures {
     private static final String BRANCH = "F001";
     private static final String IDENTITY = "A123456789&7654321";
-    private static final int STATE = 5;
     private static final String[] ORDER_STATES = {"部份成交", "撮合部份成交", "已成交", "已取消"};
 
     private final Stage stage;
@@ -71,21 +74,21 @@ final class DemoFutures {
         });
 
         stage.ask("Take one contract off the spread", order(spread.with(1, 250000), 'C', 4, false),
-                gatewayjni::FutSubmitOrderDecode, 1, acknowledged(4));
+                Operation.FUT_SUBMIT_ORDER_DECODE, 1, acknowledged(4));
         stage.ask("Change the price of the spread", order(spread.with(1, 260000), 'A', 4, true),
-                gatewayjni::FutSubmitOrderDecode, 1, acknowledged(4));
+                Operation.FUT_SUBMIT_ORDER_DECODE, 1, acknowledged(4));
         stage.ask("Cancel the spread", order(spread.with(1, 260000), 'D', 4, true),
-                gatewayjni::FutSubmitOrderDecode, 1, acknowledged(4));
+                Operation.FUT_SUBMIT_ORDER_DECODE, 1, acknowledged(4));
         stage.ask("Buy more than the margin allows",
                 order(new Ticket(1, future, NO_LEG, 2, 'R', 50, 229500000), 'I', 0, false),
-                gatewayjni::FutSubmitOrderDecode, -1, "保證金不足");
+                Operation.FUT_SUBMIT_ORDER_DECODE, -1, "保證金不足");
         stage.refusedHere("An option without a strike price",
                 order(new Ticket(2, new Leg("TXO", month, "", "C", 'B'), NO_LEG, 1, 'R', 1, 0), 'I', 0, false),
                 "[CLIENT]傳入的參數錯誤");
     }
 
     private void submit(String title, Ticket ticket, int number, boolean tagged) {
-        stage.ask(title, order(ticket, 'I', 0, tagged), gatewayjni::FutSubmitOrderDecode, 1, acknowledged(number));
+        stage.ask(title, order(ticket, 'I', 0, tagged), Operation.FUT_SUBMIT_ORDER_DECODE, 1, acknowledged(number));
     }
 
     private String acknowledged(int number) {
@@ -109,38 +112,34 @@ final class DemoFutures {
     }
 
     private void lists() {
-        String book = stage.ask("Order book of today",
+        Result book = stage.ask("Order book of today",
                 (sequence, status) -> gatewayjni.FutQueryOrderEncode(MARKET, PLATFORM, sequence, SERIAL, ADDRESS,
                         BRANCH, IDENTITY, PASSWORD, stage.today(), 0, status),
-                gatewayjni::FutQueryOrderDecode, 1);
-        List<List<String>> orders = ResultLayout.list(book);
-        stage.table(ResultLayout.FUTURES_ORDERS, orders, ORDER_STATES.length);
-        for (int i = 0; i < ORDER_STATES.length; i++) {
-            stage.field(orders, i, STATE, ORDER_STATES[i]);
-        }
-        String fills = stage.ask("Fills of today",
+                Operation.FUT_QUERY_ORDER_DECODE, 1);
+        stage.orders(book.rows(), FuturesOrders.STATUS, FuturesOrders.MESSAGE, ORDER_STATES,
+                FuturesOrders.ORDER_NUMBER, FuturesOrders.LEG, Contracts.COMMODITY, Contracts.MONTH,
+                Contracts.CALL_PUT, Contracts.STRIKE, FuturesOrders.ORDERED, FuturesOrders.STATUS,
+                FuturesOrders.FILLED, FuturesOrders.CANCELLED, FuturesOrders.PRICE);
+        Result fills = stage.ask("Fills of today",
                 (sequence, status) -> gatewayjni.FutQueryReplyEncode(MARKET, PLATFORM, sequence, SERIAL, ADDRESS,
                         BRANCH, IDENTITY, PASSWORD, stage.today(), stage.today(), status),
-                gatewayjni::FutQueryReplyDecode, 1);
-        stage.table(ResultLayout.FUTURES_FILLS, ResultLayout.list(fills), 3);
+                Operation.FUT_QUERY_REPLY_DECODE, 1);
+        stage.table(fills.rows(), 3, FuturesFills.TIME, FuturesFills.ORDER_NUMBER, FuturesFills.LEG,
+                Contracts.COMMODITY, Contracts.MONTH, Contracts.CALL_PUT, Contracts.STRIKE,
+                FuturesFills.FILLED, FuturesFills.ORDER_PRICE, FuturesFills.PRICE);
         positions();
-        String margin = stage.ask("Margin account",
+        Result margin = stage.ask("Margin account",
                 (sequence, status) -> gatewayjni.QueryFinanceEncode(
                         MARKET, PLATFORM, sequence, SERIAL, ADDRESS, BRANCH, IDENTITY, PASSWORD, 0, status),
-                gatewayjni::QueryFinanceDecode, 1);
-        stage.record(ResultLayout.MARGIN, ResultLayout.list(margin));
+                Operation.QUERY_FINANCE_DECODE, 1);
+        stage.record(margin.rows());
     }
 
     private void positions() {
-        String held = stage.ask("Open positions",
+        Result held = stage.ask("Open positions",
                 (sequence, status) -> gatewayjni.FutQueryInventoryEncode(
                         MARKET, PLATFORM, sequence, SERIAL, ADDRESS, BRANCH, IDENTITY, PASSWORD, status),
-                gatewayjni::FutQueryInventoryDecode, 1);
-        for (ResultLayout.Section section : ResultLayout.sections(held)) {
-            boolean futures = section.number() == 5;
-            stage.screen.line(futures ? "  futures" : "  options");
-            stage.table(futures ? ResultLayout.FUTURES_POSITIONS : ResultLayout.OPTIONS_POSITIONS,
-                    section.records(), futures ? 1 : 2);
-        }
+                Operation.FUT_QUERY_INVENTORY_DECODE, 1);
+        stage.sections(held, 1, 2);
     }
 }

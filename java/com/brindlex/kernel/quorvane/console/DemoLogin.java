@@ -3,8 +3,10 @@ package com.brindlex.kernel.quorvane.console;
 import static com.brindlex.kernel.quorvane.gatewayjni.AuthEncode;
 import static com.brindlex.kernel.quorvane.gatewayjni.GetTotalAccountEncode;
 
-import com.brindlex.kernel.quorvane.gatewayjni;
 import com.brindlex.kernel.quorvane.simulator.Line;
+import com.brindlex.kernel.quorvane.typed.Accounts;
+import com.brindlex.kernel.quorvane.typed.Operation;
+import com.brindlex.kernel.quorvane.typed.Result;
 
 /** Login: accepted, refused, with the gateway down, without an address. */
 final class DemoLogin {
@@ -26,18 +28,18 @@ final class DemoLogin {
     static void play(Stage stage) {
         stage.screen.title("Login");
         stage.showHeader(true);
-        String result = stage.ask("Log in with ID number and account",
-                login(IDENTITY, PASSWORD, ADDRESS), gatewayjni::AuthDecode, 1);
-        stage.table(ResultLayout.ACCOUNTS, ResultLayout.list(result), 4);
-        stage.field(ResultLayout.list(result), 1, 2, "0009876");
+        Result result = stage.ask("Log in with ID number and account",
+                login(IDENTITY, PASSWORD, ADDRESS), Operation.AUTH_DECODE, 1);
+        stage.sections(result, 3, 1);
+        stage.field(result.rows(), 1, Accounts.ACCOUNT, "0009876");
         stage.showHeader(false);
         stage.ask("List all accounts",
                 (sequence, status) -> GetTotalAccountEncode(Stage.MARKET, Stage.PLATFORM, sequence,
                         Stage.SERIAL, ADDRESS, BRANCH, IDENTITY, PASSWORD, status),
-                gatewayjni::GetTotalAccountDecode, 1, "3!" + ACCOUNTS);
-        stage.ask("A wrong password", login(IDENTITY, "letmein1", ADDRESS), gatewayjni::AuthDecode, -1, "密碼錯誤");
+                Operation.GET_TOTAL_ACCOUNT_DECODE, 1, "3!" + ACCOUNTS);
+        stage.ask("A wrong password", login(IDENTITY, "letmein1", ADDRESS), Operation.AUTH_DECODE, -1, "密碼錯誤");
         stage.ask("An unknown account", login("A123456789&5555555", PASSWORD, ADDRESS),
-                gatewayjni::AuthDecode, -1, "查無此帳號");
+                Operation.AUTH_DECODE, -1, "查無此帳號");
         onBadLines(stage);
         stage.refusedHere("A device without network address", login(IDENTITY, PASSWORD, ""),
                 "[CLIENT] 無法取得IP，請確認網路連線是否正常！");
@@ -48,10 +50,10 @@ final class DemoLogin {
     private static void onBadLines(Stage stage) {
         stage.gateway().setLine(Line.GATEWAY_DOWN);
         stage.ask("The gateway cannot reach its host", login(IDENTITY, PASSWORD, ADDRESS),
-                gatewayjni::AuthDecode, -1, "[GATEWAY]主機連線失敗");
+                Operation.AUTH_DECODE, -1, "[GATEWAY]主機連線失敗");
         stage.gateway().setLine(Line.BROKER_TIMEOUT);
         stage.ask("The broker's host does not answer", login(IDENTITY, PASSWORD, ADDRESS),
-                gatewayjni::AuthDecode, -1, "[BROKER]主機連線失敗");
+                Operation.AUTH_DECODE, -1, "[BROKER]主機連線失敗");
         stage.gateway().setLine(Line.UP);
     }
 }

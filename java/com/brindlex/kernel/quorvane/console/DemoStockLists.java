@@ -11,20 +11,29 @@ import static com.brindlex.kernel.quorvane.console.Stage.SERIAL;
 import com.brindlex.kernel.quorvane.gatewayjni;
 import com.brindlex.kernel.quorvane.simulator.Brokerage;
 import com.brindlex.kernel.quorvane.simulator.Gateway;
+import com.brindlex.kernel.quorvane.typed.Column;
+import com.brindlex.kernel.quorvane.typed.Operation;
+import com.brindlex.kernel.quorvane.typed.Result;
+import com.brindlex.kernel.quorvane.typed.Settlements;
+import com.brindlex.kernel.quorvane.typed.StockFills;
+import com.brindlex.kernel.quorvane.typed.StockOrders;
 import java.time.LocalDate;
-import java.util.List;
 
 /** Order book, fills, positions, credit and settlement of the securities account. */
 final class DemoStockLists {
     private static final String[] ORDER_STATES = {
         "部份成交", "已改量", "預約單", "已取消", "已取消", "委託失敗&交易所退單 ", "已成交",
     };
-    private static final int STATE = 5;
-
-    private static final ResultLayout[] SECTIONS = {
-        ResultLayout.CASH_POSITIONS, ResultLayout.MARGIN_POSITIONS, ResultLayout.SHORT_POSITIONS,
-        ResultLayout.OTHER_POSITIONS,
+    private static final Column<?>[] SETTLED = {
+        Settlements.DATE, Settlements.TYPE, Settlements.STOCK_CODE, Settlements.QUANTITY,
+        Settlements.PRICE, Settlements.AMOUNT, Settlements.AMOUNT_79, Settlements.AMOUNT_78,
+        Settlements.SIGN, Settlements.NET_AMOUNT,
     };
+    private static final Column<?>[] SETTLED_JZG = SETTLED.clone();
+
+    static {
+        SETTLED_JZG[1] = Settlements.BROKER_TYPE;
+    }
 
     private DemoStockLists() {}
 
@@ -32,38 +41,36 @@ final class DemoStockLists {
         stage.screen.title("What became of the stock orders");
         orderBook(stage);
         fills(stage);
-        String positions = stage.ask("Positions", positions(), gatewayjni::QueryInventoryDecode, 1);
-        sections(stage, positions, 3, 1, 1, 1);
-        String credit = stage.ask("Credit figures of 2330", credit("2330"), gatewayjni::QueryCreditInfoDecode, 1);
-        stage.record(ResultLayout.CREDIT, ResultLayout.record(credit));
+        Result positions = stage.ask("Positions", positions(), Operation.QUERY_INVENTORY_DECODE, 1);
+        stage.sections(positions, 3, 1, 1, 1);
+        Result credit = stage.ask("Credit figures of 2330", credit("2330"), Operation.QUERY_CREDIT_INFO_DECODE, 1);
+        stage.record(credit.rows());
         stage.ask("Credit figures of a stock that has none", credit("6547"),
-                gatewayjni::QueryCreditInfoDecode, 1, "@@@@@@@!");
-        String settled = stage.ask("Settlement of today", settlement("1", ""), gatewayjni::PaymentDecode, 1);
-        stage.table(ResultLayout.SETTLEMENT, ResultLayout.list(settled), 2);
+                Operation.QUERY_CREDIT_INFO_DECODE, 1, "@@@@@@@!");
+        Result settled = stage.ask("Settlement of today", settlement("1", ""), Operation.PAYMENT_DECODE, 1);
+        stage.table(settled.rows(), 2, SETTLED);
         stage.refusedHere("Settlement without dates", settlement("", ""), "[CLIENT] 日期輸入錯誤");
         otherBrokerage(stage);
     }
 
     private static void orderBook(Stage stage) {
-        String book = stage.ask("Order book of today",
+        Result book = stage.ask("Order book of today",
                 (sequence, status) -> gatewayjni.QueryOrderEncode(MARKET, PLATFORM, sequence, SERIAL, ADDRESS,
                         BRANCH, IDENTITY, PASSWORD, stage.today(), 0, status),
-                (reply, status) -> gatewayjni.QueryOrderDecode(MARKET, reply, status), 1);
-        List<List<String>> orders = ResultLayout.list(book);
-        stage.table(ResultLayout.STOCK_ORDERS, orders, ORDER_STATES.length);
-        for (int i = 0; i < ORDER_STATES.length; i++) {
-            stage.field(orders, i, STATE, ORDER_STATES[i]);
-        }
+                Operation.QUERY_ORDER_DECODE, 1);
+        stage.orders(book.rows(), StockOrders.STATUS, StockOrders.MESSAGE, ORDER_STATES,
+                StockOrders.ORDER_NUMBER, StockOrders.TYPE, StockOrders.STOCK_CODE,
+                StockOrders.ORDERED, StockOrders.STATUS, StockOrders.FILLED, StockOrders.CANCELLED,
+                StockOrders.PRICE, StockOrders.TIME);
     }
 
     private static void fills(Stage stage) {
-        String list = stage.ask("Fills of today", fillsOf(stage.today()), gatewayjni::QueryReplyDecode, 1);
-        List<List<String>> fills = ResultLayout.list(list);
-        stage.table(ResultLayout.STOCK_FILLS, fills, 2);
-        stage.field(fills, 0, 4, "99450");
-        stage.field(fills, 1, 5, "185050");
+        Result fills = stage.ask("Fills of today", fillsOf(stage.today()), Operation.QUERY_REPLY_DECODE, 1);
+        stage.table(fills.rows(), 2);
+        stage.field(fills.rows(), 0, StockFills.PRICE, "99450");
+        stage.field(fills.rows(), 1, StockFills.AMOUNT, "185050");
         String past = Stage.rocDate(LocalDate.now(stage.clock).minusDays(30));
-        stage.ask("Fills of a day without any", fillsOf(past), gatewayjni::QueryReplyDecode, 1, "0!");
+        stage.ask("Fills of a day without any", fillsOf(past), Operation.QUERY_REPLY_DECODE, 1, "0!");
     }
 
     private static Stage.Encoder fillsOf(String day) {
@@ -86,14 +93,6 @@ final class DemoStockLists {
                 MARKET, PLATFORM, sequence, SERIAL, ADDRESS, BRANCH, IDENTITY, PASSWORD, first, last, status);
     }
 
-    private static void sections(Stage stage, String result, int... wanted) {
-        for (ResultLayout.Section section : ResultLayout.sections(result)) {
-            ResultLayout layout = SECTIONS[section.number()];
-            stage.screen.line("  " + layout.name().toLowerCase(java.util.Locale.ROOT).replace('_', ' '));
-            stage.table(layout, section.records(), wanted[section.number()]);
-        }
-    }
-
     /** The same lists in the reply layouts of brokerage JZG. */
     private static void otherBrokerage(Stage stage) {
         Gateway standard = stage.gateway();
@@ -103,14 +102,13 @@ final class DemoStockLists {
                 (sequence, status) -> gatewayjni.SubmitOrderEncode(MARKET, PLATFORM, sequence, SERIAL, ADDRESS,
                         BRANCH, IDENTITY, PASSWORD, "2317", stage.today(), 1, 1000, 20000, (byte) 'B', (byte) '0',
                         (byte) 1, (byte) 0, (byte) 0, (byte) 1, status),
-                gatewayjni::SubmitOrderDecode, 1);
+                Operation.SUBMIT_ORDER_DECODE, 1);
         stage.exchange("The exchange fills it.", () -> stage.gateway().fillStock("A0001", 1000, 20000));
-        String positions = stage.ask("Positions", positions(), gatewayjni::QueryInventoryDecodeJZG, 1);
-        sections(stage, positions, 2, 1, 1);
-        String settled = stage.ask("Settlement of today", settlement("1", ""), gatewayjni::PaymentDecodeJZG, 1);
-        List<List<String>> records = ResultLayout.list(settled);
-        stage.table(ResultLayout.SETTLEMENT_JZG, records, 1);
-        stage.field(records, 0, 2, "12");
+        Result positions = stage.ask("Positions", positions(), Operation.QUERY_INVENTORY_DECODE_JZG, 1);
+        stage.sections(positions, 2, 1, 1);
+        Result settled = stage.ask("Settlement of today", settlement("1", ""), Operation.PAYMENT_DECODE_JZG, 1);
+        stage.table(settled.rows(), 1, SETTLED_JZG);
+        stage.field(settled.rows(), 0, Settlements.BROKER_TYPE, "12");
         stage.use(standard);
     }
 }

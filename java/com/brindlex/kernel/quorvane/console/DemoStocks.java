@@ -9,6 +9,7 @@ import static com.brindlex.kernel.quorvane.console.Stage.PLATFORM;
 import static com.brindlex.kernel.quorvane.console.Stage.SERIAL;
 
 import com.brindlex.kernel.quorvane.gatewayjni;
+import com.brindlex.kernel.quorvane.typed.Operation;
 
 /** Stock orders: placed, changed, cancelled and refused. */
 final class DemoStocks {
@@ -46,7 +47,7 @@ final class DemoStocks {
                     return gatewayjni.SubmitOrderEncode2(MARKET, PLATFORM, sequence, SERIAL, ADDRESS, BRANCH,
                             IDENTITY, PASSWORD, (byte) 'I', LOTS);
                 },
-                gatewayjni::SubmitOrderDecode, 1, "@" + stage.today() + "@@1!");
+                Operation.SUBMIT_ORDER_DECODE, 1, "@" + stage.today() + "@@1!");
     }
 
     private void place() {
@@ -72,7 +73,7 @@ final class DemoStocks {
     }
 
     private void submit(String title, Ticket t, int number, char accepted) {
-        stage.ask(title, plain(t), gatewayjni::SubmitOrderDecode, 1, acknowledged(number, accepted));
+        stage.ask(title, plain(t), Operation.SUBMIT_ORDER_DECODE, 1, acknowledged(number, accepted));
     }
 
     private void submit1(String title, Ticket t, int number) {
@@ -80,7 +81,7 @@ final class DemoStocks {
                 (sequence, status) -> gatewayjni.SubmitOrderEncode1(MARKET, PLATFORM, sequence, SERIAL, ADDRESS,
                         BRANCH, IDENTITY, PASSWORD, t.stock, stage.today(), t.quantity, LOT, t.price,
                         (byte) t.side, FLAG_13, t.kind, t.priceKind, t.tradeType, t.n6, status),
-                gatewayjni::SubmitOrderDecode, 1, acknowledged(number, '1'));
+                Operation.SUBMIT_ORDER_DECODE, 1, acknowledged(number, '1'));
     }
 
     private Stage.Encoder plain(Ticket t) {
@@ -96,10 +97,10 @@ final class DemoStocks {
     private void refuse() {
         stage.ask("Buy above the day's limit",
                 plain(new Ticket("2330", 'B', 1, 120000, CASH, LIMIT, LOTS, AT_ONCE)),
-                gatewayjni::SubmitOrderDecode, -1, "委託價格超過漲停價");
+                Operation.SUBMIT_ORDER_DECODE, -1, "委託價格超過漲停價");
         stage.ask("Sell what is not held",
                 plain(new Ticket("6547", 'S', 1, 5000, CASH, LIMIT, LOTS, AT_ONCE)),
-                gatewayjni::SubmitOrderDecode, -1, "庫存不足");
+                Operation.SUBMIT_ORDER_DECODE, -1, "庫存不足");
         stage.refusedHere("An order for nothing",
                 plain(new Ticket("2330", 'B', 0, 99500, CASH, LIMIT, LOTS, AT_ONCE)), "[CLIENT] 委託數量不可小於0");
         stage.refusedHere("A stock code of seven characters",
@@ -115,22 +116,22 @@ final class DemoStocks {
                         BRANCH, IDENTITY, PASSWORD, margin.stock, stage.today(), reference(4), margin.quantity,
                         LOT, margin.price, (byte) margin.side, FLAG_13, margin.kind, LIMIT, margin.tradeType,
                         margin.n6, status),
-                gatewayjni::CancelChangeOrderDecode, 1, "");
+                Operation.CANCEL_CHANGE_ORDER_DECODE, 1, "");
         stage.ask("Take seven shares off the odd lot",
                 (sequence, status) -> gatewayjni.ChangeOrderEncode1(MARKET, PLATFORM, sequence, SERIAL, ADDRESS,
                         BRANCH, IDENTITY, PASSWORD, odd.stock, stage.today(), reference(2), odd.quantity, LOT,
                         odd.price, (byte) odd.side, FLAG_13, odd.kind, LIMIT, odd.tradeType, odd.n6, status),
-                gatewayjni::CancelChangeOrderDecode, 1, "");
+                Operation.CANCEL_CHANGE_ORDER_DECODE, 1, "");
         stage.ask("Cancel the rest of the margin order", cancel(margin, 4),
-                gatewayjni::CancelChangeOrderDecode, 1, "");
+                Operation.CANCEL_CHANGE_ORDER_DECODE, 1, "");
         stage.ask("Cancel the fixed-price order",
                 (sequence, status) -> gatewayjni.CancelOrderEncode1(MARKET, PLATFORM, sequence, SERIAL, ADDRESS,
                         BRANCH, IDENTITY, PASSWORD, fixed.stock, stage.today(), reference(5), fixed.quantity,
                         LOT, fixed.price, (byte) fixed.side, FLAG_13, fixed.kind, LIMIT, fixed.tradeType,
                         fixed.n6, status),
-                gatewayjni::CancelChangeOrderDecode, 1, "");
+                Operation.CANCEL_CHANGE_ORDER_DECODE, 1, "");
         stage.ask("Cancel the margin order once more", cancel(margin, 4),
-                gatewayjni::CancelChangeOrderDecode, -1, "委託已無剩餘數量");
+                Operation.CANCEL_CHANGE_ORDER_DECODE, -1, "委託已無剩餘數量");
     }
 
     private Stage.Encoder cancel(Ticket t, int number) {

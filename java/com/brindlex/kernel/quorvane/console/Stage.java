@@ -1,10 +1,18 @@
 package com.brindlex.kernel.quorvane.console;
 
 import com.brindlex.kernel.quorvane.simulator.Gateway;
+import com.brindlex.kernel.quorvane.typed.Cell;
+import com.brindlex.kernel.quorvane.typed.Column;
+import com.brindlex.kernel.quorvane.typed.Operation;
+import com.brindlex.kernel.quorvane.typed.Result;
+import com.brindlex.kernel.quorvane.typed.Row;
+import com.brindlex.kernel.quorvane.typed.Section;
+import java.math.BigDecimal;
 import java.time.Clock;
 import java.time.LocalDate;
 import java.util.ArrayList;
 import java.util.List;
+import java.util.Locale;
 import java.util.Set;
 
 /** Where the demonstration is played: a device, its gateway, the screen, and what was expected. */
@@ -24,11 +32,6 @@ final class Stage {
     /** Builds a request. */
     interface Encoder {
         String encode(int sequence, int[] status);
-    }
-
-    /** Reads a reply. */
-    interface Decoder {
-        String decode(String reply, int[] status);
     }
 
     final Screen screen;
@@ -70,7 +73,7 @@ final class Stage {
     }
 
     /** Sends a request that must be built, and shows everything on its way there and back. */
-    String ask(String title, Encoder encoder, Decoder decoder, int wanted) {
+    Result ask(String title, Encoder encoder, Operation decoder, int wanted) {
         steps++;
         screen.step(title);
         int[] status = {0};
@@ -78,23 +81,24 @@ final class Stage {
         screen.labelled("request", Screen.Style.PLAIN, request);
         if (status[0] != 1) {
             expect(false, "a request", request);
-            return "";
+            return Result.of(decoder, status[0], request);
         }
         showFields(request);
         String reply = gateway.answer(request);
         screen.labelled("reply", Screen.Style.DIM, reply);
         checkNames(Scene.ofRequest(WireField.cut(request)), WireField.cut(reply));
-        String result = decoder.decode(reply, status);
-        screen.labelled("result", status[0] == 1 ? Screen.Style.PLAIN : Screen.Style.BAD, result);
-        screen.labelled(
-                "status", status[0] == 1 ? Screen.Style.GOOD : Screen.Style.BAD, status[0] + "");
-        expect(status[0] == wanted, "status " + wanted, "status " + status[0]);
+        Result result = decoder.decode(MARKET, reply);
+        Screen.Style style = result.isSuccess() ? Screen.Style.GOOD : Screen.Style.BAD;
+        screen.labelled("result", result.isSuccess() ? Screen.Style.PLAIN : style, result.text());
+        screen.labelled("status", style, result.status() + "");
+        expect(result.status() == wanted, "status " + wanted, "status " + result.status());
+        expect(result.faults().isEmpty(), "a sound result", result.faults().toString());
         return result;
     }
 
     /** As {@link #ask}, and holds the result against the text that it must be. */
-    void ask(String title, Encoder encoder, Decoder decoder, int wanted, String result) {
-        String actual = ask(title, encoder, decoder, wanted);
+    void ask(String title, Encoder encoder, Operation decoder, int wanted, String result) {
+        String actual = ask(title, encoder, decoder, wanted).text();
         expect(actual.equals(result), result, actual);
     }
 
@@ -121,40 +125,90 @@ final class Stage {
         }
     }
 
-    /** Shows the records of a list as a table and checks how many there are. */
-    void table(ResultLayout layout, List<List<String>> records, int wanted) {
-        List<List<String>> rows = layout.readable(records);
-        List<String> columns = layout.columns();
-        for (int column = columns.size() - 1; column >= 0; column--) {
-            if (!layout.isMain(column)) {
-                columns.set(column, "");
-                for (List<String> row : rows) {
-                    row.set(column, "");
-                }
-            }
+    /** Shows rows as a table and checks how many there are; of all columns, or of these. */
+    void table(List<Row> rows, int wanted, Column<?>... columns) {
+        expect(rows.size() == wanted, wanted + " rows", rows.size() + " rows");
+        if (rows.isEmpty()) {
+            return;
         }
-        screen.table(columns, rows);
-        expect(records.size() == wanted, wanted + " records", records.size() + " records");
+        List<Column<?>> shown = columns.length > 0 ? List.of(columns) : rows.get(0).table().columns();
+        List<String> names = new ArrayList<>();
+        shown.forEach(column -> names.add(isLeftOut(column) ? "" : words(column)));
+        List<List<String>> cells = new ArrayList<>();
+        for (Row row : rows) {
+            List<String> line = new ArrayList<>();
+            shown.forEach(column -> line.add(isLeftOut(column) ? "" : label(row, column)));
+            cells.add(line);
+        }
+        screen.table(names, cells);
     }
 
-    /** Shows a single record as named values. */
-    void record(ResultLayout layout, List<List<String>> records) {
-        expect(records.size() == 1, "1 record", records.size() + " records");
+    /** Shows an order book, and checks the state that each order is in. */
+    void orders(List<Row> rows, Column<?> state, Column<?> message, String[] wanted,
+            Column<?>... columns) {
+        table(rows, wanted.length, columns);
+        for (int i = 0; i < Math.min(rows.size(), wanted.length); i++) {
+            String why = rows.get(i).text(message);
+            String actual = rows.get(i).text(state) + (why.isEmpty() ? "" : "&" + why);
+            expect(actual.equals(wanted[i]), wanted[i], actual);
+        }
+    }
+
+    /** Shows each section as a table and checks how many rows it has. */
+    void sections(Result result, int... wanted) {
+        expect(result.sections().size() == wanted.length, wanted.length + " sections",
+                result.sections().size() + " sections");
+        for (int i = 0; i < Math.min(wanted.length, result.sections().size()); i++) {
+            Section section = result.sections().get(i);
+            screen.line("  " + section.table().name());
+            table(section.rows(), wanted[i]);
+        }
+    }
+
+    /** Shows the one row that there must be as named values. */
+    void record(List<Row> rows) {
+        expect(rows.size() == 1, "1 row", rows.size() + " rows");
         List<List<String>> items = new ArrayList<>();
-        List<String> values = records.isEmpty() ? List.of() : layout.readable(records).get(0);
-        for (int i = 0; i < values.size(); i++) {
-            if (layout.isMain(i)) {
-                items.add(List.of(layout.columns().get(i), values.get(i), ""));
-            }
+        for (Row row : rows) {
+            row.cells().forEach(
+                    cell -> items.add(List.of(words(cell.column()), label(cell), "")));
         }
         screen.grid("shown", items);
     }
 
-    /** Checks the text of one field of a list. */
-    void field(List<List<String>> records, int record, int position, String wanted) {
-        boolean there = record < records.size() && position < records.get(record).size();
-        String actual = there ? records.get(record).get(position) : "(missing)";
-        expect(actual.equals(wanted), "field " + position + " " + wanted, actual);
+    /** Checks the text of one column of a row. */
+    void field(List<Row> rows, int row, Column<?> column, String wanted) {
+        String actual = row < rows.size() ? rows.get(row).text(column) : "(missing)";
+        expect(actual.equals(wanted), column + " " + wanted, actual);
+    }
+
+    /** A second leg stands in the column of the first; what comes from no tag never changes. */
+    private static boolean isLeftOut(Column<?> column) {
+        return column.key().matches("[a-zA-Z]+2") || column.tags().isEmpty();
+    }
+
+    /** Four decimals only where they say something. */
+    private static String label(Cell<?> cell) {
+        String text = cell.label();
+        boolean four = text.matches("-?[0-9]+\\.[0-9]{4}");
+        return four ? new BigDecimal(text).stripTrailingZeros().toPlainString() : text;
+    }
+
+    private static String words(Column<?> column) {
+        return column.key().replaceAll("([A-Z])", " $1").toLowerCase(Locale.ROOT);
+    }
+
+    private static String label(Row row, Column<?> column) {
+        String text = "";
+        for (Cell<?> cell : row.cells()) {
+            boolean second = cell.column().key().equals(column.key() + "2");
+            if (cell.column() == column) {
+                text = label(cell);
+            } else if (second && !cell.text().isEmpty()) {
+                text += " / " + label(cell);
+            }
+        }
+        return text;
     }
 
     private void expect(boolean holds, String wanted, String actual) {

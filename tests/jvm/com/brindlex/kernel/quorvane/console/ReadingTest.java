@@ -12,49 +12,8 @@ import org.junit.jupiter.api.Test;
 import org.junit.jupiter.params.ParameterizedTest;
 import org.junit.jupiter.params.provider.CsvSource;
 
-/** Messages and results are taken apart and made readable. */
+/** Messages are taken apart, named, and shown in tables. */
 class ReadingTest {
-    @ParameterizedTest(name = "{0} {1}")
-    @CsvSource({
-            "TWO_DECIMALS, 99500, 995.00",
-            "TWO_DECIMALS, 5, 0.05",
-            "TWO_DECIMALS, 市價, 市價",
-            "FOUR_DECIMALS, 1205000, 120.5",
-            "FOUR_DECIMALS, 0, 0",
-            "FOUR_DECIMALS, 3100000|1300000, 310|130",
-            "FOUR_DECIMALS, -15000, -1.5",
-            "ORDER_TYPE, 1, buy",
-            "ORDER_TYPE, 14, fixed short sell",
-            "ORDER_TYPE, 53|54, buy|sell",
-            "ORDER_TYPE, 38, 38",
-            "CONTRACT, TIMEX&F&TXF&202402&&0, TXF 202402",
-            "CONTRACT, TIMEX&O&TXO&202402&C&180000000, TXO 202402 C 18000",
-            "CONTRACT, TIMEX&X&TXO|TXO&202402|202403&C|P&180000000|185000000, TXO 202402 C 18000 / TXO 202403 P 18500",
-            "CONTRACT, TIMEX&Y&TXF&202402|202403&&0, TXF 202402 / TXF 202403",
-            "CONTRACT, TIMEX&F&TXF&20240200, TXF 202402",
-            "CONTRACT, what?, what?",
-            "DATE, 1130115, 113/01/15",
-            "DATE, 20240115&20240116, 2024/01/15&2024/01/16",
-            "TIME, 091503, 09:15:03",
-            "PLAIN, 091503, 091503",
-    })
-    void
-    writesValuesAsAUserWould(Readable.Form form, String value, String readable) {
-        assertEquals(readable, form.read(value));
-    }
-
-    @Test
-    void takesListsAndSectionsApart() {
-        assertEquals(List.of(List.of("a", "", "b"), List.of("c")), ResultLayout.list("2!a@@b!c!"));
-        assertEquals(List.of(), ResultLayout.list("0!"));
-        assertEquals(List.of(List.of("1", "2", "")), ResultLayout.record("1@2@!"));
-        List<ResultLayout.Section> sections = ResultLayout.sections("<5>!1!a@b!<6>!0!");
-        assertEquals(2, sections.size());
-        assertEquals(new ResultLayout.Section(5, List.of(List.of("a", "b"))), sections.get(0));
-        assertEquals(new ResultLayout.Section(6, List.of()), sections.get(1));
-        assertEquals(List.of(), ResultLayout.sections("查無資料"));
-    }
-
     @Test
     void cutsFieldsWithTheirBars() {
         assertEquals(List.of(
