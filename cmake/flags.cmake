@@ -36,10 +36,10 @@ if(QUORVANE_SANITIZE)
   target_compile_options(quorvane_library_flags INTERFACE -O1)
 endif()
 
-# Test programs take far longer to optimize than they run.
+# Test programs take far longer to optimize than they run; fuzz targets run for hours.
 add_library(quorvane_test_flags INTERFACE)
 target_link_libraries(quorvane_test_flags INTERFACE quorvane_flags)
-target_compile_options(quorvane_test_flags INTERFACE -O0)
+target_compile_options(quorvane_test_flags INTERFACE $<IF:$<BOOL:${QUORVANE_FUZZ}>,-O2,-O0>)
 
 # Both page sizes are set: the first aligns the segments, the second the end of the read-only data
 # after relocation, and a device with 16 KiB pages needs the two alike.
