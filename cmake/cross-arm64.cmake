@@ -1,3 +1,4 @@
 set(CMAKE_SYSTEM_PROCESSOR aarch64)
 set(cross aarch64-linux-gnu)
+set(emulator qemu-aarch64)
 include(${CMAKE_CURRENT_LIST_DIR}/cross.cmake)

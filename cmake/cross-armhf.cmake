@@ -1,3 +1,4 @@
 set(CMAKE_SYSTEM_PROCESSOR armv7l)
 set(cross arm-linux-gnueabihf)
+set(emulator qemu-arm)
 include(${CMAKE_CURRENT_LIST_DIR}/cross.cmake)

@@ -3,6 +3,7 @@
 # try the Android package where there is no NDK (scripts/setup cross brings them).
 set(CMAKE_SYSTEM_NAME Linux)
 set(CMAKE_CXX_COMPILER ${cross}-g++)
+set(CMAKE_CROSSCOMPILING_EMULATOR ${emulator} -L /usr/${cross})
 
 # Libraries and packages of the other machine only: those of this one do not link.
 set(CMAKE_FIND_ROOT_PATH /usr/${cross})

@@ -25,22 +25,6 @@ const TGoldenCases& AllGolden() {
   return s_Cases;
 }
 
-bool SetClockOf(const TGoldenCase& golden) {
-  return SetClock(golden.m_Clock.empty() ? "2024-01-15 13:45:21" : golden.m_Clock);
-}
-
-/// The name that the library sends for a platform row, read from a header.
-std::string PlatformName(int64_t row) {
-  CRecordingHost host;
-  const TOutcome outcome = host.Call(
-      *FindExport("AuthEncode"),
-      {TArgument::Int(0), TArgument::Int(row), TArgument::Int(0), TArgument::Text("S"),
-       TArgument::Text("1.2.3.4"), TArgument::Text(""), TArgument::Text("&"), TArgument::Text("")});
-  const std::string request = outcome.m_Result.value_or("");
-  const size_t begin = request.find("|11=") + 4;
-  return request.substr(begin, request.find('|', begin) - begin);
-}
-
 class Golden : public testing::TestWithParam<TGoldenCase> {};
 
 TEST(GoldenFiles, AreWellFormed) {

@@ -11,7 +11,6 @@
 
 #include "tests/support/golden_file.h"
 #include "tests/support/recording_host.h"
-#include "tests/support/surroundings.h"
 
 namespace gateway_tests {
 namespace {
@@ -25,7 +24,7 @@ size_t CallsPerThread() {
 }
 
 TOutcome Play(CRecordingHost& host, const TGoldenCase& golden) {
-  SetClock(golden.m_Clock.empty() ? "2024-01-15 13:45:21" : golden.m_Clock);
+  SetClockOf(golden);
   return host.Call(*FindExport(golden.m_Operation), golden.m_Arguments);
 }
 

@@ -7,6 +7,8 @@
 #include <set>
 #include <string_view>
 
+#include "tests/support/surroundings.h"
+
 namespace gateway_tests {
 namespace {
 
@@ -236,6 +238,21 @@ TGoldenCases ReadGoldenCases(const std::string& directory) {
     CGoldenReader(file.filename().string(), cases).Read(in);
   }
   return cases;
+}
+
+bool SetClockOf(const TGoldenCase& golden) {
+  return SetClock(golden.m_Clock.empty() ? "2024-01-15 13:45:21" : golden.m_Clock);
+}
+
+std::string PlatformName(int64_t row) {
+  CRecordingHost host;
+  const TOutcome outcome = host.Call(
+      *FindExport("AuthEncode"),
+      {TArgument::Int(0), TArgument::Int(row), TArgument::Int(0), TArgument::Text("S"),
+       TArgument::Text("1.2.3.4"), TArgument::Text(""), TArgument::Text("&"), TArgument::Text("")});
+  const std::string request = outcome.m_Result.value_or("");
+  const size_t begin = request.find("|11=") + 4;
+  return request.substr(begin, request.find('|', begin) - begin);
 }
 
 std::string FillPlatformName(std::string text, const std::string& platformName) {

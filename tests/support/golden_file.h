@@ -40,6 +40,13 @@ struct TGoldenCases {
 
 TGoldenCases ReadGoldenCases(const std::string& directory);
 
+/// Stops the clock where the case has it, at a day of its own where it does not care; false when it
+/// names no such time.
+bool SetClockOf(const TGoldenCase& golden);
+
+/// The name that the library sends for a platform row, read from a header that it builds.
+std::string PlatformName(int64_t row);
+
 /// `text` with each "{11}" replaced by the platform name.
 std::string FillPlatformName(std::string text, const std::string& platformName);
 

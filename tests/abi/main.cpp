@@ -1,0 +1,142 @@
+// abi_digest DIRECTORY [CALLS]: plays the golden cases of a directory and a drawn load of CALLS
+// calls for each of the 59 exports, and prints one digest for each export and one over all: every
+// byte of each result, status and log line counts. It prints the same on every machine, whatever
+// its word size, sign of `char` or compiler.
+
+#include <cstdint>
+#include <cstdio>
+#include <cstdlib>
+#include <map>
+#include <string>
+#include <string_view>
+#include <vector>
+
+#include "tests/abi/load.h"
+#include "tests/support/golden_file.h"
+#include "tests/support/recording_host.h"
+#include "tests/support/surroundings.h"
+
+namespace gateway_tests {
+namespace {
+
+constexpr size_t kDefaultCalls = 300;
+
+/// FNV-1a over 64 bits; texts are ended, so that no two sequences of texts run into the same bytes.
+class CDigest {
+ public:
+  void Add(std::string_view text) {
+    for (char c : text) AddByte(static_cast<unsigned char>(c));
+    AddByte(0);
+  }
+  void Add(const TOutcome& outcome) {
+    Add(outcome.m_Result.has_value() ? "result" : "no result");
+    Add(outcome.m_Result.value_or(""));
+    Add(outcome.m_Status.has_value() ? std::to_string(*outcome.m_Status) : "none");
+    for (const std::string& line : outcome.m_LogLines) Add(line);
+    Add("end");
+  }
+  std::string Text() const {
+    char text[17];
+    std::snprintf(text, sizeof(text), "%016llx", static_cast<unsigned long long>(m_nValue));
+    return text;
+  }
+
+ private:
+  void AddByte(unsigned char byte) { m_nValue = (m_nValue ^ byte) * 0x100000001B3U; }
+
+  uint64_t m_nValue = 0xCBF29CE484222325U;
+};
+
+class CAbiRun {
+ public:
+  bool Golden(const TGoldenCases& golden) {
+    for (const std::string& error : golden.m_Errors) Fault(error, "is not well formed");
+    for (const TGoldenCase& one : golden.m_Cases) PlayGolden(one);
+    return m_nFaults == 0;
+  }
+
+  /// Calls `row` as its golden cases do and as often as asked with disturbed arguments.
+  void Load(const TExport& row, const std::vector<const TGoldenCase*>& cases, size_t calls) {
+    if (cases.empty()) return Fault(std::string(row.m_szName), "has no golden case");
+    CDraw draw(cases.size());
+    CRecordingHost host;
+    for (size_t call = 0; call < calls; ++call) {
+      const TGoldenCase& golden = *cases[draw.Below(cases.size())];
+      SetClockOf(golden);
+      const TOutcome outcome = host.Call(row, Disturb(golden.m_Arguments, draw));
+      if (!outcome.IsSound()) Fault(golden.Where(), "disturbed, is not answered soundly");
+      m_Digests[row.m_szName].Add(outcome);
+      ++m_nCalls;
+    }
+  }
+
+  /// Prints the digests; the exit status of the program.
+  int Finish() const {
+    CDigest all;
+    for (const auto& [name, digest] : m_Digests) {
+      std::printf("%-24.*s %s\n", static_cast<int>(name.size()), name.data(),
+                  digest.Text().c_str());
+      all.Add(digest.Text());
+    }
+    std::printf("all %zu exports, %zu calls %s\n", m_Digests.size(), m_nCalls, all.Text().c_str());
+    return m_nFaults == 0 && m_Digests.size() == kExportCount ? EXIT_SUCCESS : EXIT_FAILURE;
+  }
+
+ private:
+  void PlayGolden(const TGoldenCase& golden) {
+    const TExport& row = *FindExport(golden.m_Operation);
+    const std::string platform = PlatformName(golden.PlatformRow());
+    if (!SetClockOf(golden)) Fault(golden.Where(), "has an odd clock");
+    CRecordingHost host(EPlacement::kBeforeUnreadable);
+    const TOutcome outcome = host.Call(row, golden.m_Arguments);
+    if (!outcome.m_Violations.empty()) Fault(golden.Where(), outcome.m_Violations.front());
+    if (outcome.m_Result != FillPlatformName(golden.m_Result, platform)) {
+      Fault(golden.Where(), "answered " + outcome.m_Result.value_or("(null)"));
+    }
+    if (outcome.m_Status != golden.m_Status) Fault(golden.Where(), "has another status");
+    if (golden.m_LogLines.has_value()) {
+      std::vector<std::string> expected = *golden.m_LogLines;
+      for (std::string& line : expected) line = FillPlatformName(line, platform);
+      if (outcome.m_LogLines != expected) Fault(golden.Where(), "has other log lines");
+    }
+    m_Digests[row.m_szName].Add(outcome);
+    ++m_nCalls;
+  }
+
+  void Fault(const std::string& where, const std::string& what) {
+    std::fprintf(stderr, "%s: %s\n", where.c_str(), what.c_str());
+    ++m_nFaults;
+  }
+
+  std::map<std::string_view, CDigest> m_Digests;
+  size_t m_nCalls = 0;
+  size_t m_nFaults = 0;
+};
+
+int Run(const char* directory, size_t calls) {
+  EnterMarketTimeZone();
+  const TGoldenCases golden = ReadGoldenCases(directory);
+  CAbiRun run;
+  if (!run.Golden(golden)) return EXIT_FAILURE;
+  for (const TExport& row : AllExports()) {
+    std::vector<const TGoldenCase*> cases;
+    for (const TGoldenCase& one : golden.m_Cases) {
+      if (one.m_Operation == row.m_szName && !one.m_Arguments.empty()) cases.push_back(&one);
+    }
+    run.Load(row, cases, calls);
+  }
+  return run.Finish();
+}
+
+}  // namespace
+}  // namespace gateway_tests
+
+int main(int argc, char** argv) {
+  if (argc != 2 && argc != 3) {
+    std::fprintf(stderr, "usage: abi_digest DIRECTORY [CALLS]\n");
+    return EXIT_FAILURE;
+  }
+  const size_t calls =
+      argc == 3 ? std::strtoul(argv[2], nullptr, 10) : gateway_tests::kDefaultCalls;
+  return gateway_tests::Run(argv[1], calls);
+}
