@@ -21,7 +21,7 @@ public final class Accounts {
     /** Account flag. */
     public static final Column<String> FLAG = Column.of("flag", "69", Form.TEXT, "account flag");
 
-    /** The mark <M>. */
+    /** The mark {@code M}. */
     public static final Column<String> NOTICE_MARK =
             Column.of("noticeMark", "", Form.TEXT, "the mark <M>");
 
