@@ -15,7 +15,8 @@ target_compile_options(quorvane_flags INTERFACE
     -Wall -Wextra -Wpedantic -Wformat=2 -Wconversion -Wsign-conversion -Wshadow
     $<$<BOOL:${QUORVANE_WERROR}>:-Werror>
     # Where it was built leaves no trace, so that two builds are equal to the byte.
-    -ffile-prefix-map=${PROJECT_SOURCE_DIR}=. -ffile-prefix-map=${PROJECT_BINARY_DIR}=.)
+    -ffile-prefix-map=${PROJECT_SOURCE_DIR}=. -ffile-prefix-map=${PROJECT_BINARY_DIR}=.
+    $<$<BOOL:${ANDROID_NDK}>:-ffile-prefix-map=${ANDROID_NDK}=ndk>)
 if(QUORVANE_SANITIZE)
   # The vptr check needs the type information that the library is built without.
   set(sanitize -fsanitize=${QUORVANE_SANITIZE} -fno-sanitize=vptr -fno-sanitize-recover=all
