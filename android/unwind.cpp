@@ -1,7 +1,7 @@
 // Unwind tables stay in the library, so that a tombstone shows its frames. On 32-bit ARM they name
 // a routine that a thrown exception would call, and whoever defines it brings the whole unwinder
-// along, with what that needs. Nothing is thrown through here, and readers of tombstones do not call
-// it: these end an unwinding as the failure that it would be.
+// along, with what that needs. Nothing is thrown through here, and what reads tombstones calls no
+// such routine: these end an unwinding as the failure that it would be.
 #ifdef __arm__
 namespace {
 

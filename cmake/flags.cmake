@@ -16,6 +16,7 @@ target_compile_options(quorvane_flags INTERFACE
     $<$<BOOL:${QUORVANE_WERROR}>:-Werror>
     # Where it was built leaves no trace, so that two builds are equal to the byte.
     -ffile-prefix-map=${PROJECT_SOURCE_DIR}=. -ffile-prefix-map=${PROJECT_BINARY_DIR}=.
+    $<$<CXX_COMPILER_ID:Clang>:-ffile-compilation-dir=.>
     $<$<BOOL:${ANDROID_NDK}>:-ffile-prefix-map=${ANDROID_NDK}=ndk>)
 if(QUORVANE_SANITIZE)
   # The vptr check needs the type information that the library is built without.
