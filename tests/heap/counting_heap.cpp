@@ -1,6 +1,12 @@
 #include "tests/heap/counting_heap.h"
 
+#include <link.h>
+
 #include <cstddef>
+#include <cstdint>
+#include <cstdlib>
+
+#include "tests/support/call_table.h"
 
 namespace gateway_tests {
 namespace {
@@ -10,6 +16,44 @@ thread_local int t_nAllocations = 0;
 
 void Count() {
   if (t_bCounting) ++t_nAllocations;
+}
+
+/// Where the library's code lies.
+uintptr_t s_nLibrary = 0;
+uintptr_t s_nLibraryEnd = 0;
+
+thread_local bool t_bFailing = false;
+thread_local size_t t_nRequests = 0;
+thread_local size_t t_nFirst = 0;
+thread_local size_t t_nLast = 0;
+thread_local long t_nUnreleased = 0;
+
+int FindLibrary(dl_phdr_info* object, size_t, void* symbol) {
+  const auto address = reinterpret_cast<uintptr_t>(symbol);
+  for (int i = 0; i < object->dlpi_phnum; ++i) {
+    const auto& segment = object->dlpi_phdr[i];
+    const uintptr_t begin = object->dlpi_addr + segment.p_vaddr;
+    if (segment.p_type != PT_LOAD || address < begin || address >= begin + segment.p_memsz)
+      continue;
+    s_nLibrary = begin;
+    s_nLibraryEnd = begin + segment.p_memsz;
+    return 1;
+  }
+  return 0;
+}
+
+bool IsOfLibrary(const void* caller) {
+  const auto address = reinterpret_cast<uintptr_t>(caller);
+  return t_bFailing && address >= s_nLibrary && address < s_nLibraryEnd;
+}
+
+/// Whether a request must be refused.
+bool Refuses(const void* caller) {
+  if (!IsOfLibrary(caller)) return false;
+  ++t_nRequests;
+  if (t_nRequests >= t_nFirst && t_nRequests <= t_nLast) return true;
+  ++t_nUnreleased;
+  return false;
 }
 
 }  // namespace
@@ -27,6 +71,28 @@ int CHeapCount::Allocations() const {
   return t_nAllocations;
 }
 
+CFailingHeap::CFailingHeap(size_t first, size_t last) {
+  if (s_nLibrary == 0) dl_iterate_phdr(&FindLibrary, AllExports()[0].EntryPoint());
+  if (s_nLibrary == 0) std::abort();
+  t_nRequests = 0;
+  t_nUnreleased = 0;
+  t_nFirst = first;
+  t_nLast = last;
+  t_bFailing = true;
+}
+
+CFailingHeap::~CFailingHeap() {
+  t_bFailing = false;
+}
+
+size_t CFailingHeap::Requests() const {
+  return t_nRequests;
+}
+
+long CFailingHeap::Unreleased() const {
+  return t_nUnreleased;
+}
+
 }  // namespace gateway_tests
 
 extern "C" {
@@ -35,20 +101,30 @@ extern "C" {
 void* __libc_malloc(size_t size);
 void* __libc_calloc(size_t count, size_t size);
 void* __libc_realloc(void* block, size_t size);
+void __libc_free(void* block);
 
 void* malloc(size_t size) noexcept {
   gateway_tests::Count();
+  if (gateway_tests::Refuses(__builtin_return_address(0))) return nullptr;
   return __libc_malloc(size);
 }
 
 void* calloc(size_t count, size_t size) noexcept {
   gateway_tests::Count();
+  if (gateway_tests::Refuses(__builtin_return_address(0))) return nullptr;
   return __libc_calloc(count, size);
 }
 
 void* realloc(void* block, size_t size) noexcept {
   gateway_tests::Count();
   return __libc_realloc(block, size);
+}
+
+void free(void* block) noexcept {
+  if (block != nullptr && gateway_tests::IsOfLibrary(__builtin_return_address(0))) {
+    --gateway_tests::t_nUnreleased;
+  }
+  __libc_free(block);
 }
 
 }  // extern "C"

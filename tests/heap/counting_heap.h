@@ -1,6 +1,8 @@
 #ifndef TESTS_HEAP_COUNTING_HEAP_H_
 #define TESTS_HEAP_COUNTING_HEAP_H_
 
+#include <cstddef>
+
 namespace gateway_tests {
 
 /// Counts what the calling thread asks of the heap while the object lives. This program's own
@@ -11,6 +13,24 @@ class CHeapCount {
   ~CHeapCount();
 
   int Allocations() const;
+};
+
+/// Refuses what the library asks of the heap on the calling thread, while the object lives; the
+/// program's own requests and those of other libraries are served.
+class CFailingHeap {
+ public:
+  static constexpr size_t kNever = ~size_t{0};
+
+  /// Refuses the requests number `first` to `last`, counted from 1.
+  CFailingHeap(size_t first, size_t last);
+  CFailingHeap(const CFailingHeap&) = delete;
+  CFailingHeap& operator=(const CFailingHeap&) = delete;
+  ~CFailingHeap();
+
+  /// Requests of the library so far, refused ones too.
+  size_t Requests() const;
+  /// Blocks that the library was given and has not released.
+  long Unreleased() const;
 };
 
 }  // namespace gateway_tests

@@ -2,7 +2,9 @@
 
 #include <gtest/gtest.h>
 
+#include <set>
 #include <string>
+#include <string_view>
 
 #include "tests/support/golden_file.h"
 #include "tests/support/recording_host.h"
@@ -29,6 +31,14 @@ class Golden : public testing::TestWithParam<TGoldenCase> {};
 
 TEST(GoldenFiles, AreWellFormed) {
   for (const std::string& error : AllGolden().m_Errors) ADD_FAILURE() << error;
+}
+
+// What is tried on all golden cases is tried on every export.
+TEST(GoldenFiles, HaveCasesOfEveryExport) {
+  std::set<std::string_view> missing;
+  for (const TExport& row : AllExports()) missing.insert(row.m_szName);
+  for (const TGoldenCase& golden : AllGolden().m_Cases) missing.erase(golden.m_Operation);
+  EXPECT_EQ(missing, std::set<std::string_view>());
 }
 
 TEST_P(Golden, Case) {
