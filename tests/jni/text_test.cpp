@@ -8,6 +8,7 @@
 #include <string>
 #include <vector>
 
+#include "tests/support/hostile_replies.h"
 #include "tests/support/recording_host.h"
 #include "tests/support/surroundings.h"
 
@@ -16,12 +17,6 @@ namespace {
 
 constexpr size_t kRequestCapacity = 4095;  // the buffer's 4096 bytes and their terminator
 const std::string kParameterError = "[CLIENT]傳入的參數錯誤";
-
-std::string Repeat(const std::string& text, size_t length) {
-  std::string whole;
-  while (whole.size() + text.size() <= length) whole += text;
-  return whole;
-}
 
 TArguments LoginWithPassword(const std::string& password) {
   return {TArgument::Int(0),           TArgument::Int(0),           TArgument::Int(7),
@@ -131,35 +126,6 @@ TEST(ReplyBounds, ThousandsOfAccountsAreAllListed) {
   EXPECT_EQ(login.m_Result, std::to_string(kAccounts + 1) + "!" + lines + "<M>@note!");
 }
 
-struct THostileReply {
-  const char* m_szName;
-  const char* m_szHead;
-  const char* m_szRepeated;
-};
-void PrintTo(const THostileReply& reply, std::ostream* out) {
-  *out << reply.m_szName;
-}
-
-constexpr THostileReply kHostileReplies[] = {
-    {"NoMarkers", "|68=0000", "x"},
-    {"NoMarkersAtAll", "", "x"},
-    {"OnlyBars", "|68=0000", "|"},
-    {"OnlyBeginMarks", "|68=0000", "|00="},
-    {"OnlyEndMarks", "|68=0000", "|01="},
-    {"WrongOrder", "|68=0000", "|01=|00="},
-    {"EndMarksBeforeOneBegin", "|68=0000|00=1|68=0000", "|01="},
-    {"OneEndlessField", "|68=0000|M2=", "y"},
-    {"EndlessCode", "|68=", "0"},
-    {"EndlessRefusal", "|68=0001|M2=", "y"},
-    {"EmptyRecords", "|68=0000", "|00=|01="},
-    {"SmallRecords", "|68=0000", "|00=1|68=0000|01="},
-    {"BlankValues", "|68=0000|00=1|68=0000", "|17= |18="},
-    {"AlmostCodes", "", "|68"},
-    {"AlmostMarkers", "|68=0000", "[GATEWAY]erro[BROKER]timeou"},
-    {"EndlessDigits", "|68=0000|00=1|67=", "9"},
-    {"NoData", "|68=5001", "|00=1|68=5001|M2=none|01="},
-};
-
 class HostileReply : public testing::TestWithParam<THostileReply> {
  protected:
   /// Processor seconds of the fastest of a few calls.
@@ -178,7 +144,7 @@ class HostileReply : public testing::TestWithParam<THostileReply> {
     const THostileReply& hostile = GetParam();
     TArguments arguments;
     if (row.m_szShape[0] == 'i') arguments.push_back(TArgument::Int(0));
-    arguments.push_back(TArgument::Text(hostile.m_szHead + Repeat(hostile.m_szRepeated, length)));
+    arguments.push_back(TArgument::Text(MakeReply(hostile, length)));
     return arguments;
   }
 };

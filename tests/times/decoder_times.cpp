@@ -1,0 +1,168 @@
+// How the time of every decoder grows with its reply: prints, as a table, the slope of the time
+// over the length in logarithms, 1 being proportional, from 1 KiB to 16 MiB. Ends with 1 when a
+// slope is above the bound.
+//
+// A time is the median of a few calls' processor time, a slope the median of the slopes between all
+// pairs of lengths. A slope above the bound is measured again, twice at most: what else the machine
+// does can slow some lengths down, but can make no time proportional that is not.
+
+#include <malloc.h>
+
+#include <algorithm>
+#include <cmath>
+#include <cstdio>
+#include <ctime>
+#include <iterator>
+#include <string>
+#include <string_view>
+#include <vector>
+
+#include "tests/support/bare_host.h"
+#include "tests/support/call_table.h"
+#include "tests/support/hostile_replies.h"
+#include "tests/support/sample_replies.h"
+#include "tests/support/surroundings.h"
+
+namespace gateway_tests {
+namespace {
+
+constexpr double kBound = 1.1;
+constexpr size_t kShortest = 1 << 10;
+constexpr size_t kLongest = 1 << 24;
+constexpr size_t kStep = 4;
+constexpr int kAttempts = 3;
+
+double Median(std::vector<double> values) {
+  const auto middle = values.begin() + static_cast<std::ptrdiff_t>(values.size() / 2);
+  std::nth_element(values.begin(), middle, values.end());
+  return *middle;
+}
+
+double Now() {
+  std::timespec now{};
+  clock_gettime(CLOCK_THREAD_CPUTIME_ID, &now);
+  return static_cast<double>(now.tv_sec) + 1e-9 * static_cast<double>(now.tv_nsec);
+}
+
+class CDecoder {
+ public:
+  explicit CDecoder(const TExport& row) : m_Row(row), m_pEntryPoint(row.EntryPoint()) {}
+
+  void Call(const std::string& reply) const {
+    jint status = 0;
+    jvalue values[3] = {};
+    jvalue* at = values;
+    if (m_Row.m_szShape.front() == 'i') (at++)->i = 0;
+    (at++)->l = BareText(reply.c_str());
+    at->l = BareStatus(&status);
+    m_Row.m_pCall(m_pEntryPoint, BareHost(), values);
+  }
+
+  /// Seconds of one call.
+  double Seconds(const std::string& reply) const {
+    Call(reply);  // memory is at hand from now on
+    const size_t repeats = 1 + (64 << 10) / reply.size();
+    std::vector<double> times;
+    for (int round = 0; round < (reply.size() > (1 << 20) ? 3 : 7); ++round) {
+      const double begin = Now();
+      for (size_t i = 0; i < repeats; ++i) Call(reply);
+      times.push_back((Now() - begin) / static_cast<double>(repeats));
+    }
+    return Median(times);
+  }
+
+ private:
+  const TExport& m_Row;
+  void* m_pEntryPoint;
+};
+
+struct TGrowth {
+  double m_dSlope = 0;
+  double m_dLongest = 0;  // seconds of the longest reply
+};
+
+/// `make(length)` makes a reply of about that length.
+template <class TMake>
+TGrowth MeasureOnce(const CDecoder& decoder, const TMake& make) {
+  std::vector<double> lengths;
+  std::vector<double> times;
+  TGrowth growth;
+  for (size_t length = kShortest; length <= kLongest; length *= kStep) {
+    const std::string reply = make(length);
+    growth.m_dLongest = decoder.Seconds(reply);
+    lengths.push_back(std::log(static_cast<double>(reply.size())));
+    times.push_back(std::log(growth.m_dLongest));
+  }
+  std::vector<double> slopes;
+  for (size_t i = 0; i < times.size(); ++i) {
+    for (size_t j = 0; j < i; ++j) {
+      slopes.push_back((times[i] - times[j]) / (lengths[i] - lengths[j]));
+    }
+  }
+  growth.m_dSlope = Median(slopes);
+  return growth;
+}
+
+template <class TMake>
+TGrowth Measure(const CDecoder& decoder, const TMake& make) {
+  TGrowth growth = MeasureOnce(decoder, make);
+  for (int more = 1; more < kAttempts && growth.m_dSlope > kBound; ++more) {
+    growth = MeasureOnce(decoder, make);
+  }
+  return growth;
+}
+
+/// What a gateway sends, at any length: records, or fields that an answer does not ask for.
+std::string OrdinaryReply(std::string_view decoder, size_t length) {
+  constexpr size_t kSome = 8;
+  const std::string few = SampleList(decoder, kSome);
+  if (!few.empty()) return SampleList(decoder, 1 + kSome * length / few.size());
+  std::string reply = SampleAnswer(decoder);
+  while (reply.size() < length) reply += "|ZZ=0123456789";
+  return reply;
+}
+
+/// Prints the decoder's row; false when a slope is above the bound.
+bool PrintDecoder(const TExport& row) {
+  const CDecoder decoder(row);
+  const TGrowth ordinary =
+      Measure(decoder, [&](size_t length) { return OrdinaryReply(row.m_szName, length); });
+  TGrowth steepest;
+  const char* name = "";
+  for (const THostileReply& hostile : kHostileReplies) {
+    const TGrowth growth =
+        Measure(decoder, [&](size_t length) { return MakeReply(hostile, length); });
+    if (growth.m_dSlope > steepest.m_dSlope) {
+      steepest = growth;
+      name = hostile.m_szName;
+    }
+  }
+  std::printf("| %.*s | %.2f | %.1f | %.2f | %s |\n", static_cast<int>(row.m_szName.size()),
+              row.m_szName.data(), ordinary.m_dSlope, 1e3 * ordinary.m_dLongest, steepest.m_dSlope,
+              name);
+  std::fflush(stdout);
+  return ordinary.m_dSlope <= kBound && steepest.m_dSlope <= kBound;
+}
+
+}  // namespace
+}  // namespace gateway_tests
+
+int main() {
+  using namespace gateway_tests;
+  // What the system takes for handing memory out anew is not the library's.
+  mallopt(M_MMAP_THRESHOLD, 1 << 30);
+  mallopt(M_TRIM_THRESHOLD, 1 << 30);
+  SetClock("2024-01-15 13:45:21");
+  std::puts("| decoder | ordinary | of 16 MiB, ms | steepest | of the arrangement |");
+  std::puts("|---|---|---|---|---|");
+  int decoders = 0;
+  bool good = true;
+  for (const TExport& row : AllExports()) {
+    if (!row.IsDecoder()) continue;
+    ++decoders;
+    good = PrintDecoder(row) && good;
+  }
+  std::printf("\n%d decoders, %zu hostile arrangements each; %s %.1f.\n", decoders,
+              std::size(kHostileReplies), good ? "no slope is above" : "A SLOPE IS ABOVE", kBound);
+  return good ? 0 : 1;
+}
