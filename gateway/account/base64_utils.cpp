@@ -51,8 +51,8 @@ class CBase64Reader {
   CBase64Reader(const char* text, int length)
       : m_pAt(text), m_pEnd(text + length), m_nLength(length) {}
 
-  // Whether no character `index` (from 1, skipped ones not counted) is left before the end or pad.
-  bool AtEnd(int index) const { return index > m_nLength || m_pAt >= m_pEnd || *m_pAt == kPad; }
+  // Whether no character is left before the end or pad.
+  bool AtEnd() const { return m_pAt >= m_pEnd || *m_pAt == kPad; }
 
   // Skips foreign characters, then takes one. The skipping stops when `index` is the last character
   // left, so that the last one is taken even if it is foreign; behind the text stands a foreign
@@ -122,7 +122,7 @@ char* CBase64Utils::Decode(const char* text, int* length) {
   char* out = block;
   uint32_t accumulator = 0;
   int index = 1;
-  for (; !reader.AtEnd(index); ++index) {
+  for (; !reader.AtEnd(); ++index) {
     accumulator = (accumulator | reader.Take(index, m_nError)) << 6;
     if (index % 4 != 0) continue;
     WriteBytes(out, accumulator);

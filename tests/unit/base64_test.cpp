@@ -1,7 +1,9 @@
 // The Base64 text of certificate messages, and its decoder with all its habits.
 
 #include <gtest/gtest.h>
+#include <sys/resource.h>
 
+#include <climits>
 #include <cstdlib>
 #include <cstring>
 #include <memory>
@@ -198,5 +200,30 @@ TEST(Base64RoundTrip, WholeGroupsWithoutTheLetterRComeBack) {
     free(bytes);
   }
 }
+
+#if defined(__SANITIZE_ADDRESS__) || defined(__SANITIZE_THREAD__)
+#define SANITIZED_HEAP
+#elif defined(__has_feature)
+#if __has_feature(address_sanitizer) || __has_feature(thread_sanitizer)
+#define SANITIZED_HEAP
+#endif
+#endif
+
+#ifndef SANITIZED_HEAP  // it ends the program instead
+TEST(Base64, WithoutMemoryThereIsNoText) {
+  rlimit before{};
+  ASSERT_EQ(getrlimit(RLIMIT_AS, &before), 0);
+  const rlimit gibibyte{1U << 30, before.rlim_max};
+  ASSERT_EQ(setrlimit(RLIMIT_AS, &gibibyte), 0);
+  CBase64Utils utils;
+  int length = INT_MAX;
+  const char* const encoded = utils.Encode("abc", INT_MAX);
+  const char* const decoded = utils.Decode("YWJj", &length);
+  setrlimit(RLIMIT_AS, &before);
+  EXPECT_EQ(encoded, nullptr);
+  EXPECT_EQ(decoded, nullptr);
+  EXPECT_EQ(length, 0);
+}
+#endif
 
 }  // namespace

@@ -198,5 +198,16 @@ TEST_F(HeapTexts, ListWithoutMemoryFailsForGood) {
   EXPECT_EQ(empty.Finish("", 0), nullptr);
 }
 
+TEST_F(HeapTexts, SizesThatAnIntCannotHoldAreRefused) {
+  EXPECT_EQ(RenewHeapText(Owner(), INT32_MAX), nullptr);
+  EXPECT_EQ(m_gateway.m_pData, nullptr);
+  CResultText list(Owner(), INT32_MAX / 8);
+  list.AppendWritten(INT32_MAX / 8, [](char*) {});
+  EXPECT_FALSE(list.Failed());
+  list.AppendText(std::string(5000, 'a'));
+  EXPECT_TRUE(list.Failed());
+  EXPECT_EQ(list.Finish("", 1), nullptr);
+}
+
 }  // namespace
 }  // namespace gateway_tests

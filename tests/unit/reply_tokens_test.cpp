@@ -236,6 +236,7 @@ TEST_F(ReplyTokens, GetFieldStringWithoutABufferMovesOnlyPastASeparator) {
   EXPECT_EQ(cursor - text, 3);
   m_gateway.GetFieldString(&cursor, "&", nullptr, 8);
   EXPECT_EQ(cursor - text, 3);
+  m_gateway.GetFieldString(&cursor, nullptr, nullptr, 8);
   m_gateway.GetFieldString(nullptr, "&", nullptr, 8);
   char* nothing = nullptr;
   m_gateway.GetFieldString(&nothing, "&", nullptr, 8);
