@@ -13,6 +13,7 @@ namespace {
 
 thread_local bool t_bCounting = false;
 thread_local int t_nAllocations = 0;
+thread_local int t_nReleases = 0;
 
 void Count() {
   if (t_bCounting) ++t_nAllocations;
@@ -60,6 +61,7 @@ bool Refuses(const void* caller) {
 
 CHeapCount::CHeapCount() {
   t_nAllocations = 0;
+  t_nReleases = 0;
   t_bCounting = true;
 }
 
@@ -69,6 +71,10 @@ CHeapCount::~CHeapCount() {
 
 int CHeapCount::Allocations() const {
   return t_nAllocations;
+}
+
+int CHeapCount::Releases() const {
+  return t_nReleases;
 }
 
 CFailingHeap::CFailingHeap(size_t first, size_t last) {
@@ -121,6 +127,7 @@ void* realloc(void* block, size_t size) noexcept {
 }
 
 void free(void* block) noexcept {
+  if (gateway_tests::t_bCounting && block != nullptr) ++gateway_tests::t_nReleases;
   if (block != nullptr && gateway_tests::IsOfLibrary(__builtin_return_address(0))) {
     --gateway_tests::t_nUnreleased;
   }

@@ -6,13 +6,14 @@
 namespace gateway_tests {
 
 /// Counts what the calling thread asks of the heap while the object lives. This program's own
-/// `malloc`, `calloc` and `realloc` take the place of the C library's, for the library too.
+/// `malloc`, `calloc`, `realloc` and `free` take the place of the C library's, for the library too.
 class CHeapCount {
  public:
   CHeapCount();
   ~CHeapCount();
 
   int Allocations() const;
+  int Releases() const;
 };
 
 /// Refuses what the library asks of the heap on the calling thread, while the object lives; the

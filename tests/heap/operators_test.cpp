@@ -1,0 +1,37 @@
+// The library's own operators; the export map hides those in the library, so this program is built
+// with the same source.
+
+#include <gtest/gtest.h>
+
+#include <new>
+
+#include "tests/heap/counting_heap.h"
+
+namespace gateway_tests {
+namespace {
+
+TEST(Operators, BlockOfNoBytesIsABlock) {
+  const CHeapCount count;
+  void* const block = operator new[](0, std::nothrow_t{});
+  EXPECT_NE(block, nullptr);
+  EXPECT_EQ(count.Allocations(), 1);
+  operator delete[](block);
+}
+
+TEST(Operators, EachFormReleasesABlock) {
+  using TForm = void (*)(void*);
+  for (const TForm release : {
+           TForm([](void* block) { operator delete(block); }),
+           TForm([](void* block) { operator delete (block, size_t{1}); }),
+           TForm([](void* block) { operator delete[](block); }),
+           TForm([](void* block) { operator delete[](block, size_t{1}); }),
+       }) {
+    void* const block = operator new[](1, std::nothrow_t{});
+    const CHeapCount count;
+    release(block);
+    EXPECT_EQ(count.Releases(), 1);
+  }
+}
+
+}  // namespace
+}  // namespace gateway_tests
