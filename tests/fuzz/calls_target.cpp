@@ -2,11 +2,14 @@
 
 #include <cstdio>
 #include <cstdlib>
+#include <optional>
 #include <string>
 #include <string_view>
 
 #include "tests/fuzz/execution_counts.h"
 #include "tests/fuzz/fuzz_call.h"
+#include "tests/fuzz/lean_host.h"
+#include "tests/fuzz/lent_memory.h"
 #include "tests/support/recording_host.h"
 #include "tests/support/surroundings.h"
 
@@ -14,24 +17,37 @@ namespace gateway_fuzz {
 namespace {
 
 using gateway_tests::AllExports;
-using gateway_tests::CRecordingHost;
 using gateway_tests::kExportCount;
 using gateway_tests::SetClock;
 using gateway_tests::TArgument;
 using gateway_tests::TArguments;
 using gateway_tests::TExport;
-using gateway_tests::TOutcome;
 
 /// The entry points, looked up once.
 void* s_pEntryPoints[kExportCount];
 
-[[noreturn]] void Broken(const TExport& row, const char* rule, const TOutcome& outcome) {
-  std::fprintf(stderr, "%.*s: %s\n", static_cast<int>(row.m_szName.size()), row.m_szName.data(),
-               rule);
-  for (const std::string& violation : outcome.m_Violations) {
-    std::fprintf(stderr, "  %s\n", violation.c_str());
+/// Prints what the call does in a host that keeps all of it.
+void PrintRecord(const TFuzzCall& call) {
+  TArguments arguments;
+  for (const TFuzzArgument& argument : call) {
+    TArgument copy{argument.m_chLetter, argument.m_nNumber, std::nullopt};
+    if (argument.m_chLetter == 'S' && !argument.m_bNull) copy.m_Text = argument.m_Text;
+    arguments.push_back(copy);
   }
-  std::fprintf(stderr, "  result: %s\n", outcome.m_Result.value_or("(null)").c_str());
+  const gateway_tests::TOutcome outcome = gateway_tests::CRecordingHost().CallAt(
+      s_pEntryPoints[call.m_nRow], AllExports()[call.m_nRow], arguments);
+  for (const std::string& event : outcome.m_Events) std::fprintf(stderr, "  %s\n", event.c_str());
+  std::fprintf(stderr, "  status %d\n", outcome.m_Status.value_or(0));
+}
+
+[[noreturn]] void Broken(const TFuzzCall& call, const char* rule, const TAnswer& answer) {
+  const std::string_view name = AllExports()[call.m_nRow].m_szName;
+  std::fprintf(stderr, "%.*s: %s\nresult: %.*s\n", static_cast<int>(name.size()), name.data(), rule,
+               static_cast<int>(answer.m_Result.size()), answer.m_Result.data());
+  for (const char* const turn : {"first", "second"}) {
+    std::fprintf(stderr, "the call, a %s time in the recording host:\n", turn);
+    PrintRecord(call);
+  }
   std::abort();
 }
 
@@ -43,33 +59,28 @@ bool EndsWith(std::string_view text, std::string_view end) {
   return text.size() >= end.size() && text.substr(text.size() - end.size()) == end;
 }
 
-/// Length of the last argument, a text: a reply, or the message of a certificate.
-size_t LastTextSize(const TArguments& arguments) {
-  const TArgument& last = arguments.back();
-  return last.m_Text.has_value() ? last.m_Text->size() : 0;
-}
-
-/// Characters that the result may have at most.
-size_t ResultBound(const TExport& row, const TArguments& arguments) {
+/// Characters that the result may have at most. The last argument may be a text: a reply, or the
+/// message of a certificate.
+size_t ResultBound(const TExport& row, const TFuzzCall& call) {
   constexpr size_t kRequest = 4095;
-  if (row.IsDecoder()) return kRequest + 8 * LastTextSize(arguments);
+  const size_t text = call.m_Arguments[call.m_nArguments - 1].m_Text.size();
+  if (row.IsDecoder()) return kRequest + 8 * text;
   // Four characters of Base64 for three of the message, and a line end behind every 1024.
-  if (row.m_szName == "RegisterCertEncode") return kRequest + 2 * LastTextSize(arguments);
+  if (row.m_szName == "RegisterCertEncode") return kRequest + 2 * text;
   return kRequest;
 }
 
-/// What holds for every answer. That the result ends, and is not the host's own text, is seen by
-/// the address sanitizer when the host copies it: the strings were released before.
-void CheckAnswer(const TExport& row, const TArguments& arguments, const TOutcome& outcome) {
-  if (!outcome.IsSound()) Broken(row, "the call is not sound", outcome);
-  const std::string& result = *outcome.m_Result;
-  if (result.size() > ResultBound(row, arguments)) Broken(row, "the result is too long", outcome);
+/// What holds for every answer.
+void CheckAnswer(const TExport& row, const TFuzzCall& call, const TAnswer& answer) {
+  if (answer.m_szViolation != nullptr) Broken(call, answer.m_szViolation, answer);
+  const std::string_view result = answer.m_Result;
+  if (result.size() > ResultBound(row, call)) Broken(call, "the result is too long", answer);
   if (row.IsDecoder() || !row.HasStatus()) return;
   const bool request = StartsWith(result, "F=");
-  if (outcome.m_Status == 1 && !request) Broken(row, "no request, and status 1", outcome);
+  if (answer.m_nStatus == 1 && !request) Broken(call, "no request, and status 1", answer);
   // A message stands alone, or, for futures orders, behind the header.
-  if (outcome.m_Status == -1 && request && !EndsWith(result, "[CLIENT]傳入的參數錯誤")) {
-    Broken(row, "a request, and status -1", outcome);
+  if (answer.m_nStatus == -1 && request && !EndsWith(result, "[CLIENT]傳入的參數錯誤")) {
+    Broken(call, "a request, and status -1", answer);
   }
 }
 
@@ -93,15 +104,18 @@ extern "C" int LLVMFuzzerInitialize(int*, char***) {
 
 extern "C" int LLVMFuzzerTestOneInput(const uint8_t* data, size_t size) {
   using namespace gateway_fuzz;
+  static CLeanHost s_Host;
+  if (size > kMaxInput) return 0;
   const TFuzzCall call = ReadCall(FuzzRows(), data, size);
   const TExport& row = AllExports()[call.m_nRow];
+  void* const entryPoint = s_pEntryPoints[call.m_nRow];
   SetClock(static_cast<std::time_t>(call.Clock()));
-  CRecordingHost host;
-  const TOutcome first = host.CallAt(s_pEntryPoints[call.m_nRow], row, call.m_Arguments);
-  CheckAnswer(row, call.m_Arguments, first);
-  const TOutcome second = host.CallAt(s_pEntryPoints[call.m_nRow], row, call.m_Arguments);
-  if (second.m_Events != first.m_Events || second.m_Status != first.m_Status) {
-    Broken(row, "the same call answers differently", second);
+  const TAnswer first = s_Host.Call(entryPoint, row, call);
+  CheckAnswer(row, call, first);
+  const TAnswer second = s_Host.Call(entryPoint, row, call);
+  CheckAnswer(row, call, second);
+  if (second.m_nDigest != first.m_nDigest) {
+    Broken(call, "the same call answers differently", second);
   }
   CountExecution(call.m_nRow);
   return 0;

@@ -1,13 +1,10 @@
 #include "tests/fuzz/fuzz_call.h"
 
-#include <string_view>
-#include <utility>
+#include <algorithm>
+#include <cstring>
 
 namespace gateway_fuzz {
 namespace {
-
-using gateway_tests::TArgument;
-using gateway_tests::TArguments;
 
 constexpr std::string_view kNullText = "\xff";
 
@@ -36,18 +33,42 @@ class CReader {
     return letter == 'b' ? int64_t{static_cast<int8_t>(value)} : int64_t{value};
   }
 
-  TArgument Text() {
-    const uint8_t* end = m_pAt;
-    while (end != m_pEnd && *end != 0) ++end;
+  std::string_view Text() {
+    if (m_pAt == m_pEnd) return {};
+    const size_t left = static_cast<size_t>(m_pEnd - m_pAt);
+    const auto* const zero = static_cast<const uint8_t*>(std::memchr(m_pAt, 0, left));
     const std::string_view text(reinterpret_cast<const char*>(m_pAt),
-                                static_cast<size_t>(end - m_pAt));
-    m_pAt = end == m_pEnd ? end : end + 1;
-    return text == kNullText ? TArgument::Null() : TArgument::Text(text);
+                                zero == nullptr ? left : static_cast<size_t>(zero - m_pAt));
+    m_pAt = zero == nullptr ? m_pEnd : zero + 1;
+    return text;
   }
 
  private:
   const uint8_t* m_pAt;
   const uint8_t* m_pEnd;
+};
+
+/// The bytes that there is room for.
+class CWriter {
+ public:
+  CWriter(uint8_t* data, size_t size) : m_pBegin(data), m_pAt(data), m_pEnd(data + size) {}
+
+  void Byte(uint64_t value) {
+    if (m_pAt != m_pEnd) *m_pAt++ = static_cast<uint8_t>(value & 0xff);
+  }
+
+  void Text(std::string_view text) {
+    const size_t size = std::min(text.size(), static_cast<size_t>(m_pEnd - m_pAt));
+    if (size > 0) std::memcpy(m_pAt, text.data(), size);
+    m_pAt += size;
+  }
+
+  size_t Size() const { return static_cast<size_t>(m_pAt - m_pBegin); }
+
+ private:
+  uint8_t* m_pBegin;
+  uint8_t* m_pAt;
+  uint8_t* m_pEnd;
 };
 
 }  // namespace
@@ -61,46 +82,47 @@ TFuzzCall ReadCall(const TRows& rows, const uint8_t* data, size_t size) {
   TFuzzCall call;
   call.m_nRow = reader.Byte() % rows.m_nCount;
   call.m_nMoment = reader.Byte();
-  const std::string_view letters = Letters(rows.m_pRows[call.m_nRow]);
-  call.m_Arguments.reserve(letters.size());
-  for (char letter : letters) {
+  for (char letter : Letters(rows.m_pRows[call.m_nRow])) {
     if (letter == 'S') {
-      call.m_Arguments.push_back(reader.Text());
+      const std::string_view text = reader.Text();
+      const bool null = text == kNullText;
+      call.Add({letter, null, 0, null ? std::string_view() : text});
     } else {
-      call.m_Arguments.push_back({letter, reader.Number(letter), {}});
+      call.Add({letter, false, reader.Number(letter), {}});
     }
   }
   return call;
 }
 
-std::string WriteCall(const TFuzzCall& call) {
-  std::string bytes = {static_cast<char>(call.m_nRow), static_cast<char>(call.m_nMoment)};
-  for (const TArgument& argument : call.m_Arguments) {
+size_t WriteCall(const TFuzzCall& call, uint8_t* data, size_t maxSize) {
+  CWriter writer(data, maxSize);
+  writer.Byte(call.m_nRow);
+  writer.Byte(call.m_nMoment);
+  for (const TFuzzArgument& argument : call) {
     if (argument.m_chLetter == 'S') {
-      bytes.append(argument.m_Text.has_value() ? std::string_view(*argument.m_Text) : kNullText);
-      bytes.push_back('\0');
+      writer.Text(argument.m_bNull ? kNullText : argument.m_Text);
+      writer.Byte(0);
       continue;
     }
     const auto value = static_cast<uint64_t>(argument.m_nNumber);
-    for (size_t i = 0; i < BytesOf(argument.m_chLetter); ++i) {
-      bytes.push_back(static_cast<char>(value >> (8 * i) & 0xff));
-    }
+    for (size_t i = 0; i < BytesOf(argument.m_chLetter); ++i) writer.Byte(value >> (8 * i));
   }
-  return bytes;
+  return writer.Size();
 }
 
 void FitArguments(const TRows& rows, TFuzzCall& call) {
-  TArguments old = std::move(call.m_Arguments);
-  call.m_Arguments.clear();
+  const TFuzzCall old = call;
+  call.m_nArguments = 0;
   size_t text = 0;
   size_t number = 0;
   for (char letter : Letters(rows.m_pRows[call.m_nRow])) {
     size_t& at = letter == 'S' ? text : number;
-    while (at < old.size() && (old[at].m_chLetter == 'S') != (letter == 'S')) ++at;
-    TArgument argument = letter == 'S' ? TArgument::Text("") : TArgument{letter, 0, {}};
-    if (at < old.size()) argument = std::move(old[at++]);
+    while (at < old.m_nArguments && (old.m_Arguments[at].m_chLetter == 'S') != (letter == 'S'))
+      ++at;
+    TFuzzArgument argument = {letter, false, 0, {}};
+    if (at < old.m_nArguments) argument = old.m_Arguments[at++];
     argument.m_chLetter = letter;
-    call.m_Arguments.push_back(std::move(argument));
+    call.Add(argument);
   }
 }
 

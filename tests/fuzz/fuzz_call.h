@@ -3,10 +3,9 @@
 
 #include <cstddef>
 #include <cstdint>
-#include <string>
+#include <string_view>
 
 #include "tests/support/call_table.h"
-#include "tests/support/recording_host.h"
 
 // An input of a fuzz target is a call, as bytes:
 //
@@ -32,10 +31,26 @@ struct TRows {
 /// The rows of the target that is linked into this program.
 TRows FuzzRows();
 
+/// One Java argument: a text, or null, for 'S', a number for 'i', 'b' and 'c'. A call owns no text:
+/// it lies in the input, or where the mutator made it. Nothing is allocated for an execution.
+struct TFuzzArgument {
+  char m_chLetter;
+  bool m_bNull;
+  int64_t m_nNumber;
+  std::string_view m_Text;
+};
+
 struct TFuzzCall {
+  static constexpr size_t kMaxArguments = 31;
+
   size_t m_nRow = 0;
   uint8_t m_nMoment = 0;
-  gateway_tests::TArguments m_Arguments;
+  size_t m_nArguments = 0;
+  TFuzzArgument m_Arguments[kMaxArguments];
+
+  void Add(const TFuzzArgument& argument) { m_Arguments[m_nArguments++] = argument; }
+  const TFuzzArgument* begin() const { return m_Arguments; }
+  const TFuzzArgument* end() const { return m_Arguments + m_nArguments; }
 
   /// The time that m_nMoment stands for: hours and minutes of all kinds, 1970 to 2045.
   int64_t Clock() const;
@@ -43,8 +58,8 @@ struct TFuzzCall {
 
 TFuzzCall ReadCall(const TRows& rows, const uint8_t* data, size_t size);
 
-/// ReadCall of these bytes gives the same call.
-std::string WriteCall(const TFuzzCall& call);
+/// Writes the bytes that ReadCall makes the same call of, as many as there is room for.
+size_t WriteCall(const TFuzzCall& call, uint8_t* data, size_t maxSize);
 
 /// Gives the call the arguments that its row takes, made of those it has: texts stay texts, in
 /// their order, and so do numbers.

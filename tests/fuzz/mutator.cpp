@@ -2,12 +2,15 @@
 // and in texts on fields and records - and leaves bytes to the fuzzer's own mutations.
 
 #include <algorithm>
+#include <array>
 #include <cstring>
+#include <initializer_list>
 #include <iterator>
-#include <string>
-#include <vector>
+#include <string_view>
+#include <utility>
 
 #include "tests/fuzz/fuzz_call.h"
+#include "tests/fuzz/lent_memory.h"
 #include "tests/fuzz/wire_words.h"
 
 extern "C" size_t LLVMFuzzerMutate(uint8_t* data, size_t size, size_t maxSize);
@@ -15,19 +18,129 @@ extern "C" size_t LLVMFuzzerMutate(uint8_t* data, size_t size, size_t maxSize);
 namespace gateway_fuzz {
 namespace {
 
-using gateway_tests::TArgument;
+/// Copies a text, which may be an empty one of no place.
+void Copy(std::string_view text, char* to) {
+  if (!text.empty()) std::memcpy(to, text.data(), text.size());
+}
 
-using TFields = std::vector<std::string>;
+/// Room for all that one mutation makes; what does not fit is not made.
+class CScratch {
+ public:
+  void Clear() { m_nUsed = 0; }
+  size_t Left() const { return sizeof m_Bytes - m_nUsed; }
 
-template <class TList>
-auto At(TList& list, size_t index) {
-  return list.begin() + static_cast<std::ptrdiff_t>(index);
+  /// The next bytes; how many of them are used is told later.
+  char* Open() { return m_Bytes + m_nUsed; }
+  std::string_view Close(size_t size) {
+    const std::string_view text(m_Bytes + m_nUsed, size);
+    m_nUsed += size;
+    return text;
+  }
+
+  std::string_view Concatenate(std::initializer_list<std::string_view> parts) {
+    char* const begin = Open();
+    size_t size = 0;
+    for (const std::string_view part : parts) {
+      if (size + part.size() > Left()) return {};
+      Copy(part, begin + size);
+      size += part.size();
+    }
+    return Close(size);
+  }
+
+ private:
+  size_t m_nUsed = 0;
+  char m_Bytes[size_t{1} << 20];
+};
+
+/// The fields of a text, between its bars.
+class CFields {
+ public:
+  void Clear() { m_nSize = 0; }
+  size_t Size() const { return m_nSize; }
+  std::string_view& operator[](size_t at) { return m_Fields[at]; }
+  const std::string_view* At(size_t at) const { return m_Fields + at; }
+
+  void Split(std::string_view text) {
+    Clear();
+    while (m_nSize < kMax) {
+      const void* const bar = text.empty() ? nullptr : std::memchr(text.data(), '|', text.size());
+      if (bar == nullptr) break;
+      const auto size = static_cast<size_t>(static_cast<const char*>(bar) - text.data());
+      m_Fields[m_nSize++] = text.substr(0, size);
+      text.remove_prefix(size + 1);
+    }
+    if (m_nSize < kMax) m_Fields[m_nSize++] = text;
+  }
+
+  std::string_view Join(CScratch& scratch, size_t maxSize) const {
+    char* const begin = scratch.Open();
+    const size_t room = std::min(maxSize, scratch.Left());
+    size_t size = 0;
+    for (size_t i = 0; i < m_nSize; ++i) {
+      const std::string_view field = m_Fields[i];
+      if (size + field.size() + 1 > room) break;
+      if (i > 0) begin[size++] = '|';
+      Copy(field, begin + size);
+      size += field.size();
+    }
+    return scratch.Close(size);
+  }
+
+  void Insert(size_t at, std::string_view field) { Insert(at, &field, 1); }
+
+  /// `fields` may be fields of this text.
+  void Insert(size_t at, const std::string_view* fields, size_t count) {
+    if (m_nSize + count > kMax) return;
+    std::copy_n(fields, count, m_More);
+    std::copy_backward(m_Fields + at, m_Fields + m_nSize, m_Fields + m_nSize + count);
+    std::copy_n(m_More, count, m_Fields + at);
+    m_nSize += count;
+  }
+
+  void Erase(size_t at, size_t count) {
+    std::copy(m_Fields + at + count, m_Fields + m_nSize, m_Fields + at);
+    m_nSize -= count;
+  }
+
+  void Cut(size_t size) { m_nSize = size; }
+
+  /// The first field from `at` on that begins with `mark`, else Size().
+  size_t Find(size_t at, std::string_view mark) const {
+    while (at < m_nSize && m_Fields[at].substr(0, mark.size()) != mark) ++at;
+    return at;
+  }
+
+ private:
+  static constexpr size_t kMax = 8192;
+  size_t m_nSize = 0;
+  std::string_view m_Fields[kMax];
+  std::string_view m_More[kMax];
+};
+
+/// A text of one character, as long as one wants.
+struct TFill {
+  char m_Bytes[4096];
+};
+template <char... kFill>
+std::string_view FillOf(size_t which, size_t size) {
+  static const auto s_Fills = [] {
+    std::array<TFill, sizeof...(kFill)> fills;
+    size_t i = 0;
+    for (const char fill : {kFill...}) std::memset(fills[i++].m_Bytes, fill, sizeof(TFill));
+    return fills;
+  }();
+  return {s_Fills[which % sizeof...(kFill)].m_Bytes, std::min(size, sizeof(TFill))};
 }
 
 class CMutator {
  public:
-  CMutator(const TRows& rows, unsigned seed, size_t maxSize)
-      : m_Rows(rows), m_nState(seed * uint64_t{2654435761U} + 88172645463325252U), m_nMax(maxSize) {
+  /// To be called before each mutation: what the last one made is gone then.
+  void Start(const TRows& rows, unsigned seed, size_t maxSize) {
+    m_Rows = rows;
+    m_nState = seed * uint64_t{2654435761U} + 88172645463325252U;
+    m_nMax = maxSize;
+    m_Scratch.Clear();
     Below(1);
   }
 
@@ -39,7 +152,7 @@ class CMutator {
     } else if (kind == 1) {
       call.m_nMoment = static_cast<uint8_t>(Below(256));
     } else {
-      TArgument& argument = call.m_Arguments[Below(call.m_Arguments.size())];
+      TFuzzArgument& argument = call.m_Arguments[Below(call.m_nArguments)];
       if (argument.m_chLetter == 'S') {
         MutateText(argument);
       } else {
@@ -50,21 +163,21 @@ class CMutator {
 
   /// Gives the call a text, or some fields of a text, of another call.
   void Cross(TFuzzCall& call, const TFuzzCall& other) {
-    const TArgument* const from = SomeText(other);
-    const TArgument* const to = SomeText(call);
-    if (from == nullptr || to == nullptr) return;
-    TArgument& target = call.m_Arguments[static_cast<size_t>(to - call.m_Arguments.data())];
-    if (Below(4) == 0 || !target.m_Text.has_value() || !from->m_Text.has_value()) {
-      target.m_Text = from->m_Text;
+    const size_t from = SomeText(other);
+    const size_t to = SomeText(call);
+    if (from == other.m_nArguments || to == call.m_nArguments) return;
+    const TFuzzArgument& source = other.m_Arguments[from];
+    TFuzzArgument& target = call.m_Arguments[to];
+    if (Below(4) == 0 || target.m_bNull || source.m_bNull) {
+      target = source;
       return;
     }
-    TFields fields = Split(*target.m_Text);
-    const TFields others = Split(*from->m_Text);
-    const size_t begin = Below(others.size());
-    const size_t count = 1 + Below(others.size() - begin);
-    fields.insert(At(fields, Below(fields.size() + 1)), At(others, begin),
-                  At(others, begin + count));
-    target.m_Text = Join(fields);
+    m_Fields.Split(target.m_Text);
+    m_Others.Split(source.m_Text);
+    const size_t begin = Below(m_Others.Size());
+    const size_t count = 1 + Below(m_Others.Size() - begin);
+    m_Fields.Insert(Below(m_Fields.Size() + 1), m_Others.At(begin), count);
+    target.m_Text = m_Fields.Join(m_Scratch, m_nMax);
   }
 
  private:
@@ -79,47 +192,35 @@ class CMutator {
     return list[Below(std::size(list))];
   }
 
-  const TArgument* SomeText(const TFuzzCall& call) {
-    std::vector<const TArgument*> texts;
-    for (const TArgument& argument : call.m_Arguments) {
-      if (argument.m_chLetter == 'S') texts.push_back(&argument);
+  /// The place of one of the texts; m_nArguments when there is none.
+  size_t SomeText(const TFuzzCall& call) {
+    size_t texts[TFuzzCall::kMaxArguments];
+    size_t count = 0;
+    for (size_t i = 0; i < call.m_nArguments; ++i) {
+      if (call.m_Arguments[i].m_chLetter == 'S') texts[count++] = i;
     }
-    return texts.empty() ? nullptr : Choose(texts);
+    return count == 0 ? call.m_nArguments : texts[Below(count)];
   }
 
-  static TFields Split(const std::string& text) {
-    TFields fields;
-    size_t begin = 0;
-    for (size_t bar; (bar = text.find('|', begin)) != std::string::npos; begin = bar + 1) {
-      fields.push_back(text.substr(begin, bar - begin));
-    }
-    fields.push_back(text.substr(begin));
-    return fields;
-  }
-
-  static std::string Join(const TFields& fields) {
-    std::string text;
-    for (const std::string& field : fields) text.append(field).push_back('|');
-    text.pop_back();
-    return text;
-  }
-
-  std::string Value() {
+  std::string_view Value() {
     if (Below(8) != 0) return Choose(kValues);
-    const char fill[] = {'0', '9', 'x', ' ', '.', '&'};
-    return std::string(Choose(kLengths), Choose(fill));
+    const size_t size = Choose(kLengths);
+    return FillOf<'0', '9', 'x', ' ', '.', '&'>(Below(6), size);
   }
-  std::string Field() { return std::string(Choose(kTags)) + "=" + Value(); }
+  std::string_view Field() { return m_Scratch.Concatenate({Choose(kTags), "=", Value()}); }
 
-  TFields Record() {
-    TFields record = {"00=1", "67=" + std::to_string(Below(9)),
-                      Below(4) != 0 ? "68=0000" : Field()};
-    for (size_t more = Below(24); more > 0; --more) record.push_back(Field());
-    record.emplace_back("01=");
-    return record;
+  void InsertRecord(size_t at) {
+    constexpr const char* kNumbers67[] = {"67=0", "67=1", "67=2", "67=3", "67=4",
+                                          "67=5", "67=6", "67=7", "67=8"};
+    std::string_view record[32] = {"00=1", Choose(kNumbers67),
+                                   Below(4) != 0 ? std::string_view("68=0000") : Field()};
+    size_t count = 3;
+    for (size_t more = Below(24); more > 0; --more) record[count++] = Field();
+    record[count++] = "01=";
+    m_Fields.Insert(at, record, count);
   }
 
-  void MutateNumber(TArgument& argument) {
+  void MutateNumber(TFuzzArgument& argument) {
     const int64_t value =
         Below(2) != 0 ? Choose(kNumbers) : argument.m_nNumber + int64_t(Below(9)) - 4;
     const auto bits = static_cast<uint32_t>(value);
@@ -128,104 +229,101 @@ class CMutator {
                                                       : int64_t{static_cast<int32_t>(bits)};
   }
 
-  void MutateText(TArgument& argument) {
-    if (!argument.m_Text.has_value()) {
-      argument.m_Text = Value();
-      return;
-    }
-    const size_t kind = Below(16);
+  void MutateText(TFuzzArgument& argument) {
+    const size_t kind = argument.m_bNull ? 0 : Below(16);
+    argument.m_bNull = false;
     if (kind == 0) {
       argument.m_Text = Value();
     } else if (kind == 1) {
-      argument.m_Text = Below(4) != 0 ? std::string() : std::optional<std::string>();
+      argument.m_bNull = Below(4) == 0;
+      argument.m_Text = {};
     } else if (kind < 6) {
-      MutateBytes(*argument.m_Text);
+      argument.m_Text = MutateBytes(argument.m_Text);
     } else {
-      MutateFields(*argument.m_Text);
+      argument.m_Text = MutateFields(argument.m_Text);
     }
   }
 
-  void MutateBytes(std::string& text) {
-    std::vector<uint8_t> bytes(std::max(m_nMax, text.size()));
-    std::copy(text.begin(), text.end(), bytes.begin());
-    const size_t size = LLVMFuzzerMutate(bytes.data(), text.size(), bytes.size());
-    text.assign(reinterpret_cast<const char*>(bytes.data()), size);
-    text.erase(std::remove(text.begin(), text.end(), '\0'), text.end());
+  std::string_view MutateBytes(std::string_view text) {
+    const size_t room = std::max(m_nMax, text.size());
+    if (room > m_Scratch.Left()) return text;
+    char* const bytes = m_Scratch.Open();
+    Copy(text, bytes);
+    const size_t size = LLVMFuzzerMutate(reinterpret_cast<uint8_t*>(bytes), text.size(), room);
+    char* const end = std::remove(bytes, bytes + size, '\0');
+    return m_Scratch.Close(static_cast<size_t>(end - bytes));
   }
 
-  void MutateFields(std::string& text) {
-    TFields fields = Split(text);
-    const size_t at = Below(fields.size());
-    const size_t other = Below(fields.size());
+  std::string_view MutateFields(std::string_view text) {
+    m_Fields.Split(text);
+    const size_t at = Below(m_Fields.Size());
+    const size_t other = Below(m_Fields.Size());
+    std::string_view& field = m_Fields[at];
     switch (Below(12)) {
       case 0:
       case 1:
-        fields.insert(At(fields, other + 1), Field());
+        m_Fields.Insert(other + 1, Field());
         break;
       case 2:
-        fields.erase(At(fields, at));
+        m_Fields.Erase(at, 1);
         break;
-      case 3: {
-        const std::string copy = fields[at];
-        fields.insert(At(fields, other), copy);
+      case 3:
+        m_Fields.Insert(other, field);
         break;
-      }
       case 4:
-        std::swap(fields[at], fields[other]);
+        std::swap(field, m_Fields[other]);
         break;
       case 5:
       case 6:
-        fields[at].resize(std::min(fields[at].size(), fields[at].find('=') + 1));
-        fields[at] += Value();
+        field = m_Scratch.Concatenate({field.substr(0, field.find('=') + 1), Value()});
         break;
       case 7:
-        fields[at].erase(0, fields[at].find('='));
-        fields[at].insert(0, Choose(kTags));
+        field = m_Scratch.Concatenate(
+            {Choose(kTags), field.substr(std::min(field.find('='), field.size()))});
         break;
       case 8:
-        Insert(fields, other + 1, Record());
+        InsertRecord(other + 1);
         break;
       case 9:
-        fields.insert(At(fields, at), Below(2) == 0 ? "00=" : "01=");
+        m_Fields.Insert(at, Below(2) == 0 ? "00=" : "01=");
         break;
       case 10:
-        fields.resize(at + 1);
+        m_Fields.Cut(at + 1);
         break;
       default:
-        CopyRecord(fields, at, other);
+        CopyRecord(at, other);
     }
-    text = fields.empty() ? std::string() : Join(fields);
-  }
-
-  static void Insert(TFields& fields, size_t at, const TFields& more) {
-    fields.insert(At(fields, at), more.begin(), more.end());
+    return m_Fields.Join(m_Scratch, m_nMax);
   }
 
   /// Repeats, or takes out, the record that begins next behind `at`.
-  void CopyRecord(TFields& fields, size_t at, size_t other) {
-    const auto marks = [](const char* mark) {
-      return [mark](const std::string& field) { return field.compare(0, 3, mark) == 0; };
-    };
-    const auto begin = std::find_if(At(fields, at), fields.end(), marks("00="));
-    const auto end = std::find_if(begin, fields.end(), marks("01="));
-    if (end == fields.end()) {
-      Insert(fields, fields.size(), Record());
+  void CopyRecord(size_t at, size_t other) {
+    const size_t begin = m_Fields.Find(at, "00=");
+    const size_t end = m_Fields.Find(begin, "01=");
+    if (end == m_Fields.Size()) {
+      InsertRecord(m_Fields.Size());
     } else if (Below(4) == 0) {
-      fields.erase(begin, end + 1);
+      m_Fields.Erase(begin, end + 1 - begin);
     } else {
-      Insert(fields, other, TFields(begin, end + 1));
+      m_Fields.Insert(other, m_Fields.At(begin), end + 1 - begin);
     }
   }
 
-  TRows m_Rows;
-  uint64_t m_nState;
-  size_t m_nMax;
+  TRows m_Rows{};
+  uint64_t m_nState = 0;
+  size_t m_nMax = 0;
+  CScratch m_Scratch;
+  CFields m_Fields;
+  CFields m_Others;
 };
 
+CMutator s_Mutator;
+
+/// Writes the call to where its texts may still lie.
 size_t Store(const TFuzzCall& call, uint8_t* data, size_t maxSize) {
-  const std::string bytes = WriteCall(call);
-  const size_t size = std::min(bytes.size(), maxSize);
-  std::memcpy(data, bytes.data(), size);
+  static uint8_t s_Bytes[kMaxInput];
+  const size_t size = WriteCall(call, s_Bytes, std::min(maxSize, kMaxInput));
+  std::memcpy(data, s_Bytes, size);
   return size;
 }
 
@@ -236,8 +334,8 @@ extern "C" size_t LLVMFuzzerCustomMutator(uint8_t* data, size_t size, size_t max
                                           unsigned seed) {
   using namespace gateway_fuzz;
   TFuzzCall call = ReadCall(FuzzRows(), data, size);
-  CMutator mutator(FuzzRows(), seed, maxSize);
-  for (unsigned rounds = 1 + seed % 4; rounds > 0; --rounds) mutator.Mutate(call);
+  s_Mutator.Start(FuzzRows(), seed, maxSize);
+  for (unsigned rounds = 1 + seed % 4; rounds > 0; --rounds) s_Mutator.Mutate(call);
   return Store(call, data, maxSize);
 }
 
@@ -246,6 +344,7 @@ extern "C" size_t LLVMFuzzerCustomCrossOver(const uint8_t* data1, size_t size1,
                                             size_t maxSize, unsigned seed) {
   using namespace gateway_fuzz;
   TFuzzCall call = ReadCall(FuzzRows(), data1, size1);
-  CMutator(FuzzRows(), seed, maxSize).Cross(call, ReadCall(FuzzRows(), data2, size2));
+  s_Mutator.Start(FuzzRows(), seed, maxSize);
+  s_Mutator.Cross(call, ReadCall(FuzzRows(), data2, size2));
   return Store(call, out, maxSize);
 }

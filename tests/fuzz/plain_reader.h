@@ -2,48 +2,50 @@
 #define TESTS_FUZZ_PLAIN_READER_H_
 
 #include <cstddef>
-#include <string>
-#include <vector>
+#include <string_view>
 
-// The rules of a reply once more, as plainly as they can be told: a search for every question, a
-// copy for every answer. What the library reads in one pass is held against it.
+// The rules of a reply once more, as plainly as they can be told: a search from the start for every
+// question, byte by byte. What the library reads in one pass is held against it.
 
 namespace gateway_fuzz {
 
 /// What a buffer holds: the value, and the length that was found, fit or not.
 struct TPlainToken {
-  std::string m_Text;
+  std::string_view m_Text;
   size_t m_nLength = 0;
 };
 
+/// Where `what`, which is not empty, stands in `text` from `from` on; npos when nowhere.
+size_t PlainFind(std::string_view text, std::string_view what, size_t from);
+
 /// `value` as a buffer of `bound` bytes holds it.
-std::string PlainBounded(const std::string& value, size_t bound);
+std::string_view PlainBounded(std::string_view value, size_t bound);
 
 /// The value of the first field `tag` of `reply`, which stands behind a '|'; with `skipBlank` the
 /// first that is not an empty or blank one closed by a '|'.
-TPlainToken PlainToken(const std::string& tag, const std::string& reply, size_t bound,
-                       bool skipBlank);
+TPlainToken PlainToken(std::string_view tag, std::string_view reply, size_t bound, bool skipBlank);
 
 /// One record from `pos` on, and where the next one is to be looked for.
 struct TPlainRecord {
-  std::string m_Text;
+  std::string_view m_Text;
   size_t m_nNext = 0;
 };
-TPlainRecord PlainRecord(const std::string& reply, size_t pos, size_t bound);
+TPlainRecord PlainRecord(std::string_view reply, size_t pos, size_t bound);
 
-/// All complete records, one after the other; a closing mark that no opening one stands before
-/// gives an empty record, and so does a record of `bound` characters or more.
-std::vector<std::string> PlainRecords(const std::string& reply, size_t bound);
+/// The next complete record from `pos` on, which moves behind it; a closing mark that no opening
+/// one stands before gives an empty record, and so does a record of `bound` characters or more.
+/// False when there is none.
+bool PlainNextRecord(std::string_view reply, size_t bound, size_t& pos, std::string_view& record);
 
 enum class EPlainTransport { kOk, kGatewayDown, kBrokerDown };
-EPlainTransport PlainTransport(const std::string& reply);
+EPlainTransport PlainTransport(std::string_view reply);
 
 /// Text up to a separator, and what is left behind it.
 struct TPlainField {
-  std::string m_Text;
-  std::string m_Rest;
+  std::string_view m_Text;
+  std::string_view m_Rest;
 };
-TPlainField PlainField(const std::string& text, const std::string& separator);
+TPlainField PlainField(std::string_view text, std::string_view separator);
 
 }  // namespace gateway_fuzz
 

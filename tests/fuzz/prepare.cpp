@@ -8,6 +8,7 @@
 #include <filesystem>
 #include <fstream>
 #include <string>
+#include <string_view>
 
 #include "tests/fuzz/fuzz_call.h"
 #include "tests/fuzz/wire_words.h"
@@ -21,8 +22,19 @@ using gateway_tests::FindExport;
 using gateway_tests::TArgument;
 using gateway_tests::TGoldenCase;
 
+constexpr size_t kMaxSeed = 65536;
+
 void Write(const std::filesystem::path& file, const TFuzzCall& call) {
-  std::ofstream(file, std::ios::binary) << WriteCall(call);
+  uint8_t bytes[kMaxSeed];
+  const size_t size = WriteCall(call, bytes, kMaxSeed);
+  std::ofstream(file, std::ios::binary)
+      .write(reinterpret_cast<const char*>(bytes), static_cast<std::streamsize>(size));
+}
+
+TFuzzArgument Argument(const TArgument& golden) {
+  const bool null = golden.m_chLetter == 'S' && !golden.m_Text.has_value();
+  return {golden.m_chLetter, null, golden.m_nNumber,
+          golden.m_Text.has_value() ? std::string_view(*golden.m_Text) : std::string_view()};
 }
 
 void WriteSeeds(const char* vectors, const char* calls, const char* readers) {
@@ -31,14 +43,18 @@ void WriteSeeds(const char* vectors, const char* calls, const char* readers) {
   for (const TGoldenCase& golden : gateway_tests::ReadGoldenCases(vectors).m_Cases) {
     const gateway_tests::TExport* const row = FindExport(golden.m_Operation);
     const std::string name = golden.m_File + "-" + std::to_string(golden.m_nLine);
-    const auto number = static_cast<size_t>(row - AllExports());
-    Write(std::filesystem::path(calls) / name, {number, 54, golden.m_Arguments});
+    TFuzzCall call;
+    call.m_nRow = static_cast<size_t>(row - AllExports());
+    call.m_nMoment = 54;
+    for (const TArgument& argument : golden.m_Arguments) call.Add(Argument(argument));
+    Write(std::filesystem::path(calls) / name, call);
     if (!row->IsDecoder()) continue;
-    Write(std::filesystem::path(readers) / name,
-          {0,
-           0,
-           {TArgument::Byte(-1), TArgument::Byte(1), TArgument::Text("68"),
-            golden.m_Arguments.back()}});
+    TFuzzCall reading;
+    reading.Add({'b', false, -1, {}});
+    reading.Add({'b', false, 1, {}});
+    reading.Add({'S', false, 0, "68"});
+    reading.Add(Argument(golden.m_Arguments.back()));
+    Write(std::filesystem::path(readers) / name, reading);
   }
 }
 

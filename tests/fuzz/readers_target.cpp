@@ -1,26 +1,23 @@
 // The fuzz target of the reply readers: the tokenizers and the record index against the plain
 // reader, on memory of the reply's exact size.
 
-#include <algorithm>
 #include <cstdio>
 #include <cstdlib>
 #include <cstring>
 #include <iterator>
-#include <memory>
 #include <string>
 #include <string_view>
-#include <vector>
 
 #include "gateway/core/gateway_pub.h"
 #include "gateway/core/reply_reader.h"
 #include "tests/fuzz/execution_counts.h"
 #include "tests/fuzz/fuzz_call.h"
+#include "tests/fuzz/lent_memory.h"
 #include "tests/fuzz/plain_reader.h"
 
 namespace gateway_fuzz {
 namespace {
 
-using gateway_tests::TArguments;
 using gateway_tests::TExport;
 
 /// An input's arguments: a choice of bound, whether blanks are skipped, a tag, the reply.
@@ -47,43 +44,29 @@ constexpr CTagTable kTable({{"67"},
 }
 
 void Expect(const char* what, std::string_view read, std::string_view plain) {
-  if (read != plain) Different(what, read, plain);
+  if (!SameText(read, plain)) Different(what, read, plain);
 }
 void ExpectNumber(const char* what, size_t read, size_t plain) {
   if (read != plain) Different(what, std::to_string(read), std::to_string(plain));
 }
 
-/// A text in a heap block that ends with its terminator.
-using TBlock = std::unique_ptr<char[]>;
-TBlock Copy(const std::string& text) {
-  TBlock block(new char[text.size() + 1]);
-  std::memcpy(block.get(), text.c_str(), text.size() + 1);
-  return block;
-}
-
-/// A buffer of `size` bytes that was used before.
-TBlock Buffer(size_t size) {
-  TBlock block(new char[size]);
-  std::memset(block.get(), '#', size);
-  return block;
-}
-
-void CheckToken(const std::string& tag, const std::string& reply, size_t bound, bool skipBlank) {
+void CheckToken(std::string_view tag, std::string_view reply, size_t bound, bool skipBlank) {
   CGatewayPub gateway;
-  const TBlock text = Copy(reply);
-  const TBlock out = Buffer(bound);
+  const CLent lentTag(tag);
+  const CLent text(reply);
+  const CLent out(bound);
   const int length =
-      gateway.GetToken(tag.c_str(), text.get(), out.get(), static_cast<int>(bound), skipBlank);
+      gateway.GetToken(lentTag.get(), text.get(), out.get(), static_cast<int>(bound), skipBlank);
   const TPlainToken plain = PlainToken(tag, reply, bound, skipBlank);
   Expect("GetToken", out.get(), plain.m_Text);
   ExpectNumber("GetToken's length", static_cast<size_t>(length), plain.m_nLength);
   Expect("GetToken's reply", text.get(), reply);
 }
 
-void CheckSubStrings(const std::string& reply, size_t bound) {
+void CheckSubStrings(std::string_view reply, size_t bound) {
   CGatewayPub gateway;
-  const TBlock text = Copy(reply);
-  const TBlock out = Buffer(bound);
+  const CLent text(reply);
+  const CLent out(bound);
   int pos = 0;
   for (int turn = 0; turn < 64 && static_cast<size_t>(pos) < reply.size(); ++turn) {
     const TPlainRecord plain = PlainRecord(reply, static_cast<size_t>(pos), bound);
@@ -93,67 +76,72 @@ void CheckSubStrings(const std::string& reply, size_t bound) {
   }
 }
 
-void CheckRecords(const std::string& reply, size_t bound, size_t valueBound) {
-  const TBlock text(new char[reply.size()]);  // the walker needs no terminator
-  std::copy(reply.begin(), reply.end(), text.get());
+void CheckRecord(const CRecord& record, std::string_view plain, size_t valueBound) {
+  ExpectNumber("an empty record", record.Empty() ? 1 : 0, plain.empty() ? 1 : 0);
+  for (int row = 0; row < static_cast<int>(std::size(kRowTags)); ++row) {
+    const TPlainToken token = PlainToken(kRowTags[row], plain, valueBound, kTable.SkipsBlanks(row));
+    Expect(kRowTags[row], record.Text(row, valueBound), token.m_Text);
+    ExpectNumber(kRowTags[row], record.Has(row) ? 1 : 0, token.m_nLength > 0 ? 1 : 0);
+  }
+}
+
+void CheckRecords(std::string_view reply, size_t bound, size_t valueBound) {
+  const CLent text(reply, CLent::EEnd::kBare);  // the walker needs no terminator
   CRecordWalker walker({text.get(), reply.size()}, bound);
   CRecord record(kTable);
-  for (const std::string& plain : PlainRecords(reply, bound)) {
+  size_t pos = 0;
+  std::string_view plain;
+  while (PlainNextRecord(reply, bound, pos, plain)) {
     if (!walker.Next(record)) Different("the walk ends early", "", plain);
-    ExpectNumber("an empty record", record.Empty() ? 1 : 0, plain.empty() ? 1 : 0);
-    for (int row = 0; row < static_cast<int>(std::size(kRowTags)); ++row) {
-      const TPlainToken token =
-          PlainToken(kRowTags[row], plain, valueBound, kTable.SkipsBlanks(row));
-      Expect(kRowTags[row], record.Text(row, valueBound), token.m_Text);
-      ExpectNumber(kRowTags[row], record.Has(row) ? 1 : 0, token.m_nLength > 0 ? 1 : 0);
-    }
+    CheckRecord(record, plain, valueBound);
   }
   if (walker.Next(record)) Different("the walk goes on", record.Text(8, 99), "");
   if (!record.Empty()) Different("the end is an empty record", record.Text(8, 99), "");
 }
 
-void CheckFields(const std::string& reply, const std::string& separator, size_t bound) {
+void CheckFields(std::string_view reply, std::string_view separator, size_t bound) {
   if (separator.empty()) return;
   CGatewayPub gateway;
-  const TBlock text = Copy(reply);
-  const TBlock out = Buffer(bound);
+  const CLent text(reply);
+  const CLent lentSeparator(separator);
+  const CLent out(bound);
   char* cursor = text.get();
   TPlainField plain = {"", reply};
   for (int turn = 0; turn < 16 && !plain.m_Rest.empty(); ++turn) {
     plain = PlainField(plain.m_Rest, separator);
-    out[0] = '\0';
-    gateway.GetFieldString(&cursor, separator.c_str(), out.get(), static_cast<int>(bound));
+    out.get()[0] = '\0';
+    gateway.GetFieldString(&cursor, lentSeparator.get(), out.get(), static_cast<int>(bound));
     Expect("GetFieldString", out.get(), PlainBounded(plain.m_Text, bound));
     Expect("GetFieldString's rest", cursor, plain.m_Rest);
   }
 }
 
 /// A part of an identity field as its buffer holds it: one that does not fit leaves it as it was.
-std::string PartOf(const std::string& part, size_t bound) {
+std::string_view PartOf(std::string_view part, size_t bound) {
   return part.empty() || part.size() >= bound ? "old" : part;
 }
 
-void CheckIdentity(const std::string& field, size_t bound) {
+void CheckIdentity(std::string_view field, size_t bound) {
   if (bound < sizeof "old") return;
   CGatewayPub gateway;
-  const TBlock text = Copy(field);
-  const TBlock first = Buffer(bound);
-  const TBlock second = Buffer(bound);
+  const CLent text(field);
+  const CLent first(bound);
+  const CLent second(bound);
   std::strcpy(first.get(), "old");
   std::strcpy(second.get(), "old");
   const int size = static_cast<int>(bound);
   const int found =
       gateway.SeparateDataFromUiField(text.get(), first.get(), size, second.get(), size);
-  const size_t at = field.find('&');
-  ExpectNumber("an identity field", found != 0 ? 1 : 0, at == std::string::npos ? 0 : 1);
-  const bool split = at != std::string::npos;
+  const size_t at = PlainFind(field, "&", 0);
+  const bool split = at != std::string_view::npos;
+  ExpectNumber("an identity field", found != 0 ? 1 : 0, split ? 1 : 0);
   Expect("its first part", first.get(), split ? PartOf(field.substr(0, at), bound) : "old");
   Expect("its second part", second.get(), split ? PartOf(field.substr(at + 1), bound) : "old");
 }
 
-void CheckTransport(const std::string& reply) {
+void CheckTransport(std::string_view reply) {
   CGatewayPub gateway;
-  const TBlock text = Copy(reply);
+  const CLent text(reply);
   char message[64] = "old";
   int status = 1;
   gateway.CheckError(text.get(), &status, message, sizeof message);
@@ -165,14 +153,17 @@ void CheckTransport(const std::string& reply) {
   ExpectNumber("CheckError's status", status == -1 ? 1 : 0, *expected == '\0' ? 0 : 1);
 }
 
-void CheckReply(const TArguments& arguments) {
+void CheckReply(const TFuzzCall& call) {
+  const TFuzzArgument* const arguments = call.m_Arguments;
   const size_t bound = kBounds[static_cast<size_t>(arguments[0].m_nNumber & 15)];
   const size_t valueBound = kBounds[static_cast<size_t>(arguments[0].m_nNumber >> 4 & 15)];
   const bool skipBlank = (arguments[1].m_nNumber & 1) != 0;
-  const std::string tag = arguments[2].m_Text.value_or("");
-  const std::string reply = arguments[3].m_Text.value_or("");
+  const std::string_view tag = arguments[2].m_Text;
+  const std::string_view reply = arguments[3].m_Text;
   // What has a bar in it is no tag.
-  if (tag.find('|') == std::string::npos) CheckToken(tag, reply, valueBound, skipBlank);
+  if (PlainFind(tag, "|", 0) == std::string_view::npos) {
+    CheckToken(tag, reply, valueBound, skipBlank);
+  }
   CheckToken("68", reply, valueBound, skipBlank);
   CheckSubStrings(reply, bound);
   CheckRecords(reply, bound, valueBound);
@@ -196,8 +187,8 @@ extern "C" int LLVMFuzzerInitialize(int*, char***) {
 
 extern "C" int LLVMFuzzerTestOneInput(const uint8_t* data, size_t size) {
   using namespace gateway_fuzz;
-  const TFuzzCall call = ReadCall(FuzzRows(), data, size);
-  CheckReply(call.m_Arguments);
+  if (size > kMaxInput) return 0;
+  CheckReply(ReadCall(FuzzRows(), data, size));
   CountExecution(0);
   return 0;
 }

@@ -1,9 +1,10 @@
 #include "tests/support/recording_host.h"
 
 #include <cstdio>
-#include <cstdlib>
 #include <cstring>
 #include <utility>
+
+#include "tests/support/forbidden_calls.h"
 
 namespace gateway_tests {
 
@@ -29,32 +30,6 @@ struct CRecordingHost::TStatus {
 struct CRecordingHost::TEnvironment : JNIEnv {
   CRecordingHost* m_pHost = nullptr;
 };
-
-namespace {
-
-constexpr const char* kSlotNames[] = {
-#include "tests/support/jni_slot_names.inc"
-};
-constexpr size_t kSlots = sizeof(JNINativeInterface_) / sizeof(void*);
-
-template <size_t kSlot>
-[[noreturn]] void Forbidden() {
-  const char* name = kSlot < std::size(kSlotNames) ? kSlotNames[kSlot] : "a later function";
-  std::fprintf(stderr, "forbidden VM call: %s (slot %zu)\n", name, kSlot);
-  std::abort();
-}
-
-template <size_t... kSlot>
-JNINativeInterface_ ForbidAll(std::index_sequence<kSlot...>) {
-  using TFunction = void (*)();
-  const TFunction slots[] = {&Forbidden<kSlot>...};
-  JNINativeInterface_ table;
-  static_assert(sizeof(slots) == sizeof(table));
-  std::memcpy(static_cast<void*>(&table), slots, sizeof(table));
-  return table;
-}
-
-}  // namespace
 
 /// The five functions that exist.
 struct THostFunctions {
@@ -154,7 +129,7 @@ struct THostFunctions {
 
   static const JNINativeInterface_* Table() {
     static const JNINativeInterface_ s_Table = [] {
-      JNINativeInterface_ table = ForbidAll(std::make_index_sequence<kSlots>());
+      JNINativeInterface_ table = ForbiddenCalls();
       table.GetStringUTFChars = &GetStringUTFChars;
       table.ReleaseStringUTFChars = &ReleaseStringUTFChars;
       table.GetIntArrayElements = &GetIntArrayElements;
