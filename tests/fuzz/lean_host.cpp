@@ -17,14 +17,15 @@ using gateway_tests::TExport;
 /// Not a value that any entry point writes.
 constexpr jint kUntouched = 0x5A5A;
 
-/// Blocks allocated and not freed since the call began. A target has one thread.
-int64_t s_nBlocks = 0;
+/// Blocks that this thread allocated and did not free since the call began; the fuzzer has a thread
+/// of its own that allocates when it likes.
+thread_local int64_t t_nBlocks = 0;
 
 void OnMalloc(const volatile void* block, size_t) {
-  if (block != nullptr) ++s_nBlocks;
+  if (block != nullptr) ++t_nBlocks;
 }
 void OnFree(const volatile void* block) {
-  if (block != nullptr) --s_nBlocks;
+  if (block != nullptr) --t_nBlocks;
 }
 
 /// Each step can be taken back, so that two words differ in what comes out when they differ.
@@ -153,10 +154,10 @@ TAnswer CLeanHost::Call(void* entryPoint, const TExport& row, const TFuzzCall& c
   jvalue values[TFuzzCall::kMaxArguments + 1];
   Begin(row, call, values);
   gateway_tests::ListenToLog(this);
-  s_nBlocks = 0;
+  t_nBlocks = 0;
   const jstring returned = row.m_pCall(entryPoint, &m_Environment, values);
-  if (s_nBlocks > 0) Violation("memory was never freed");
-  if (s_nBlocks < 0) Violation("memory of another was freed");
+  if (t_nBlocks > 0) Violation("memory was never freed");
+  if (t_nBlocks < 0) Violation("memory of another was freed");
   gateway_tests::ListenToLog(nullptr);
   Finish(row, returned);
   return m_Answer;

@@ -68,7 +68,7 @@ void CheckSubStrings(std::string_view reply, size_t bound) {
   const CLent text(reply);
   const CLent out(bound);
   int pos = 0;
-  for (int turn = 0; turn < 64 && static_cast<size_t>(pos) < reply.size(); ++turn) {
+  for (int turn = 0; turn < 16 && static_cast<size_t>(pos) < reply.size(); ++turn) {
     const TPlainRecord plain = PlainRecord(reply, static_cast<size_t>(pos), bound);
     gateway.GetSubString(text.get(), pos, out.get(), static_cast<int>(bound));
     Expect("GetSubString", out.get(), plain.m_Text);
