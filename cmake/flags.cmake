@@ -30,9 +30,10 @@ if(QUORVANE_COVERAGE)
   target_link_options(quorvane_flags INTERFACE --coverage)
 endif()
 
+# All is bound when the library is loaded, so that calls of the C library need no stubs (-fno-plt).
 add_library(quorvane_library_flags INTERFACE)
 target_compile_options(quorvane_library_flags INTERFACE
-    -fno-exceptions -fno-rtti -ffunction-sections -fdata-sections -fstack-protector-strong
+    -fno-exceptions -fno-rtti -ffunction-sections -fdata-sections -fstack-protector-strong -fno-plt
     $<$<AND:$<CONFIG:Release>,$<NOT:$<BOOL:${instrumented}>>>:-U_FORTIFY_SOURCE -D_FORTIFY_SOURCE=2>)
 if(QUORVANE_SANITIZE)
   target_compile_options(quorvane_library_flags INTERFACE -O1)

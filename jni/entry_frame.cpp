@@ -50,8 +50,7 @@ void CEntryCall::Release(size_t i) {
   if (m_texts[i] != nullptr) m_pEnv->ReleaseStringUTFChars(m_strings[i], m_texts[i]);
 }
 
-void CEntryCall::LogStep() {
-  if (m_options.stepLabel == nullptr) return;
+void CEntryCall::WriteStep() {
   char scratch[64];
   CTextWriter line(scratch, sizeof scratch);
   line.Append(WIRE("%s%d"), m_options.stepLabel, m_nStep++);

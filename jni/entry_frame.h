@@ -80,7 +80,10 @@ class CEntryCall {
 
  private:
   void Release(size_t i);
-  void LogStep();
+  void LogStep() {
+    if (m_options.stepLabel != nullptr) WriteStep();
+  }
+  void WriteStep();
 
   JNIEnv* m_pEnv;
   const FrameOptions& m_options;

@@ -86,6 +86,16 @@ size_t DecimalSize(int64_t value, size_t width) {
   return size < width ? width : size;
 }
 
+char* WriteNumber(char* at, int64_t value) {
+  if (static_cast<uint64_t>(value) >= 100000) return WriteDecimal(at, value, 0);
+  const auto number = static_cast<uint32_t>(value);
+  if (number >= 1000) {
+    return number < 10000 ? WriteDigits<4>(at, number) : WriteDigits<5>(at, number);
+  }
+  if (number >= 100) return WriteDigits<3>(at, number);
+  return number < 10 ? WriteDigits<1>(at, number) : WriteDigits<2>(at, number);
+}
+
 char* WriteDecimal(char* at, int64_t value, size_t width) {
   const size_t size = DecimalSize(value, width);
   char* const start = value < 0 ? at + 1 : at;

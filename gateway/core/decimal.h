@@ -15,15 +15,17 @@ int64_t ReadInt64(std::string_view text);
 // As ReadInt64, then narrowed to 32 bits by wrapping: what `atoi` gives where `long` has 64 bits.
 inline int32_t ReadInt32(std::string_view text) {
   constexpr size_t kSafeDigits = 9;
-  uint32_t value = 0;
-  size_t i = 0;
-  for (; i < text.size() && i < kSafeDigits; ++i) {
-    const uint32_t digit = static_cast<unsigned char>(text[i]) - uint32_t{'0'};
-    if (digit > 9) break;
-    value = value * 10 + digit;
+  if (text.size() <= kSafeDigits) {
+    uint32_t value = 0;
+    const char* at = text.data();
+    const char* const end = at + text.size();
+    for (; at != end; ++at) {
+      const uint32_t digit = static_cast<unsigned char>(*at) - uint32_t{'0'};
+      if (digit > 9) break;
+      value = value * 10 + digit;
+    }
+    if (at == end || at != text.data()) return static_cast<int32_t>(value);
   }
-  const bool complete = i == text.size() || (i > 0 && i < kSafeDigits);
-  if (complete) return static_cast<int32_t>(value);
   return static_cast<int32_t>(static_cast<uint32_t>(static_cast<uint64_t>(ReadInt64(text))));
 }
 
@@ -66,11 +68,25 @@ inline void WriteDigitPair(char* at, uint32_t value) {
   memcpy(at, kDigitPairs + size_t{2} * value, 2);
 }
 
+// Writes the eight digits of a value below 10^8 in one store: halves, pairs and digits are parted
+// side by side in one word, the first digit in its lowest byte (every ABI is little-endian).
+inline void WriteEightDigits(char* at, uint32_t value) {
+  const uint64_t halves = value / 10000 | uint64_t{value % 10000} << 32;
+  const uint64_t hundreds = (halves * 10486 >> 20) & 0x0000007f0000007f;  // halves / 100
+  const uint64_t pairs = hundreds | (halves - 100 * hundreds) << 16;
+  const uint64_t tens = (pairs * 103 >> 10) & 0x000f000f000f000f;  // pairs / 10
+  const uint64_t digits = tens | (pairs - 10 * tens) << 8 | 0x3030303030303030;
+  memcpy(at, &digits, sizeof digits);
+}
+
 // Writes the last `kCount` digits of `value`, zero-padded on the left; returns the place behind.
 template <size_t kCount>
 inline char* WriteDigits(char* at, uint32_t value) {
   if constexpr (kCount == 1) {
     *at = static_cast<char>('0' + value % 10);
+  } else if constexpr (kCount >= 8) {
+    WriteEightDigits(at + kCount - 8, value % 100000000);
+    WriteDigits<kCount - 8>(at, value / 100000000);
   } else if constexpr (kCount >= 2) {
     WriteDigitPair(at + kCount - 2, value % 100);
     WriteDigits<kCount - 2>(at, value / 100);
@@ -78,18 +94,13 @@ inline char* WriteDigits(char* at, uint32_t value) {
   return at + kCount;
 }
 
-// Writes a number below 100000 without leading zeros; returns the place behind. Unrolled, for
-// most numbers of the wire are that short.
-inline char* WriteShortNumber(char* at, uint32_t value) {
-  if (value < 10) return WriteDigits<1>(at, value);
-  if (value < 100) return WriteDigits<2>(at, value);
-  if (value < 1000) return WriteDigits<3>(at, value);
-  return value < 10000 ? WriteDigits<4>(at, value) : WriteDigits<5>(at, value);
-}
-
 // Number of characters of `value` as printf's "%0<width>d" prints it (width 0: plain "%d"): the
 // sign counts as one character of the width and stands before the zeros.
 __attribute__((noinline)) size_t DecimalSize(int64_t value, size_t width);
+
+// Writes a plain number at `at`; returns the place behind. The short ones, which are most of the
+// wire's, cost least.
+__attribute__((noinline)) char* WriteNumber(char* at, int64_t value);
 
 // Writes that many characters at `at`; returns the place behind them.
 __attribute__((noinline)) char* WriteDecimal(char* at, int64_t value, size_t width);

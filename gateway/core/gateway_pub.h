@@ -9,6 +9,7 @@
 
 #include "gateway/core/list_frame.h"
 #include "gateway/core/reply_reader.h"
+#include "gateway/core/request_head.h"
 #include "gateway/core/result_text.h"
 #include "gateway/core/text_writer.h"
 
@@ -168,34 +169,16 @@ class CGatewayPub {
   int32_t m_nMarket;
   int32_t m_nPlatform;
   int32_t m_nSeqNo;
-  char m_szSerialNo[20];  // no terminator when full
-  char m_szLocalIP[64];   // no terminator when full
+  char m_szSerialNo[kSerialNoSize];  // no terminator when full
+  char m_szLocalIP[kLocalIPSize];    // no terminator when full
 
  protected:
-  // The three order headers: what each sends is in order_head.cpp.
-  enum class OrderHead { kPlain, kSigned, kBrief };
-
-  // What every order header is made of; `rocDate` is sent by kPlain alone.
-  struct OrderOrigin {
-    char function;
-    const char* branch;
-    const char* identity;
-    const char* password;
-    const char* rocDate;
-  };
-
-  // The local time of one call and the request id made of it.
-  struct Stamp {
-    int year, month, day, hour, minute, second;
-    int requestId;  // HHMMSS and the sequence number modulo 100, eight digits
-  };
-
   // The public headers at work. False leaves a message alone in `line`; an overflow is no failure
-  // here, Finish tells it.
+  // here, Finish tells it. `key` is filled unless there is no address.
   bool WriteQueryHead(CTextWriter& line, const char* branch, const char* identity,
                       const char* password);
-  bool WriteOrderHead(OrderHead head, const OrderOrigin& origin, CTextWriter& line,
-                      CTextWriter& key);
+  bool WriteOrderHead(OrderHead head, char function, const OrderOrigin& origin, CTextWriter& line,
+                      OrderKey& key);
 
   // An empty request in m_szBuffer.
   CTextWriter StartRequest() { return CTextWriter(m_szBuffer, sizeof m_szBuffer); }
@@ -235,20 +218,21 @@ class CGatewayPub {
   void LogReply(const char* name, std::string_view reply);
 
  private:
-  // Room for a full serial number with the address run onto it.
-  using SerialScratch = char[sizeof(m_szSerialNo) + sizeof(m_szLocalIP)];
+  // Of the texts in m_szSerialNo and m_szLocalIP: kept by their setters, for a look at a field that
+  // was just written would wait for it.
+  size_t m_nSerialNoLen;
+  size_t m_nLocalIPLen;
 
   // Reads the clock and reduces m_nSeqNo modulo 100.
-  Stamp TakeStamp();
-  std::string_view SerialNo(SerialScratch& scratch) const;
+  void TakeStamp(Stamp& stamp);
+  std::string_view SerialNo(std::string_view address, SerialScratch& scratch) const;
   std::string_view LocalIP() const;
   std::string_view PlatformName() const;
-  std::string_view RequestKind() const;
+  char RequestKind() const;
 
-  void WriteOrderKey(OrderHead head, const OrderOrigin& origin, std::string_view first,
-                     std::string_view second, const Stamp& stamp, CTextWriter& key) const;
-  void WriteOrderOrigin(OrderHead head, const OrderOrigin& origin, const Stamp& stamp,
-                        CTextWriter& line) const;
+  int WritePublicHead(OrderHead head, char function, const OrderOrigin& origin, char* out,
+                      char* orderKey);
+  void WriteOrderOrigin(const OrderKey& key, CTextWriter& line) const;
   static void WriteStamps(CTextWriter& line, const Stamp& stamp);
 
   char* EncodeAccountQuery(const char* branch, const char* identity, const char* password,

@@ -14,10 +14,13 @@ constexpr std::string_view kPlatformNames[] = {
     kNoEdition, kNoEdition, kNoEdition, kNoEdition, kNoEdition, "QVPHONE", kNoEdition, "QVTAB",
     kNoEdition, "QVLITE",   "QVPRO",    "QVFUTURE", "QVOPTION", "QVWATCH", "QVPRO"};
 
-// Keeps at most `size` characters; a field that they fill has no terminator.
-void SetField(char* field, size_t size, const char* text) {
-  memset(field, 0, size);
-  if (text != nullptr) memcpy(field, text, strnlen(text, size));
+// Keeps at most as many characters as the field has; one that they fill has no terminator.
+template <size_t kSize>
+size_t SetField(char (&field)[kSize], const char* text) {
+  memset(field, 0, kSize);
+  const size_t size = text == nullptr ? 0 : strnlen(text, kSize);
+  CopyShort(field, text, size);
+  return size;
 }
 
 }  // namespace
@@ -35,11 +38,11 @@ CGatewayPub::~CGatewayPub() {
 }
 
 void CGatewayPub::setSerialNumber(const char* serial) {
-  SetField(m_szSerialNo, sizeof m_szSerialNo, serial);
+  m_nSerialNoLen = SetField(m_szSerialNo, serial);
 }
 
 void CGatewayPub::setLocalIP(const char* ip) {
-  SetField(m_szLocalIP, sizeof m_szLocalIP, ip);
+  m_nLocalIPLen = SetField(m_szLocalIP, ip);
 }
 
 void CGatewayPub::debuglog(const char* text) {
@@ -47,17 +50,15 @@ void CGatewayPub::debuglog(const char* text) {
 }
 
 std::string_view CGatewayPub::LocalIP() const {
-  return {m_szLocalIP, strnlen(m_szLocalIP, sizeof m_szLocalIP)};
+  return {m_szLocalIP, m_nLocalIPLen};
 }
 
 // A full serial number has no terminator, so the gateway knows it with the address run onto it.
-std::string_view CGatewayPub::SerialNo(SerialScratch& scratch) const {
-  const size_t size = strnlen(m_szSerialNo, sizeof m_szSerialNo);
-  if (size < sizeof m_szSerialNo) return {m_szSerialNo, size};
-  const std::string_view address = LocalIP();
-  memcpy(scratch, m_szSerialNo, size);
-  memcpy(scratch + size, address.data(), address.size());
-  return {scratch, size + address.size()};
+std::string_view CGatewayPub::SerialNo(std::string_view address, SerialScratch& scratch) const {
+  if (m_nSerialNoLen < sizeof m_szSerialNo) return {m_szSerialNo, m_nSerialNoLen};
+  memcpy(scratch, m_szSerialNo, sizeof m_szSerialNo);
+  memcpy(scratch + sizeof m_szSerialNo, address.data(), address.size());
+  return {scratch, sizeof m_szSerialNo + address.size()};
 }
 
 std::string_view CGatewayPub::PlatformName() const {
@@ -66,23 +67,20 @@ std::string_view CGatewayPub::PlatformName() const {
 }
 
 // Securities or futures; the host's number is compared unsigned, so a negative one means futures.
-std::string_view CGatewayPub::RequestKind() const {
-  return static_cast<uint32_t>(m_nMarket) <= 100 ? "S" : "F";
+char CGatewayPub::RequestKind() const {
+  return static_cast<uint32_t>(m_nMarket) <= 100 ? 'S' : 'F';
 }
 
-CGatewayPub::Stamp CGatewayPub::TakeStamp() {
+void CGatewayPub::TakeStamp(Stamp& stamp) {
   const time_t now = time(nullptr);
-  struct tm local = {};
-  localtime_r(&now, &local);
+  struct tm local;
+  if (localtime_r(&now, &local) == nullptr) local = {};
   const uint32_t sequence = static_cast<uint32_t>(m_nSeqNo) % 100;
   m_nSeqNo = static_cast<int32_t>(sequence);
   const auto clock =
       static_cast<uint32_t>(local.tm_hour * 10000 + local.tm_min * 100 + local.tm_sec);
-  return {local.tm_year + 1900,
-          local.tm_mon + 1,
-          local.tm_mday,
-          local.tm_hour,
-          local.tm_min,
-          local.tm_sec,
-          static_cast<int>((clock * 100 + sequence) % 100000000)};
+  stamp.year = WrapAdd(local.tm_year, 1900);
+  stamp.month = local.tm_mon + 1;
+  stamp.day = local.tm_mday;
+  WriteEightDigits(stamp.requestId.chars, clock * 100 + sequence);
 }

@@ -8,7 +8,7 @@
 #include "gateway/core/messages.h"
 #include "gateway/core/text_writer.h"
 
-inline constexpr int kProtocolVersion = 24369;
+inline constexpr std::string_view kProtocolVersion = "24369";
 
 // Buffer of one part of an identity field; a longer part is dropped.
 inline constexpr size_t kIdentityPartSize = 40;

@@ -47,7 +47,8 @@ int CGatewayPub::initQueryHead(const char* branch, const char* identity, const c
 
 bool CGatewayPub::WriteQueryHead(CTextWriter& line, const char* branch, const char* identity,
                                  const char* password) {
-  const Stamp stamp = TakeStamp();
+  Stamp stamp;
+  TakeStamp(stamp);
   char first[kIdentityPartSize] = "";
   char second[kIdentityPartSize] = "";
   if (!AsText(identity).empty() &&
@@ -57,15 +58,16 @@ bool CGatewayPub::WriteQueryHead(CTextWriter& line, const char* branch, const ch
   }
   debuglog(first);
   debuglog(second);
-  if (LocalIP().empty()) {
+  const std::string_view address = LocalIP();
+  if (address.empty()) {
     line.Replace(kNoAddress);
     return false;
   }
 
   SerialScratch scratch;
-  line.Append(WIRE("F=7|KIND=%s|BHNO=%s|CB=1|IP=%s"), RequestKind(), branch, LocalIP());
-  line.Append(WIRE("|11=%s|VER=%d"), PlatformName(), kProtocolVersion);
-  line.Append(WIRE("|65=%010d|SN=%s|"), stamp.requestId, SerialNo(scratch));
+  line.Append(WIRE("F=7|KIND=%c|BHNO=%s|CB=1|IP=%s|11=%s|VER=%s|65=00%s|SN=%s|"), RequestKind(),
+              branch, address, PlatformName(), kProtocolVersion, stamp.requestId,
+              SerialNo(address, scratch));
   if (first[0] == '\0') return true;
   if (!WriteIdentity(line, first, second, password)) {
     line.Replace(kIdentityLengths);

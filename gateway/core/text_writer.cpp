@@ -1,6 +1,17 @@
 #include "gateway/core/text_writer.h"
 
-#include <algorithm>
+namespace {
+
+size_t CountBlanks(const char* at, const char* end) {
+  size_t blanks = 0;
+  for (;; ++blanks) {
+    at = static_cast<const char*>(memchr(at, ' ', static_cast<size_t>(end - at)));
+    if (at == nullptr) return blanks;
+    ++at;
+  }
+}
+
+}  // namespace
 
 CTextWriter CTextWriter::Continue(char* buffer, size_t size) {
   CTextWriter writer(buffer, size);
@@ -16,21 +27,22 @@ void CTextWriter::Replace(std::string_view text) {
 }
 
 void CTextWriter::EscapeBlanks() {
-  const auto blanks = static_cast<size_t>(std::count(m_pBegin, m_pAt, ' '));
-  if (blanks == 0) return;
+  const size_t blanks = CountBlanks(m_pBegin, m_pAt);
   if (static_cast<size_t>(m_pEnd - m_pAt) < 2 * blanks) {
     MakeRoom(2 * blanks);
     return;
   }
-  const char* from = m_pAt;
+  const char* end = m_pAt;
   m_pAt += 2 * blanks;
-  for (char* to = m_pAt; from != to;) {  // from the end, so that nothing is overwritten unread
-    if (*--from == ' ') {
-      to -= 3;
-      memcpy(to, "%20", 3);
-    } else {
-      *--to = *from;
-    }
+  for (char* to = m_pAt; to != end;) {  // from the end, so that nothing is overwritten unread
+    const auto* const blank =
+        static_cast<const char*>(memrchr(m_pBegin, ' ', static_cast<size_t>(end - m_pBegin)));
+    const auto size = static_cast<size_t>(end - blank) - 1;
+    to -= size;
+    memmove(to, blank + 1, size);
+    to -= 3;
+    memcpy(to, "%20", 3);
+    end = blank;
   }
 }
 

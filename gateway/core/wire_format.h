@@ -1,7 +1,8 @@
 // The wire's own format texts, read by the compiler: a wrong value type does not build, and at run
 // time nothing is interpreted.
 //
-// Marks: "%s" (a C text, null read as empty, or a std::string_view), "%c" (char), "%d" (int),
+// Marks: "%s" (a C text, null read as empty, a std::string_view or a FixedText), "%c" (char), "%d"
+// (int),
 // "%ld" (any integer) and the zero-padded "%0Nd" (int).
 #ifndef QUORVANE_GATEWAY_CORE_WIRE_FORMAT_H_
 #define QUORVANE_GATEWAY_CORE_WIRE_FORMAT_H_

@@ -23,10 +23,18 @@ inline std::string_view AsText(std::string_view text) {
   return text;
 }
 
+// What a condition nearly always is, so that the usual way through the code runs straight on.
+constexpr bool Mostly(bool condition) {
+  return __builtin_expect(condition, true);
+}
+constexpr bool Rarely(bool condition) {
+  return __builtin_expect(condition, false);
+}
+
 // Copies `size` bytes. Most values of a line are a few characters long, so that two overlapping
 // moves cost less than a call.
 inline void CopyShort(char* to, const char* from, size_t size) {
-  if (size > 16) {
+  if (Rarely(size > 16)) {
     memcpy(to, from, size);
   } else if (size >= 8) {
     uint64_t head, tail;
@@ -34,7 +42,7 @@ inline void CopyShort(char* to, const char* from, size_t size) {
     memcpy(&tail, from + size - 8, 8);
     memcpy(to, &head, 8);
     memcpy(to + size - 8, &tail, 8);
-  } else if (size >= 4) {
+  } else if (Mostly(size >= 4)) {
     uint32_t head, tail;
     memcpy(&head, from, 4);
     memcpy(&tail, from + size - 4, 4);
@@ -57,6 +65,19 @@ struct TextValue {
   char* WriteTo(char* at) const {
     CopyShort(at, text.data(), text.size());
     return at + text.size();
+  }
+};
+
+// A text whose size the compiler knows.
+template <size_t kSize>
+struct FixedText {
+  char chars[kSize];
+
+  static size_t Bound() { return kSize; }
+  static size_t Size() { return kSize; }
+  char* WriteTo(char* at) const {
+    memcpy(at, chars, kSize);
+    return at + kSize;
   }
 };
 
@@ -85,10 +106,10 @@ struct NumberValue {
   size_t Size() const { return DecimalSize(number, kWidth); }
   char* WriteTo(char* at) const {
     if constexpr (kWidth == 0) {
-      if (number >= 0 && number < 100000)
-        return WriteShortNumber(at, static_cast<uint32_t>(number));
+      if (number >= 0 && number < 10) return WriteDigits<1>(at, static_cast<uint32_t>(number));
+      return WriteNumber(at, number);
     } else {
-      if (number >= 0 && static_cast<uint64_t>(number) < kEnd) {
+      if (Mostly(number >= 0 && static_cast<uint64_t>(number) < kEnd)) {
         return WriteDigits<kWidth>(at, static_cast<uint32_t>(number));
       }
     }
@@ -106,11 +127,22 @@ struct PaddedValue {
   char* WriteTo(char* at) const { return WriteDecimal(at, number, width); }
 };
 
+inline TextValue MakeTextValue(std::string_view text) {
+  return {text};
+}
+inline TextValue MakeTextValue(const char* text) {
+  return {AsText(text)};
+}
+template <size_t kSize>
+const FixedText<kSize>& MakeTextValue(const FixedText<kSize>& text) {
+  return text;
+}
+
 // The value that a mark of this kind and width prints.
 template <char kKind, size_t kWidth, class Value>
 auto MakeWireValue(const Value& value) {
   if constexpr (kKind == 's') {
-    return TextValue{AsText(value)};
+    return MakeTextValue(value);
   } else if constexpr (kKind == 'c') {
     static_assert(std::is_same_v<Value, char>, "%c takes a char");
     return CharValue{value};
@@ -163,7 +195,7 @@ class CWireText {
 
   template <class Value>
   void AppendValue(const Value& value) {
-    if (Has(value.Bound()) || Has(value.Size()) || MakeRoom(value.Size())) {
+    if (Mostly(Has(value.Bound())) || Has(value.Size()) || MakeRoom(value.Size())) {
       m_pAt = value.WriteTo(m_pAt);
     }
   }
@@ -180,7 +212,7 @@ class CWireText {
   // a register.
   template <class Format, size_t... kAt, class... Values>
   void AppendPiece(const Values&... values) {
-    if (!Has((kWirePlan<Format>.literalChars + ... + values.Bound())) &&
+    if (Rarely(!Has((kWirePlan<Format>.literalChars + ... + values.Bound()))) &&
         !MakeRoomFor<Format, kAt...>(values...)) {
       return;
     }
@@ -190,7 +222,7 @@ class CWireText {
   }
 
   template <class Format, size_t... kAt, class... Values>
-  __attribute__((noinline)) bool MakeRoomFor(const Values&... values) {
+  __attribute__((noinline)) bool MakeRoomFor(Values... values) {
     size_t size = 0;
     if ((CountMark<Format, kAt>(size, values) && ...)) {
       size += kWirePlan<Format>.marks[sizeof...(kAt)].literalSize;
@@ -211,7 +243,7 @@ class CWireText {
   template <class Format, size_t kAt, class Value>
   static bool WriteMark(char*& at, const Value& value) {
     WriteLiteral<Format, kAt>(at);
-    if (EndsPiece(value)) return false;
+    if (Rarely(EndsPiece(value))) return false;
     at = value.WriteTo(at);
     return true;
   }

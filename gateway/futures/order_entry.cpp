@@ -231,11 +231,13 @@ char* CGatewayFut::EncodeOrder(OrderHead head, const OrderOrigin& origin, const 
                                int* status) {
   *status = 1;
   CTextWriter line = StartRequest();
-  CTextWriter signature(m_szSignature, sizeof m_szSignature);
-  if (!WriteOrderHead(head, origin, line, signature)) {
+  OrderKey key;
+  if (!WriteOrderHead(head, order.function, origin, line, key)) {
     *status = -1;
     return line.Text();
   }
+  CTextWriter signature(m_szSignature, sizeof m_szSignature);
+  key.AppendTo(signature);
   Sign* const sign = head == OrderHead::kPlain ? SignPlain : SignInPlaces;
   if (WriteRecord(*this, order, sign, line, signature)) {
     line.Append(WIRE("|N6=%d"), int{order.n6});
@@ -256,7 +258,8 @@ char* CGatewayFut::SubmitOrderEncode(const char* branch, const char* identity, c
                                      const char* callPut2, char n6, char orderKind, char priceType,
                                      char function, char w3, char timeInForce, char, char side1,
                                      char side2, int quantity, int, int price, int* status) {
-  return EncodeOrder(OrderHead::kPlain, {function, branch, identity, password, orderDate},
+  return EncodeOrder(OrderHead::kPlain,
+                     {AsText(branch), AsText(identity), AsText(password), AsText(orderDate)},
                      NameOrder(reference, commodity1, commodity2, month1, month2, strike1, strike2,
                                callPut1, callPut2, n6, orderKind, priceType, function, w3,
                                timeInForce, side1, side2, quantity, price),
@@ -269,7 +272,8 @@ char* CGatewayFut::SubmitOrderEncode1(
     const char* month2, const char* strike1, const char* strike2, const char* callPut1,
     const char* callPut2, char n6, char orderKind, char priceType, char function, char w3,
     char timeInForce, char, char side1, char side2, int quantity, int, int price, int* status) {
-  return EncodeOrder(OrderHead::kSigned, {function, branch, identity, password, orderDate},
+  return EncodeOrder(OrderHead::kSigned,
+                     {AsText(branch), AsText(identity), AsText(password), AsText(orderDate)},
                      NameOrder(reference, commodity1, commodity2, month1, month2, strike1, strike2,
                                callPut1, callPut2, n6, orderKind, priceType, function, w3,
                                timeInForce, side1, side2, quantity, price),

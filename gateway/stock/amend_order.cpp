@@ -36,7 +36,7 @@ struct Reference {
 };
 
 Reference SplitReference(const StockOrder& order) {
-  std::string_view rest = AsText(order.reference);
+  std::string_view rest = order.reference;
   const std::string_view first = Bounded(TakePiece(rest, '&'), kReferenceSize);
   return {first, Bounded(TakePiece(rest, '&'), kReferenceSize)};
 }
@@ -46,24 +46,26 @@ Reference SplitReference(const StockOrder& order) {
 template <class Format, class... Rest>
 void WriteBody(CTextWriter& line, Format format, const StockOrder& order,
                const Reference& reference, const Rest&... rest) {
-  line.Append(format, RocToWesternDate(AsText(order.date)), reference.order, reference.gateway,
+  line.Append(format, RocToWesternDate(order.origin.rocDate), reference.order, reference.gateway,
               order.tradeType, order.stockCode, SentPrice(order), order.side, rest...);
 }
 
 // Sends no quantity, and lots of 1000 whatever the order says.
-void WriteCancel(CTextWriter& line, const StockOrder& order, std::string_view key) {
+void WriteCancel(CTextWriter& line, const StockOrder& order, const OrderKey& key) {
   const Reference reference = SplitReference(order);
   WriteBody(line, WIRE("|10=%08d|36=%s|46=%s|28=%d|29=%s|31=%d|32=%c|N6=%d|27=%d|UT=1000|13=%c"),
             order, reference, order.n6, order.kind, order.flag13);
-  line.Append(WIRE("!!%s_%s_%c_%s__"), key, reference.order, order.side, order.stockCode);
+  key.OpenPayload(line);
+  line.Append(WIRE("_%s_%c_%s__"), reference.order, order.side, order.stockCode);
 }
 
-void WriteChange(CTextWriter& line, const StockOrder& order, std::string_view key) {
+void WriteChange(CTextWriter& line, const StockOrder& order, const OrderKey& key) {
   const Reference reference = SplitReference(order);
   WriteBody(line,
             WIRE("|10=%08d|36=%s|46=%s|28=%d|29=%s|31=%d|32=%c|37=%d|N6=%d|27=%d|UT=%d|13=%c"),
             order, reference, SentQuantity(order), order.n6, order.kind, order.unit, order.flag13);
-  line.Append(WIRE("!!%s_%s_%c_%s_%d_"), key, reference.order, order.side, order.stockCode,
+  key.OpenPayload(line);
+  line.Append(WIRE("_%s_%c_%s_%d_"), reference.order, order.side, order.stockCode,
               SentQuantity(order));
 }
 
@@ -74,24 +76,26 @@ void WriteTaggedBody(CTextWriter& line, const StockOrder& order, const Reference
 
 // In tag PL the columns of order kind, price kind and price stay empty, for a cancellation the
 // quantity's, too.
-void WriteTaggedCancel(CTextWriter& line, const StockOrder& order, std::string_view key) {
+void WriteTaggedCancel(CTextWriter& line, const StockOrder& order, const OrderKey& key) {
   const Reference reference = SplitReference(order);
   WriteTaggedBody(line, order, reference);
-  line.Append(WIRE("|PL=S!!%s,%c,%s,,%d,,,,%s"), key, order.side, order.stockCode, order.tradeType,
+  key.OpenPayload(line);
+  line.Append(WIRE(",%c,%s,,%d,,,,%s"), order.side, order.stockCode, order.tradeType,
               reference.order);
 }
 
-void WriteTaggedChange(CTextWriter& line, const StockOrder& order, std::string_view key) {
+void WriteTaggedChange(CTextWriter& line, const StockOrder& order, const OrderKey& key) {
   const Reference reference = SplitReference(order);
   WriteTaggedBody(line, order, reference);
-  line.Append(WIRE("|PL=S!!%s,%c,%s,,%d,,%d,,%s"), key, order.side, order.stockCode,
-              order.tradeType, SentQuantity(order), reference.order);
+  key.OpenPayload(line);
+  line.Append(WIRE(",%c,%s,,%d,,%d,,%s"), order.side, order.stockCode, order.tradeType,
+              SentQuantity(order), reference.order);
 }
 
-constexpr OrderForm kCancel = {'D', Payload::kBare, FindFault, WriteCancel};
-constexpr OrderForm kTaggedCancel = {'D', Payload::kTagged, FindFaultTagged, WriteTaggedCancel};
-constexpr OrderForm kChange = {'C', Payload::kBare, FindFault, WriteChange};
-constexpr OrderForm kTaggedChange = {'C', Payload::kTagged, FindFaultTagged, WriteTaggedChange};
+constexpr OrderForm kCancel = {'D', OrderHead::kPlain, FindFault, WriteCancel};
+constexpr OrderForm kTaggedCancel = {'D', OrderHead::kSigned, FindFaultTagged, WriteTaggedCancel};
+constexpr OrderForm kChange = {'C', OrderHead::kPlain, FindFault, WriteChange};
+constexpr OrderForm kTaggedChange = {'C', OrderHead::kSigned, FindFaultTagged, WriteTaggedChange};
 
 }  // namespace
 

@@ -43,32 +43,34 @@ void WriteBody(CTextWriter& line, const StockOrder& order) {
 }
 
 // Names one value for the price: the limit, the price kind or the trade type, whichever decides.
-void WriteBare(CTextWriter& line, const StockOrder& order, std::string_view key) {
+void WriteBare(CTextWriter& line, const StockOrder& order, const OrderKey& key) {
   WriteBody(line, order);
+  key.OpenPayload(line);
   if (HasLimit(order)) {
-    line.Append(WIRE("!!%s_%c_%s_%d_%d.%02d"), key, order.side, order.stockCode,
-                SentQuantity(order), Whole(order), Hundredths(order));
+    line.Append(WIRE("_%c_%s_%d_%d.%02d"), order.side, order.stockCode, SentQuantity(order),
+                Whole(order), Hundredths(order));
   } else {
-    line.Append(WIRE("!!%s_%c_%s_%d_%d"), key, order.side, order.stockCode, SentQuantity(order),
+    line.Append(WIRE("_%c_%s_%d_%d"), order.side, order.stockCode, SentQuantity(order),
                 order.tradeType == kFixedPrice ? order.tradeType : order.priceKind);
   }
 }
 
 // Names them all, with 0 for the price where no limit applies.
-void WriteTagged(CTextWriter& line, const StockOrder& order, std::string_view key) {
+void WriteTagged(CTextWriter& line, const StockOrder& order, const OrderKey& key) {
   WriteBody(line, order);
+  key.OpenPayload(line);
   if (HasLimit(order)) {
-    line.Append(WIRE("|PL=S!!%s,%c,%s,%d,%d,%d,%d,%d.%02d,"), key, order.side, order.stockCode,
-                order.kind, order.tradeType, order.priceKind, SentQuantity(order), Whole(order),
+    line.Append(WIRE(",%c,%s,%d,%d,%d,%d,%d.%02d,"), order.side, order.stockCode, order.kind,
+                order.tradeType, order.priceKind, SentQuantity(order), Whole(order),
                 Hundredths(order));
   } else {
-    line.Append(WIRE("|PL=S!!%s,%c,%s,%d,%d,%d,%d,0,"), key, order.side, order.stockCode,
-                order.kind, order.tradeType, order.priceKind, SentQuantity(order));
+    line.Append(WIRE(",%c,%s,%d,%d,%d,%d,0,"), order.side, order.stockCode, order.kind,
+                order.tradeType, order.priceKind, SentQuantity(order));
   }
 }
 
-constexpr OrderForm kBareOrder = {'I', Payload::kBare, FindFault, WriteBare};
-constexpr OrderForm kTaggedOrder = {'I', Payload::kTagged, FindFault, WriteTagged};
+constexpr OrderForm kBareOrder = {'I', OrderHead::kPlain, FindFault, WriteBare};
+constexpr OrderForm kTaggedOrder = {'I', OrderHead::kSigned, FindFault, WriteTagged};
 
 }  // namespace
 

@@ -6,18 +6,14 @@
 char* CGatewayStk::EncodeOrder(const OrderForm& form, const StockOrder& order, int* status) {
   *status = 1;
   CTextWriter line = StartRequest();
-  char scratch[kBufferSize];
-  CTextWriter key(scratch, sizeof scratch);
-  const OrderHead head = form.payload == Payload::kBare ? OrderHead::kPlain : OrderHead::kSigned;
-  const OrderOrigin origin = {form.function, order.branch, order.identity, order.password,
-                              order.date};
-  if (!WriteOrderHead(head, origin, line, key)) {
+  OrderKey key;
+  if (!WriteOrderHead(form.head, form.function, order.origin, line, key)) {
     *status = -1;
     return line.Text();
   }
   const char* const fault = form.fault(order);
   if (fault != nullptr) return Fail(line, status, fault);
-  form.write(line, order, {scratch, key.Length()});
+  form.write(line, order, key);
   return Finish(line, status, kBadParameters);
 }
 
@@ -25,10 +21,9 @@ char* CGatewayStk::EncodeOrder(const OrderForm& form, const StockOrder& order, i
 char* CGatewayStk::SubmitOrderEncode2(const char* branch, const char* identity,
                                       const char* password, char function, char tradeType) {
   CTextWriter line = StartRequest();
-  char scratch[1];
-  CTextWriter unusedKey(scratch, sizeof scratch);
-  const OrderOrigin origin = {function, branch, identity, password, nullptr};
-  WriteOrderHead(OrderHead::kBrief, origin, line, unusedKey);
+  OrderKey unusedKey;
+  const OrderOrigin origin = {AsText(branch), AsText(identity), AsText(password), {}};
+  WriteOrderHead(OrderHead::kBrief, function, origin, line, unusedKey);
   line.Append(WIRE("|28=%d"), StockOrder::NumberOf(tradeType));
   int unusedStatus = 1;
   return Finish(line, &unusedStatus, kBadParameters);

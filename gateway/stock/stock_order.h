@@ -3,7 +3,7 @@
 #define QUORVANE_GATEWAY_STOCK_STOCK_ORDER_H_
 
 #include "gateway/core/number_set.h"
-#include "gateway/core/text_writer.h"
+#include "gateway/core/request_head.h"
 #include "gateway/stock/messages.h"
 
 // The arguments of one order by name. The host's bytes are unsigned numbers, but for the two that
@@ -13,12 +13,9 @@ struct StockOrder {
              const char* hostStockCode, const char* hostDate, const char* hostReference,
              long hostQuantity, long hostUnit, long hostPrice, char hostSide, char hostFlag13,
              char hostKind, char hostPriceKind, char hostTradeType, char hostN6)
-      : branch(hostBranch),
-        identity(hostIdentity),
-        password(hostPassword),
-        stockCode(hostStockCode),
-        date(hostDate),
-        reference(hostReference),
+      : origin{AsText(hostBranch), AsText(hostIdentity), AsText(hostPassword), AsText(hostDate)},
+        stockCode(AsText(hostStockCode)),
+        reference(AsText(hostReference)),
         quantity(static_cast<int>(hostQuantity)),
         unit(static_cast<int>(hostUnit)),
         price(static_cast<int>(hostPrice)),
@@ -32,15 +29,12 @@ struct StockOrder {
   // The number of a host's byte.
   static int NumberOf(char byte) { return static_cast<unsigned char>(byte); }
 
-  const char* branch;
-  const char* identity;
-  const char* password;
-  const char* stockCode;
-  const char* date;       // Republic of China calendar, or empty
-  const char* reference;  // the order to cancel or change; null in a new order
-  int quantity;           // lots, or shares of an odd lot
-  int unit;               // shares per lot
-  int price;              // hundredths
+  OrderOrigin origin;
+  std::string_view stockCode;
+  std::string_view reference;  // the order to cancel or change; empty in a new order
+  int quantity;                // lots, or shares of an odd lot
+  int unit;                    // shares per lot
+  int price;                   // hundredths
   char side;
   char flag13;
   int kind;
@@ -71,20 +65,17 @@ inline int SentPrice(const StockOrder& order) {
 }
 
 inline bool IsStockCodeTooLong(const StockOrder& order) {
-  return AsText(order.stockCode).size() > kStockCodeChars;
+  return order.stockCode.size() > kStockCodeChars;
 }
 
-// Where the signature payload goes: bare behind the last field, or into tag PL. Each has its order
-// header, whose order key opens the payload.
-enum class Payload { kBare, kTagged };
-
-// What one encoder sends. `fault` tells what keeps an order from being sent, null for nothing;
-// `write` appends body and payload to the header.
+// What one encoder sends: behind the plain header a bare payload, behind the signed one a payload
+// in tag PL. `fault` tells what keeps an order from being sent, null for nothing; `write` appends
+// body and payload to the header.
 struct OrderForm {
   char function;
-  Payload payload;
+  OrderHead head;
   const char* (*fault)(const StockOrder& order);
-  void (*write)(CTextWriter& line, const StockOrder& order, std::string_view key);
+  void (*write)(CTextWriter& line, const StockOrder& order, const OrderKey& key);
 };
 
 #endif  // QUORVANE_GATEWAY_STOCK_STOCK_ORDER_H_

@@ -145,6 +145,16 @@ TEST(Decimal, GeneratedNumbersArePrintedAsTheCLibraryPrintsThem) {
   }
 }
 
+TEST(Decimal, EightDigitsArePrintedAsTheCLibraryPrintsThem) {
+  for (uint32_t value = 0; value < 100000000; value += value < 120000 ? 1 : 997) {
+    char expected[12];
+    char digits[8];
+    snprintf(expected, sizeof expected, "%08u", value);
+    WriteEightDigits(digits, value);
+    ASSERT_EQ(std::string_view(digits, sizeof digits), expected);
+  }
+}
+
 TEST(Decimal, PowersOfTenSaturate) {
   int64_t power = 1;
   for (int exponent = 0; exponent <= 18; ++exponent, power = exponent <= 18 ? power * 10 : power) {

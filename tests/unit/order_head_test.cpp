@@ -256,6 +256,12 @@ TEST_F(OrderHead, StampsAreTheLocalDateAndTime) {
   EXPECT_EQ(m_key, "SN0001,10.0.0.1,20310902,9A00-1234567,1234567,I");
 }
 
+TEST_F(OrderHead, ClockBeyondTheCalendarIsNoDate) {
+  SetClock(INT64_MAX);
+  EXPECT_EQ(Write(0, "1234567"), 1);
+  EXPECT_NE(m_text.find("|21=19000100|22=000000|23=00000007|24=5|V4="), std::string::npos);
+}
+
 TEST_F(OrderHead, SequenceNumberIsReducedAndStoredBack) {
   for (int variant : {0, 1, 2}) {
     m_gateway.m_nSeqNo = -1;

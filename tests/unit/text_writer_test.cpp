@@ -118,8 +118,9 @@ TEST(TextWriter, PiecesArePrintedByTheirFormats) {
   line.writer.Append(WIRE("%c%c"), 'a', '\xE5');
   line.writer.Append(WIRE("|%d|%07d|%02d|%ld"), -5, 42, -7, int64_t{INT64_MIN});
   line.writer.Append(WIRE("plain"));
+  line.writer.Append(WIRE("|%s"), FixedText<3>{{'1', '2', '3'}});
   EXPECT_STREQ(line.writer.Text(),
-               "F=7|KIND=S|BHNO=9A00||a\xE5|-5|0000042|-7|-9223372036854775808plain");
+               "F=7|KIND=S|BHNO=9A00||a\xE5|-5|0000042|-7|-9223372036854775808plain|123");
 }
 
 // Joined as C text: the rest of that piece is lost, the next one follows directly.
