@@ -247,7 +247,7 @@ char* CGatewayFut::QueryOrderDecode(const char* reply, int* status) {
   const std::string_view text = AsText(reply);
   if (text.empty()) return Fail(kNoReply, status);
   CReplyList orders(text, kTags, kShape);
-  if (orders.Verdict() == ListVerdict::kRefused && orders.Code().empty()) return Fail("", status);
+  if (orders.Code().empty()) return Fail("", status);
   if (char* const answer = AnswerWithoutData(orders, "0!", status)) return answer;
 
   CResultText list({m_pData, m_nDataSize, m_nDataLen}, text.size());

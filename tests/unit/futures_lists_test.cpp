@@ -318,6 +318,11 @@ TEST_F(FuturesList, MarginAmountsOf64BitsAndBelowZero) {
   EXPECT_EQ(Part(Margin("|00=1|LO=-12|01="), 2), "-1200");
 }
 
+TEST_F(FuturesList, MarginAmountsBesidesPN) {
+  EXPECT_EQ(Part(Margin("|00=1|RA=3&4|01="), 5), "30000");
+  EXPECT_EQ(Part(Margin("|00=1|RA=" + std::string(600, '0') + "5|01="), 5), "50000");
+}
+
 TEST_F(FuturesList, MarginPN) {
   const auto pn = [this](const std::string& value) {
     return Part(Margin("|00=1|PN=" + value + "|01="), 4);
