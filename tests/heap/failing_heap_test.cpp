@@ -74,6 +74,7 @@ TEST(FailingHeap, ListThatCannotGrowIsAnsweredByNothing) {
   const TAnswer whole = Play(golden, CFailingHeap::kNever, 0);
   EXPECT_EQ(whole.m_Outcome.m_Status, 1);
   EXPECT_EQ(whole.m_nRequests, 2U);
+  EXPECT_EQ(whole.m_nUnreleased, 0);
   for (const size_t nth : {1U, 2U}) {
     ExpectFailure(Play(golden, nth, nth), whole.m_Outcome, std::to_string(nth));
     ExpectFailure(Play(golden, nth, CFailingHeap::kNever), whole.m_Outcome,

@@ -323,10 +323,12 @@ TEST_F(OrderHead, HeaderThatFillsTheBufferIsWholeAndOneCharacterMoreFails) {
     arguments.password = longest.c_str();
     EXPECT_EQ(Write(variant, arguments), 1);
     EXPECT_EQ(m_text.size(), CGatewayPub::kBufferSize - 1);
+    EXPECT_EQ(m_lines, TLines{m_text});
     const std::string over = longest + "p";
     arguments.password = over.c_str();
     EXPECT_EQ(Write(variant, arguments), 0);
     EXPECT_EQ(m_text, kTooLong);
+    EXPECT_EQ(m_lines, TLines{});
   }
 }
 

@@ -334,6 +334,7 @@ TEST_F(QueryHead, HeaderThatFillsTheBufferIsWholeAndOneCharacterMoreFails) {
   EXPECT_EQ(m_lines.size(), 3U);
   EXPECT_EQ(Write("1234567&", "9A00", (longest + "p").c_str()), 0);
   EXPECT_EQ(m_text, kTooLong);
+  EXPECT_EQ(m_lines.size(), 2U);
   EXPECT_EQ(Write("&", std::string(65536, 'b').c_str(), ""), 0);
   EXPECT_EQ(m_text, kTooLong);
 }

@@ -84,6 +84,13 @@ TEST(ReplyReader, FieldsAreToldByTagsOfTwoAndThreeCharacters) {
   EXPECT_EQ(TagSize(MakeTagKey("751")), 4U);
 }
 
+TEST(ReplyReader, FieldThatEndsWithItsTagIsNotReadFurther) {
+  const std::string_view reply = "|39=5";
+  EXPECT_EQ(FindField(reply, "39", Blanks::kTaken), "5");
+  EXPECT_EQ(FindField(reply.substr(0, 4), "39", Blanks::kTaken), "");
+  EXPECT_EQ(FindField(reply.substr(0, 3), "39", Blanks::kTaken), "");
+}
+
 TEST(ReplyReader, FullTableFindsEachOfItsTagsAndNoOther) {
   std::string known;
   for (int row = 0; row < 32; ++row) {
