@@ -217,6 +217,29 @@ TEST_F(FuturesOrder, KindOneWithEmptyStrikeAndCallPutPassesAndKindTwoDoesNot) {
   EXPECT_EQ(Record(order), kParameterError);
 }
 
+// What a NUL character cuts off does not count against the room, however long it is.
+TEST_F(FuturesOrder, PieceThatANulEndsNeedsRoomForItsBeginningAlone) {
+  const std::string huge(CGatewayPub::kBufferSize, 'h');
+  for (const int kind : {2, 4}) {
+    for (const char timeInForce : {'R', '\0'}) {
+      TOrder order = OfKind(kind);
+      order.m_szCommodity1 = order.m_szStrike1 = huge.c_str();
+      order.m_chSide1 = '\0';
+      order.m_chTimeInForce = timeInForce;
+      const std::string body = Record(order);
+      EXPECT_EQ(m_nReturned, 1) << kind;
+      EXPECT_NE(body.find("|32=|O4="), std::string::npos) << kind;
+      EXPECT_EQ(m_payload, timeInForce == 'R' ? "!!KEY_R_" : "!!KEY_");
+    }
+  }
+  TOrder order = OfKind(4);
+  order.m_szCommodity2 = huge.c_str();
+  order.m_chSide2 = '\0';
+  const std::string body = Record(order);
+  EXPECT_EQ(m_nReturned, 1);
+  EXPECT_NE(body.find("|EL=|W3="), std::string::npos);
+}
+
 TEST_F(FuturesOrder, KindsBesidesTheFourAreRefused) {
   for (int kind = -128; kind <= 127; ++kind) {
     Record(OfKind(kind));
