@@ -187,5 +187,12 @@ TEST(Decimal, ArithmeticWraps) {
   EXPECT_EQ(WrapMultiply(int64_t{INT64_MIN}, int64_t{-1}), INT64_MIN);
 }
 
+TEST(Decimal, ShortNumbersHaveNoZerosBefore) {
+  for (int64_t number = 0; number <= 1200; ++number) {
+    char text[8];
+    EXPECT_EQ(std::string(text, WriteNumber(text, number)), std::to_string(number));
+  }
+}
+
 }  // namespace
 }  // namespace gateway_tests
