@@ -6,6 +6,8 @@
 #include <cstdint>
 #include <cstring>
 
+#include "gateway/core/branch_hints.h"
+
 #if defined(__SSE2__)
 #include <emmintrin.h>
 #elif defined(__aarch64__)
@@ -27,15 +29,13 @@ inline uint64_t BarsOfBlockPlainly(const char* block) {
 // vectors, and the comparison's result gathered one bit a byte.
 #if defined(__SSE2__)
 inline uint64_t BarsOfBlock(const char* block) {
-  const __m128i bar = _mm_set1_epi8('|');
-  uint64_t bars = 0;
-  for (size_t i = 0; i < kBarBlock; i += 16) {
+  const auto quarter = [block](size_t i) {
     __m128i bytes;
-    memcpy(&bytes, block + i, sizeof bytes);
-    const auto found = static_cast<uint32_t>(_mm_movemask_epi8(_mm_cmpeq_epi8(bytes, bar)));
-    bars |= static_cast<uint64_t>(found) << i;
-  }
-  return bars;
+    memcpy(&bytes, block + 16 * i, sizeof bytes);
+    const __m128i found = _mm_cmpeq_epi8(bytes, _mm_set1_epi8('|'));
+    return uint64_t{static_cast<uint32_t>(_mm_movemask_epi8(found))} << (16 * i);
+  };
+  return (quarter(0) | quarter(1)) | (quarter(2) | quarter(3));
 }
 #elif defined(__aarch64__)
 inline uint64_t BarsOfBlock(const char* block) {
@@ -78,7 +78,7 @@ class CBarScanner {
 
   // The next bar, or the text's end when there is none left.
   const char* Next() {
-    while (m_nBars == 0) {
+    while (Rarely(m_nBars == 0)) {
       if (m_pNext == m_pEnd) return m_pEnd;
       Load();
     }
@@ -93,7 +93,7 @@ class CBarScanner {
   void Load() {
     m_pBlock = m_pNext;
     const auto left = static_cast<size_t>(m_pEnd - m_pNext);
-    if (left >= kBarBlock) {
+    if (Mostly(left >= kBarBlock)) {
       m_nBars = BarsOfBlock(m_pBlock);
       m_pNext += kBarBlock;
     } else {

@@ -19,6 +19,12 @@ std::string_view UpTo(std::string_view text, size_t end) {
   return {text.data(), end < text.size() ? end : text.size()};
 }
 
+// A number that begins with another digit than 0 need not be read.
+bool IsZero(std::string_view number) {
+  const char first = number.front();
+  return (first < '1' || first > '9') && ReadInt32(number) == 0;
+}
+
 // 32- and 64-bit arithmetic of one and the same reading.
 struct Narrow {
   using Number = int32_t;
@@ -53,7 +59,7 @@ typename Arithmetic::Number Scale(std::string_view text, int decimals) {
 
 CTransDate::CTransDate(std::string_view date) : m_text(date) {
   const size_t size = date.size();
-  if (size < 6 || size > 8 || ReadInt32(date) == 0) return;
+  if (size < 6 || size > 8 || IsZero(date)) return;
   const size_t yearChars = size - 4;
   const int year = ReadInt32(UpTo(date, yearChars));
   CTextWriter text(m_szDate, sizeof m_szDate);

@@ -61,37 +61,43 @@ int32_t CRecord::Number(int row, size_t bound) const {
   return ReadInt32(Text(row, bound));
 }
 
-inline void CRecord::Index(TagKey key, const char* field, const char* end, const char* replyEnd) {
-  const int row = m_tags.Find(key);
-  if (row == CTagTable::kNone || (m_nPresent >> row & 1) != 0) return;
-  const std::string_view value = Slice(field + TagSize(key), end);
-  if (m_tags.SkipsBlanks(row) && IsSkippable(value, !ClosesRecord(end, replyEnd))) return;
-  m_values[row] = value;
-  m_nPresent |= 1U << row;
-}
-
 bool CRecordWalker::Next(CRecord& record) {
-  CBarScanner bars = m_bars;  // a copy of this function's own stays in registers
+  CBarScanner bars = m_bars;  // copies of this function's own stay in registers
   const char* bar = m_pBar;
+  const char* const end = bars.End();
   const char* opening = nullptr;
-  bool closed = false;
-  record.Clear();
-  while (!closed && bar != bars.End()) {
+  const char* closing = nullptr;
+  while (opening == nullptr && closing == nullptr && bar != end) {
     const char* const start = bar;
-    const char* const field = start + 1;
     bar = bars.Next();
-    const TagKey key = TagKeyOf(field, bar);
-    if (key == kClosing) {
-      closed = true;
-      record.m_bEmpty = opening == nullptr || static_cast<size_t>(start - opening) >= m_nBound;
-    } else if (opening != nullptr) {
-      record.Index(key, field, bar, bars.End());
-    } else if (key == kOpening) {
-      opening = start;
+    const TagKey key = TagKeyOf(start + 1, end);
+    if (key == kOpening) opening = start;
+    if (key == kClosing) closing = start;
+  }
+  const CTagTable& tags = record.m_tags;
+  const uint32_t skips = tags.Skips();
+  uint32_t present = 0;
+  while (opening != nullptr && Mostly(bar != end)) {
+    const char* const start = bar;
+    bar = bars.Next();
+    const TagKey key = TagKeyOf(start + 1, end);
+    const int row = tags.Find(key);
+    if (Mostly(row != CTagTable::kNone)) {
+      const std::string_view value = Slice(start + 1 + TagSize(key), bar);
+      if (Rarely(((present | skips) >> row & 1) != 0)) {
+        if ((present >> row & 1) != 0 || IsSkippable(value, !ClosesRecord(bar, end))) continue;
+      }
+      record.m_values[row] = value;
+      present |= 1U << row;
+    } else if (key == kClosing) {
+      closing = start;
+      break;
     }
   }
-  if (record.m_bEmpty) record.Clear();
+  const bool whole = opening != nullptr && closing != nullptr;
+  record.m_bEmpty = !whole || static_cast<size_t>(closing - opening) >= m_nBound;
+  record.m_nPresent = record.m_bEmpty ? 0 : present;
   m_bars = bars;
   m_pBar = bar;
-  return closed;
+  return closing != nullptr;
 }

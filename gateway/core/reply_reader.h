@@ -60,16 +60,17 @@ inline TagKey LoadTagKey(const char* chars) {
   return key;
 }
 
-// The key of the field that starts at `field` and ends at `end`; kNoTag when it has no tag of two
-// or three characters.
-inline TagKey TagKeyOf(const char* field, const char* end) {
-  const auto size = end - field;
-  if (size >= 4) {
+// The key of the field that starts at `field`, in a reply that ends at `replyEnd`; kNoTag when it
+// has no tag of two or three characters. A shorter field gives a key with a '|' in it, which is no
+// tag's.
+inline TagKey TagKeyOf(const char* field, const char* replyEnd) {
+  const auto left = replyEnd - field;
+  if (Mostly(left >= 4)) {
     const TagKey key = LoadTagKey(field);
-    if ((key >> 16 & 0xff) == '=') return key & 0x00ffffff;
+    if (Mostly((key >> 16 & 0xff) == '=')) return key & 0x00ffffff;
     return key >> 24 == '=' ? key : kNoTag;
   }
-  return size == 3 && field[2] == '=' ? MakeTagKey(field[0], field[1], '=') : kNoTag;
+  return left == 3 && field[2] == '=' ? MakeTagKey(field[0], field[1], '=') : kNoTag;
 }
 
 // Number of characters before the value of a field with this key.
@@ -96,7 +97,8 @@ class CTagTable {
     return m_keys[place] == key ? m_rows[place] : kNone;
   }
 
-  bool SkipsBlanks(int row) const { return (m_nSkips >> row & 1) != 0; }
+  // The rows that skip blanks, bit per row.
+  uint32_t Skips() const { return m_nSkips; }
 
  private:
   static constexpr size_t kPlaces = 128;
@@ -122,7 +124,7 @@ class CTagTable {
   TagKey m_keys[kPlaces] = {};
   uint8_t m_rows[kPlaces] = {};
   uint32_t m_nFactor = 0x9e3779b1;
-  uint32_t m_nSkips = 0;  // bit per row
+  uint32_t m_nSkips = 0;
 };
 
 // One record's fields, indexed once. A tag that stands several times counts where it stands first.
@@ -147,12 +149,6 @@ class CRecord {
 
  private:
   friend class CRecordWalker;
-
-  void Clear() {
-    m_bEmpty = true;
-    m_nPresent = 0;
-  }
-  void Index(TagKey key, const char* field, const char* end, const char* replyEnd);
 
   const CTagTable& m_tags;
   bool m_bEmpty = true;

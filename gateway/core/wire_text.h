@@ -13,6 +13,7 @@
 #include <type_traits>
 #include <utility>
 
+#include "gateway/core/branch_hints.h"
 #include "gateway/core/decimal.h"
 #include "gateway/core/wire_format.h"
 
@@ -21,14 +22,6 @@ inline std::string_view AsText(const char* text) {
 }
 inline std::string_view AsText(std::string_view text) {
   return text;
-}
-
-// What a condition nearly always is, so that the usual way through the code runs straight on.
-constexpr bool Mostly(bool condition) {
-  return __builtin_expect(condition, true);
-}
-constexpr bool Rarely(bool condition) {
-  return __builtin_expect(condition, false);
 }
 
 // Copies `size` bytes. Most values of a line are a few characters long, so that two overlapping

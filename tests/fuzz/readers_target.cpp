@@ -79,7 +79,8 @@ void CheckSubStrings(std::string_view reply, size_t bound) {
 void CheckRecord(const CRecord& record, std::string_view plain, size_t valueBound) {
   ExpectNumber("an empty record", record.Empty() ? 1 : 0, plain.empty() ? 1 : 0);
   for (int row = 0; row < static_cast<int>(std::size(kRowTags)); ++row) {
-    const TPlainToken token = PlainToken(kRowTags[row], plain, valueBound, kTable.SkipsBlanks(row));
+    const TPlainToken token =
+        PlainToken(kRowTags[row], plain, valueBound, (kTable.Skips() >> row & 1) != 0);
     Expect(kRowTags[row], record.Text(row, valueBound), token.m_Text);
     ExpectNumber(kRowTags[row], record.Has(row) ? 1 : 0, token.m_nLength > 0 ? 1 : 0);
   }
