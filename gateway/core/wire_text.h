@@ -236,7 +236,9 @@ class CWireText {
   template <class Format, size_t kAt, class Value>
   static bool WriteMark(char*& at, const Value& value) {
     WriteLiteral<Format, kAt>(at);
-    if (Rarely(EndsPiece(value))) return false;
+    if constexpr (std::is_same_v<Value, CharValue>) {
+      if (Rarely(value.c == '\0')) return false;
+    }
     at = value.WriteTo(at);
     return true;
   }
@@ -244,16 +246,12 @@ class CWireText {
   template <class Format, size_t kAt, class Value>
   static bool CountMark(size_t& size, const Value& value) {
     size += kWirePlan<Format>.marks[kAt].literalSize;
-    if (EndsPiece(value)) return false;
+    if constexpr (std::is_same_v<Value, CharValue>) {
+      if (value.c == '\0') return false;
+    }
     size += value.Size();
     return true;
   }
-
-  template <class Value>
-  static bool EndsPiece(const Value&) {
-    return false;
-  }
-  static bool EndsPiece(const CharValue& value) { return value.c == '\0'; }
 };
 
 #endif  // QUORVANE_GATEWAY_CORE_WIRE_TEXT_H_
