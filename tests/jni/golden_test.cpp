@@ -104,6 +104,39 @@ TEST(GoldenCalls, EachRefusedVmCallIsSurvived) {
   }
 }
 
+// A request with a password that fills its 4095 characters to the last is whole, also where pieces
+// are cut short by a NUL character; with one character more it is an error.
+TEST(GoldenRequests, EachFillsItsBufferAndNoMore) {
+  constexpr size_t kRequestCapacity = 4095;
+  constexpr size_t kPassword = 7;
+  int tried = 0;
+  CRecordingHost host;
+  for (const TGoldenCase& golden : AllGolden().m_Cases) {
+    const TExport* const row = FindExport(golden.m_Operation);
+    const std::string field = "PWD=pw";
+    const size_t at = golden.m_Result.find(field);
+    const bool sent = golden.m_Status.value_or(1) == 1 && at != std::string::npos;
+    if (!sent || golden.m_Arguments.size() <= kPassword ||
+        golden.m_Arguments[kPassword].m_Text != "pw" || !SetClockOf(golden)) {
+      continue;
+    }
+    const std::string result =
+        FillPlatformName(golden.m_Result, PlatformName(golden.PlatformRow()));
+    const std::string password(2 + kRequestCapacity - result.size(), 'p');
+    TArguments arguments = golden.m_Arguments;
+    arguments[kPassword] = TArgument::Text(password);
+    const TOutcome whole = host.Call(*row, arguments);
+    std::string expected = result;
+    expected.replace(result.find(field), field.size(), "PWD=" + password);
+    EXPECT_EQ(whole.m_Result, expected) << golden.Where();
+    EXPECT_EQ(whole.m_Status, golden.m_Status) << golden.Where();
+    arguments[kPassword] = TArgument::Text(password + "p");
+    EXPECT_EQ(host.Call(*row, arguments).m_Result, "[CLIENT]傳入的參數錯誤") << golden.Where();
+    ++tried;
+  }
+  EXPECT_GT(tried, 50);
+}
+
 // Each string null in turn is answered as an empty one is.
 TEST(GoldenCalls, EachNullStringReadsAsAnEmptyOne) {
   CRecordingHost host;
