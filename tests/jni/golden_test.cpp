@@ -137,6 +137,34 @@ TEST(GoldenRequests, EachFillsItsBufferAndNoMore) {
   EXPECT_GT(tried, 50);
 }
 
+// Every length of every text around the size of a request's buffer: whichever piece is the one that
+// does not fit, nothing is written behind the buffer, and the request is sent whole or not at all.
+TEST(GoldenRequests, TextsOfEveryLengthAroundTheBufferAreWholeOrNotSent) {
+  CRecordingHost host;
+  std::set<std::string_view> tried;
+  for (const TGoldenCase& golden : AllGolden().m_Cases) {
+    const TExport* const row = FindExport(golden.m_Operation);
+    if (row->IsDecoder() || golden.m_Status.value_or(1) != 1 || !SetClockOf(golden) ||
+        !tried.insert(row->m_szName).second) {
+      continue;
+    }
+    for (size_t i = 0; i < golden.m_Arguments.size(); ++i) {
+      if (golden.m_Arguments[i].m_chLetter != 'S') continue;
+      TArguments arguments = golden.m_Arguments;
+      for (size_t length = 3700; length < 4100; ++length) {
+        arguments[i] = TArgument::Text(std::string(length, 'x'));
+        const TOutcome outcome = host.Call(*row, arguments);
+        ASSERT_TRUE(outcome.IsSound()) << golden.Where() << ", argument " << i + 1;
+        const std::string& result = outcome.m_Result.value();
+        const bool refused = result.find("[CLIENT]") != std::string::npos ||
+                             result.find("傳入的參數錯誤") != std::string::npos;
+        ASSERT_NE(refused, result.substr(0, 2) == "F=") << golden.Where() << ": " << result;
+        ASSERT_EQ(refused, outcome.m_Status.value_or(refused ? -1 : 1) == -1) << golden.Where();
+      }
+    }
+  }
+}
+
 // Each string null in turn is answered as an empty one is.
 TEST(GoldenCalls, EachNullStringReadsAsAnEmptyOne) {
   CRecordingHost host;
