@@ -7,6 +7,10 @@
 
 #include "tests/heap/counting_heap.h"
 
+// Clang declares the sized forms only where it is told to use them.
+void operator delete(void* block, size_t size) noexcept;
+void operator delete[](void* block, size_t size) noexcept;
+
 namespace gateway_tests {
 namespace {
 
