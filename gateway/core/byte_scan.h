@@ -83,7 +83,7 @@ class CBarScanner {
       if (m_pNext == m_pEnd) return m_pEnd;
       Load();
     }
-    const char* const bar = m_pBlock + __builtin_ctzll(m_nBars);
+    const char* const bar = m_pBlock + static_cast<unsigned>(__builtin_ctzll(m_nBars));
     m_nBars &= m_nBars - 1;
     return bar;
   }

@@ -87,13 +87,12 @@ size_t DecimalSize(int64_t value, size_t width) {
 }
 
 char* WriteNumber(char* at, int64_t value) {
-  if (static_cast<uint64_t>(value) >= 100000) return WriteDecimal(at, value, 0);
-  const auto number = static_cast<uint32_t>(value);
-  if (number >= 1000) {
-    return number < 10000 ? WriteDigits<4>(at, number) : WriteDigits<5>(at, number);
-  }
-  if (number >= 100) return WriteDigits<3>(at, number);
-  return number < 10 ? WriteDigits<1>(at, number) : WriteDigits<2>(at, number);
+  if (value < 0 || value >= 100000000) return WriteDecimal(at, value, 0);
+  const uint64_t digits = EightDigits(static_cast<uint32_t>(value));
+  const int zeros = __builtin_ctzll((digits ^ kEightZeros) | uint64_t{1} << 56) & 56;
+  const uint64_t text = digits >> zeros;
+  memcpy(at, &text, sizeof text);
+  return at + 8 - zeros / 8;
 }
 
 char* WriteDecimal(char* at, int64_t value, size_t width) {

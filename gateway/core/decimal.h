@@ -8,23 +8,31 @@
 #include <string_view>
 #include <type_traits>
 
+#include "gateway/core/branch_hints.h"
+#include "gateway/core/digit_words.h"
+
 // Reads a number as C's `atoll` does: blanks, a sign, digits up to the first other character.
 // Saturates at the 64-bit limits; a text without digits is 0.
 int64_t ReadInt64(std::string_view text);
 
 // As ReadInt64, then narrowed to 32 bits by wrapping: what `atoi` gives where `long` has 64 bits.
+// Up to eight digits are read without a branch that would depend on their values, and none but a
+// few on their count.
 inline int32_t ReadInt32(std::string_view text) {
-  constexpr size_t kSafeDigits = 9;
-  if (text.size() <= kSafeDigits) {
-    uint32_t value = 0;
-    const char* at = text.data();
-    const char* const end = at + text.size();
-    for (; at != end; ++at) {
-      const uint32_t digit = static_cast<unsigned char>(*at) - uint32_t{'0'};
-      if (digit > 9) break;
-      value = value * 10 + digit;
+  const size_t size = text.size();
+  if (size - 4 <= 4) {
+    const uint64_t word = AlignRight(LoadWord(text), size);
+    if (Mostly(AreEightDigits(word))) return static_cast<int32_t>(ValueOfEightDigits(word));
+  } else if (size - 1 < 3) {
+    static constexpr uint8_t kWeights[][2] = {{0, 0}, {10, 0}, {100, 10}};
+    const auto digit = [text](size_t i) {
+      return static_cast<unsigned char>(text[i]) - uint32_t{'0'};
+    };
+    const uint32_t first = digit(0), middle = digit(size / 2), last = digit(size - 1);
+    if (Mostly((first <= 9) & (middle <= 9) & (last <= 9))) {
+      const uint8_t(&weights)[2] = kWeights[size - 1];
+      return static_cast<int32_t>(first * weights[0] + middle * weights[1] + last);
     }
-    if (at == end || at != text.data()) return static_cast<int32_t>(value);
   }
   return static_cast<int32_t>(static_cast<uint32_t>(static_cast<uint64_t>(ReadInt64(text))));
 }
@@ -58,27 +66,6 @@ inline int64_t WrapMultiply(int64_t a, int64_t b) {
 template <class Signed>
 inline constexpr size_t kMaxDecimalSize = sizeof(Signed) == 4 ? 11 : 20;
 
-// "00" to "99", so that digits are written two at a time.
-inline constexpr char kDigitPairs[] =
-    "0001020304050607080910111213141516171819202122232425262728293031323334353637383940414243444546"
-    "4748495051525354555657585960616263646566676869707172737475767778798081828384858687888990919293"
-    "949596979899";
-
-inline void WriteDigitPair(char* at, uint32_t value) {
-  memcpy(at, kDigitPairs + size_t{2} * value, 2);
-}
-
-// Writes the eight digits of a value below 10^8 in one store: halves, pairs and digits are parted
-// side by side in one word, the first digit in its lowest byte (every ABI is little-endian).
-inline void WriteEightDigits(char* at, uint32_t value) {
-  const uint64_t halves = value / 10000 | uint64_t{value % 10000} << 32;
-  const uint64_t hundreds = (halves * 10486 >> 20) & 0x0000007f0000007f;  // halves / 100
-  const uint64_t pairs = hundreds | (halves - 100 * hundreds) << 16;
-  const uint64_t tens = (pairs * 103 >> 10) & 0x000f000f000f000f;  // pairs / 10
-  const uint64_t digits = tens | (pairs - 10 * tens) << 8 | 0x3030303030303030;
-  memcpy(at, &digits, sizeof digits);
-}
-
 // Writes the last `kCount` digits of `value`, zero-padded on the left; returns the place behind.
 template <size_t kCount>
 inline char* WriteDigits(char* at, uint32_t value) {
@@ -98,8 +85,7 @@ inline char* WriteDigits(char* at, uint32_t value) {
 // sign counts as one character of the width and stands before the zeros.
 __attribute__((noinline)) size_t DecimalSize(int64_t value, size_t width);
 
-// Writes a plain number at `at`; returns the place behind. The short ones, which are most of the
-// wire's, cost least.
+// Writes a plain number; touches at least eight bytes. Returns the place behind the number.
 __attribute__((noinline)) char* WriteNumber(char* at, int64_t value);
 
 // Writes that many characters at `at`; returns the place behind them.

@@ -174,11 +174,10 @@ class CGatewayPub {
 
  protected:
   // The public headers at work. False leaves a message alone in `line`; an overflow is no failure
-  // here, Finish tells it. `key` is filled unless there is no address.
+  // here, Finish tells it.
   bool WriteQueryHead(CTextWriter& line, const char* branch, const char* identity,
                       const char* password);
-  bool WriteOrderHead(OrderHead head, char function, const OrderOrigin& origin, CTextWriter& line,
-                      OrderKey& key);
+  bool WriteOrderHead(CTextWriter& line, const OrderKey& key);
 
   // An empty request in m_szBuffer.
   CTextWriter StartRequest() { return CTextWriter(m_szBuffer, sizeof m_szBuffer); }
@@ -218,6 +217,8 @@ class CGatewayPub {
   void LogReply(const char* name, std::string_view reply);
 
  private:
+  friend struct OrderKey;
+
   // Of the texts in m_szSerialNo and m_szLocalIP: kept by their setters, for a look at a field that
   // was just written would wait for it.
   size_t m_nSerialNoLen;
@@ -225,15 +226,13 @@ class CGatewayPub {
 
   // Reads the clock and reduces m_nSeqNo modulo 100.
   void TakeStamp(Stamp& stamp);
-  std::string_view SerialNo(std::string_view address, SerialScratch& scratch) const;
+  PaddedText SerialNo(std::string_view address, SerialScratch& scratch) const;
   std::string_view LocalIP() const;
-  std::string_view PlatformName() const;
+  PaddedText PlatformName() const;
   char RequestKind() const;
 
   int WritePublicHead(OrderHead head, char function, const OrderOrigin& origin, char* out,
                       char* orderKey);
-  void WriteOrderOrigin(const OrderKey& key, CTextWriter& line) const;
-  static void WriteStamps(CTextWriter& line, const Stamp& stamp);
 
   char* EncodeAccountQuery(const char* branch, const char* identity, const char* password,
                            const char* function, int* status);

@@ -7,29 +7,49 @@
 
 namespace {
 
-constexpr std::string_view kNoEdition = "NO DEFINE";
+// A client edition; kEditions goes by the host's platform number.
+struct Edition {
+  char name[PaddedText::kReadable];
+  size_t size;
+};
 
-// The client editions, by the host's platform number.
-constexpr std::string_view kPlatformNames[] = {
-    kNoEdition, kNoEdition, kNoEdition, kNoEdition, kNoEdition, "QVPHONE", kNoEdition, "QVTAB",
-    kNoEdition, "QVLITE",   "QVPRO",    "QVFUTURE", "QVOPTION", "QVWATCH", "QVPRO"};
-
-// Keeps at most as many characters as the field has; one that they fill has no terminator.
 template <size_t kSize>
-size_t SetField(char (&field)[kSize], const char* text) {
-  memset(field, 0, kSize);
-  const size_t size = text == nullptr ? 0 : strnlen(text, kSize);
-  CopyShort(field, text, size);
-  return size;
+constexpr Edition Named(const char (&name)[kSize]) {
+  Edition edition = {{}, kSize - 1};
+  for (size_t i = 0; i < kSize; ++i) edition.name[i] = name[i];
+  return edition;
+}
+
+constexpr Edition kNoEdition = Named("NO DEFINE");
+
+constexpr Edition kEditions[] = {
+    kNoEdition,       kNoEdition,        kNoEdition,        kNoEdition,       kNoEdition,
+    Named("QVPHONE"), kNoEdition,        Named("QVTAB"),    kNoEdition,       Named("QVLITE"),
+    Named("QVPRO"),   Named("QVFUTURE"), Named("QVOPTION"), Named("QVWATCH"), Named("QVPRO")};
+
+// Keeps at most as many characters as the field has; one that they fill has no terminator. `length`
+// is the text's in the field, whose other characters are zero.
+template <size_t kSize>
+void SetField(char (&field)[kSize], size_t& length, const char* text) {
+  if (length > 0) memset(field, 0, kSize);
+  length = text == nullptr ? 0 : strnlen(text, kSize);
+  CopyShort(field, text, length);
 }
 
 }  // namespace
 
 CGatewayPub::CGatewayPub()
-    : m_nDataSize(0), m_nDataLen(0), m_pData(nullptr), m_nMarket(0), m_nPlatform(0), m_nSeqNo(0) {
+    : m_nDataSize(0),
+      m_nDataLen(0),
+      m_pData(nullptr),
+      m_nMarket(0),
+      m_nPlatform(0),
+      m_nSeqNo(0),
+      m_szSerialNo{},
+      m_szLocalIP{},
+      m_nSerialNoLen(0),
+      m_nLocalIPLen(0) {
   m_szBuffer[0] = '\0';
-  setSerialNumber(nullptr);
-  setLocalIP(nullptr);
 }
 
 CGatewayPub::~CGatewayPub() {
@@ -38,11 +58,11 @@ CGatewayPub::~CGatewayPub() {
 }
 
 void CGatewayPub::setSerialNumber(const char* serial) {
-  m_nSerialNoLen = SetField(m_szSerialNo, serial);
+  SetField(m_szSerialNo, m_nSerialNoLen, serial);
 }
 
 void CGatewayPub::setLocalIP(const char* ip) {
-  m_nLocalIPLen = SetField(m_szLocalIP, ip);
+  SetField(m_szLocalIP, m_nLocalIPLen, ip);
 }
 
 void CGatewayPub::debuglog(const char* text) {
@@ -54,16 +74,17 @@ std::string_view CGatewayPub::LocalIP() const {
 }
 
 // A full serial number has no terminator, so the gateway knows it with the address run onto it.
-std::string_view CGatewayPub::SerialNo(std::string_view address, SerialScratch& scratch) const {
-  if (m_nSerialNoLen < sizeof m_szSerialNo) return {m_szSerialNo, m_nSerialNoLen};
+PaddedText CGatewayPub::SerialNo(std::string_view address, SerialScratch& scratch) const {
+  if (m_nSerialNoLen < sizeof m_szSerialNo) return {{m_szSerialNo, m_nSerialNoLen}};
   memcpy(scratch, m_szSerialNo, sizeof m_szSerialNo);
   memcpy(scratch + sizeof m_szSerialNo, address.data(), address.size());
-  return {scratch, sizeof m_szSerialNo + address.size()};
+  return {{scratch, sizeof m_szSerialNo + address.size()}};
 }
 
-std::string_view CGatewayPub::PlatformName() const {
+PaddedText CGatewayPub::PlatformName() const {
   const auto row = static_cast<uint32_t>(m_nPlatform);
-  return row < std::size(kPlatformNames) ? kPlatformNames[row] : kNoEdition;
+  const Edition& edition = row < std::size(kEditions) ? kEditions[row] : kNoEdition;
+  return {{edition.name, edition.size}};
 }
 
 // Securities or futures; the host's number is compared unsigned, so a negative one means futures.

@@ -13,29 +13,63 @@
 namespace {
 
 // A lone part stands for both; a part too long for its buffer counts as empty.
-void SplitIdentity(std::string_view identity, OrderKey& key) {
-  key.first = Bounded(TakePiece(identity, '&'), kIdentityPartSize);
-  key.second = Bounded(TakePiece(identity, '&'), kIdentityPartSize);
-  if (key.second.empty()) key.second = key.first;
+IdentityParts SplitIdentity(std::string_view identity) {
+  const std::string_view first = Bounded(TakePiece(identity, '&'), kIdentityPartSize);
+  const std::string_view second = Bounded(TakePiece(identity, '&'), kIdentityPartSize);
+  return {first, second.empty() ? first : second};
+}
+
+// The brief header goes without.
+bool HasAddress(const OrderKey& key) {
+  return key.head == OrderHead::kBrief || !key.address.text.empty();
+}
+
+// The pieces of the usual header.
+ALWAYS_INLINE inline auto Origin(const OrderKey& key) {
+  return MakePiece(WIRE("F=1|KIND=%c|BHNO=%s|CB=1|IP=%s|11=%s|VER=%s|SN=%s|65=00%s|14=%c"),
+                   key.market, key.origin.branch, key.address, key.edition, kProtocolVersion,
+                   key.serialNo, key.stamp.requestId, key.function);
+}
+ALWAYS_INLINE inline auto Account(const OrderKey& key) {
+  return MakePiece(WIRE("|15=0|IDNO=%s|ACNO=%s|PWD=%s"), key.identity.first, key.identity.second,
+                   key.origin.password);
+}
+ALWAYS_INLINE inline auto Stamps(const OrderKey& key) {
+  return MakePiece(WIRE("|21=%04d%02d%02d|22=%s|23=%s|24=5|V4="), key.stamp.year, key.stamp.month,
+                   key.stamp.day, key.stamp.Clock(), key.stamp.requestId);
+}
+
+bool NamesAccount(const OrderKey& key) {
+  return IsAccountLength(key.identity.second.size());
 }
 
 // The second part decides. The blocks "15=1" open without a bar in the plain header, its tag 14
 // running straight into "15=1". They end with a bar and the next field opens with one: the doubled
 // '|' is the wire's.
 bool WriteIdentity(CTextWriter& line, const OrderKey& key) {
-  const std::string_view first = key.first;
-  const std::string_view second = key.second;
-  const std::string_view password = key.origin->password;
-  if (IsAccountLength(second.size())) {
-    line.Append(WIRE("|15=0|IDNO=%s|ACNO=%s|PWD=%s"), first, second, password);
+  const auto [first, second] = key.identity;
+  if (NamesAccount(key)) {
+    line.AppendPieces(Account(key));
     return true;
   }
   if (!IsIdNumberLength(second.size())) return false;
   if (key.head != OrderHead::kPlain) line.AppendChar('|');
   line.Append(WIRE("15=1|IDNO=%s|"), second);
   if (IsAccountLength(first.size())) line.Append(WIRE("ACNO=%s|"), first);
-  line.Append(WIRE("PWD=%s|"), password);
+  line.Append(WIRE("PWD=%s|"), key.origin.password);
   return true;
+}
+
+// Any other origin than an account behind the usual header.
+bool WriteUnusualOrigin(CTextWriter& line, const OrderKey& key) {
+  if (key.head == OrderHead::kBrief) {
+    line.Append(WIRE("F=1|KIND=%c|CB=1|BHNO=%s|VER=%s|SN=%s|11=%s|65=00%s|14=%c"), key.market,
+                key.origin.branch, kProtocolVersion, key.serialNo, key.edition, key.stamp.requestId,
+                key.function);
+  } else {
+    line.AppendPieces(Origin(key));
+  }
+  return WriteIdentity(line, key);
 }
 
 }  // namespace
@@ -63,64 +97,53 @@ int CGatewayPub::initOrderHead2(char function, const char* branch, const char* i
 int CGatewayPub::WritePublicHead(OrderHead head, char function, const OrderOrigin& origin,
                                  char* out, char* orderKey) {
   CTextWriter line = CTextWriter::Continue(out, kBufferSize);
-  OrderKey key;
-  const bool written = WriteOrderHead(head, function, origin, line, key);
+  KeyStore store;
+  const OrderKey key(*this, head, function, origin, store);
+  const bool written = WriteOrderHead(line, key);
   if (orderKey != nullptr) {
     CTextWriter text(orderKey, kBufferSize);
-    key.AppendTo(text);
+    if (HasAddress(key)) key.AppendTo(text);
     text.Text();
   }
   return EndPublicHead(line, written);
 }
 
-bool CGatewayPub::WriteOrderHead(OrderHead head, char function, const OrderOrigin& origin,
-                                 CTextWriter& line, OrderKey& key) {
-  TakeStamp(key.stamp);
-  key.address = LocalIP();
-  if (head != OrderHead::kBrief && key.address.empty()) {
+bool CGatewayPub::WriteOrderHead(CTextWriter& line, const OrderKey& key) {
+  if (!HasAddress(key)) {
     line.Replace(kNoAddress);
     return false;
   }
-  key.head = head;
-  key.function = function;
-  key.origin = &origin;
-  key.serialNo = SerialNo(key.address, key.scratch);
-  SplitIdentity(origin.identity, key);
-  WriteOrderOrigin(key, line);
-  if (!WriteIdentity(line, key)) {
+  if (Mostly(key.head != OrderHead::kBrief && NamesAccount(key))) {
+    line.AppendPieces(Origin(key), Account(key));
+  } else if (!WriteUnusualOrigin(line, key)) {
     line.Replace(kIdentityLengths);
     return false;
   }
-  if (head != OrderHead::kBrief) WriteStamps(line, key.stamp);
-  if (head == OrderHead::kPlain && !origin.rocDate.empty()) {
-    line.Append(WIRE("|44=%08d"), RocToWesternDate(origin.rocDate));
+  if (key.head == OrderHead::kPlain && Mostly(!key.origin.rocDate.empty())) {
+    line.AppendPieces(Stamps(key),
+                      MakePiece(WIRE("|44=%08d"), RocToWesternDate(key.origin.rocDate)));
+  } else if (key.head != OrderHead::kBrief) {
+    line.AppendPieces(Stamps(key));
   }
   if (!line.Overflowed()) debuglog(line.Text());
   return true;
 }
 
+OrderKey::OrderKey(CGatewayPub& session, OrderHead orderHead, char orderFunction,
+                   const OrderOrigin& name, KeyStore& store)
+    : head(orderHead),
+      function(orderFunction),
+      origin(name),
+      market(session.RequestKind()),
+      edition(session.PlatformName()),
+      address{session.LocalIP()},
+      serialNo(session.SerialNo(address.text, store.serialNo)),
+      identity(SplitIdentity(name.identity)),
+      stamp(store.stamp) {
+  session.TakeStamp(store.stamp);
+}
+
 void OrderKey::AppendTo(CTextWriter& text) const {
-  if (head == OrderHead::kPlain) {
-    text.Append(WIRE("%s_%s_%s_%c"), origin->branch, second, first, function);
-  } else if (head == OrderHead::kSigned) {
-    text.Append(WIRE("%s,%s,%04d%02d%02d,%s-%s,%s,%c"), serialNo, address, stamp.year, stamp.month,
-                stamp.day, origin->branch, second, first, function);
-  }
-}
-
-void CGatewayPub::WriteOrderOrigin(const OrderKey& key, CTextWriter& line) const {
-  if (key.head == OrderHead::kBrief) {
-    line.Append(WIRE("F=1|KIND=%c|CB=1|BHNO=%s|VER=%s|SN=%s|11=%s|65=00%s|14=%c"), RequestKind(),
-                key.origin->branch, kProtocolVersion, key.serialNo, PlatformName(),
-                key.stamp.requestId, key.function);
-  } else {
-    line.Append(WIRE("F=1|KIND=%c|BHNO=%s|CB=1|IP=%s|11=%s|VER=%s|SN=%s|65=00%s|14=%c"),
-                RequestKind(), key.origin->branch, key.address, PlatformName(), kProtocolVersion,
-                key.serialNo, key.stamp.requestId, key.function);
-  }
-}
-
-void CGatewayPub::WriteStamps(CTextWriter& line, const Stamp& stamp) {
-  line.Append(WIRE("|21=%04d%02d%02d|22=%s|23=%s|24=5|V4="), stamp.year, stamp.month, stamp.day,
-              stamp.Clock(), stamp.requestId);
+  if (head == OrderHead::kPlain) text.AppendPieces(Plain());
+  if (head == OrderHead::kSigned) text.AppendPieces(Signed());
 }

@@ -66,7 +66,7 @@ bool CGatewayPub::WriteQueryHead(CTextWriter& line, const char* branch, const ch
 
   SerialScratch scratch;
   line.Append(WIRE("F=7|KIND=%c|BHNO=%s|CB=1|IP=%s|11=%s|VER=%s|65=00%s|SN=%s|"), RequestKind(),
-              branch, address, PlatformName(), kProtocolVersion, stamp.requestId,
+              branch, PaddedText{address}, PlatformName(), kProtocolVersion, stamp.requestId,
               SerialNo(address, scratch));
   if (first[0] == '\0') return true;
   if (!WriteIdentity(line, first, second, password)) {

@@ -20,8 +20,8 @@ std::string_view Slice(const char* from, const char* to) {
 
 // Whether the bar at `bar` opens the field that ends a record: a record stops before that bar, so
 // the record's last field is not closed by it.
-bool ClosesRecord(const char* bar, const char* replyEnd) {
-  return bar != replyEnd && TagKeyOf(bar + 1, replyEnd) == kClosing;
+bool ClosesRecord(const char* bar, const CTagReader& tags) {
+  return tags.KeyBehind(bar) == kClosing;
 }
 
 bool IsSkippable(std::string_view value, bool closed) {
@@ -63,6 +63,7 @@ int32_t CRecord::Number(int row, size_t bound) const {
 
 bool CRecordWalker::Next(CRecord& record) {
   CBarScanner bars = m_bars;  // copies of this function's own stay in registers
+  const CTagReader keys = m_tags;
   const char* bar = m_pBar;
   const char* const end = bars.End();
   const char* opening = nullptr;
@@ -70,7 +71,7 @@ bool CRecordWalker::Next(CRecord& record) {
   while (opening == nullptr && closing == nullptr && bar != end) {
     const char* const start = bar;
     bar = bars.Next();
-    const TagKey key = TagKeyOf(start + 1, end);
+    const TagKey key = keys.KeyBehind(start);
     if (key == kOpening) opening = start;
     if (key == kClosing) closing = start;
   }
@@ -80,19 +81,23 @@ bool CRecordWalker::Next(CRecord& record) {
   while (opening != nullptr && Mostly(bar != end)) {
     const char* const start = bar;
     bar = bars.Next();
-    const TagKey key = TagKeyOf(start + 1, end);
-    const int row = tags.Find(key);
-    if (Mostly(row != CTagTable::kNone)) {
-      const std::string_view value = Slice(start + 1 + TagSize(key), bar);
-      if (Rarely(((present | skips) >> row & 1) != 0)) {
-        if ((present >> row & 1) != 0 || IsSkippable(value, !ClosesRecord(bar, end))) continue;
+    TagKey key = keys.ShortKeyBehind(start);
+    int row = tags.Find(key);
+    if (Rarely(row == CTagTable::kNone)) {
+      if (key == kClosing) {
+        closing = start;
+        break;
       }
-      record.m_values[row] = value;
-      present |= 1U << row;
-    } else if (key == kClosing) {
-      closing = start;
-      break;
+      key = keys.KeyBehind(start);
+      row = tags.Find(key);
+      if (row == CTagTable::kNone) continue;
     }
+    const std::string_view value = Slice(start + 1 + TagSize(key), bar);
+    if (Rarely(((present | skips) >> row & 1) != 0)) {
+      if ((present >> row & 1) != 0 || IsSkippable(value, !ClosesRecord(bar, keys))) continue;
+    }
+    record.m_values[static_cast<uint8_t>(row)] = value;
+    present |= 1U << row;
   }
   const bool whole = opening != nullptr && closing != nullptr;
   record.m_bEmpty = !whole || static_cast<size_t>(closing - opening) >= m_nBound;

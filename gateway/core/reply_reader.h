@@ -60,18 +60,34 @@ inline TagKey LoadTagKey(const char* chars) {
   return key;
 }
 
-// The key of the field that starts at `field`, in a reply that ends at `replyEnd`; kNoTag when it
-// has no tag of two or three characters. A shorter field gives a key with a '|' in it, which is no
-// tag's.
-inline TagKey TagKeyOf(const char* field, const char* replyEnd) {
-  const auto left = replyEnd - field;
-  if (Mostly(left >= 4)) {
-    const TagKey key = LoadTagKey(field);
-    if (Mostly((key >> 16 & 0xff) == '=')) return key & 0x00ffffff;
-    return key >> 24 == '=' ? key : kNoTag;
+// Tells the fields of a reply by their keys. Reads nothing behind the reply.
+class CTagReader {
+ public:
+  CTagReader(const char* reply, const char* replyEnd)
+      : m_pEnd(replyEnd), m_pLong(replyEnd - reply < 4 ? reply : replyEnd - 4) {}
+
+  // The key of the field behind `bar`; kNoTag when it has no tag of two or three characters. A
+  // shorter field gives a key with a '|' in it, which is no tag's.
+  TagKey KeyBehind(const char* bar) const {
+    if (Mostly(bar < m_pLong)) {
+      const TagKey key = LoadTagKey(bar + 1);
+      if (Mostly((key >> 16 & 0xff) == '=')) return key & kShortTag;
+      return key >> 24 == '=' ? key : kNoTag;
+    }
+    return m_pEnd - bar == 4 && bar[3] == '=' ? MakeTagKey(bar[1], bar[2], '=') : kNoTag;
   }
-  return left == 3 && field[2] == '=' ? MakeTagKey(field[0], field[1], '=') : kNoTag;
-}
+
+  // The same of a field whose tag has two characters; any other key says no more than that.
+  TagKey ShortKeyBehind(const char* bar) const {
+    return Mostly(bar < m_pLong) ? LoadTagKey(bar + 1) & kShortTag : KeyBehind(bar);
+  }
+
+ private:
+  static constexpr TagKey kShortTag = 0x00ffffff;
+
+  const char* m_pEnd;
+  const char* m_pLong;  // four characters follow any bar before it
+};
 
 // Number of characters before the value of a field with this key.
 constexpr size_t TagSize(TagKey key) {
@@ -92,7 +108,7 @@ class CTagTable {
   }
 
   // The row of the tag with this key, or kNone.
-  constexpr int Find(TagKey key) const {
+  ALWAYS_INLINE constexpr int Find(TagKey key) const {
     const size_t place = PlaceOf(key);
     return m_keys[place] == key ? m_rows[place] : kNone;
   }
@@ -162,7 +178,10 @@ class CRecordWalker {
   // `bound` is the size of the record buffer: a record of that many characters or more is dropped
   // and comes out empty.
   CRecordWalker(std::string_view reply, size_t bound)
-      : m_bars(reply.data(), reply.size()), m_pBar(m_bars.Next()), m_nBound(bound) {}
+      : m_bars(reply.data(), reply.size()),
+        m_tags(reply.data(), reply.data() + reply.size()),
+        m_pBar(m_bars.Next()),
+        m_nBound(bound) {}
 
   // Indexes the next record. A closing field before any opening one, like a dropped record, gives
   // an empty record. Returns false, with an empty record, when no complete record is left.
@@ -170,6 +189,7 @@ class CRecordWalker {
 
  private:
   CBarScanner m_bars;
+  CTagReader m_tags;
   const char* m_pBar;  // the first bar that was not looked behind
   size_t m_nBound;
 };

@@ -19,11 +19,7 @@ struct Stamp {
   int year, month, day;
   FixedText<8> requestId;  // HHMMSS and two digits of the sequence number
 
-  FixedText<6> Clock() const {
-    FixedText<6> clock;
-    memcpy(clock.chars, requestId.chars, sizeof clock.chars);
-    return clock;
-  }
+  FixedValue<6> Clock() const { return {requestId.chars}; }
 };
 
 // The three order headers: what each sends is in order_head.cpp.
@@ -37,31 +33,51 @@ struct OrderOrigin {
   std::string_view rocDate;
 };
 
-// The text that opens an order's signature payload, as the parts that its header knows. They lie in
-// the host's texts, the session and the key itself, and are stored where they are read from: a copy
-// of what was just written in other sizes would wait for it.
+struct IdentityParts {
+  std::string_view first;
+  std::string_view second;  // the same where there is but one
+};
+
+class CGatewayPub;
+
+// The parts of an order key that are made for it.
+struct KeyStore {
+  Stamp stamp;
+  SerialScratch serialNo;
+};
+
+// What one order is named by, in its header and, as the order key, at the start of its signature
+// payload. The parts lie in the host's texts, the session and the store, and are copied from there
+// alone: a copy of what was just written in other sizes would wait for it.
 struct OrderKey {
-  OrderKey() = default;
+  // Reads the clock. The session, `name` and `store` outlive the key.
+  OrderKey(CGatewayPub& session, OrderHead orderHead, char orderFunction, const OrderOrigin& name,
+           KeyStore& store);
   OrderKey(const OrderKey&) = delete;
   OrderKey& operator=(const OrderKey&) = delete;
 
-  // The key itself; nothing where the header has none.
-  void AppendTo(CTextWriter& text) const;
-
-  // The key with what goes before it in a request: the payload stands bare behind the last field,
-  // or in tag PL.
-  void OpenPayload(CTextWriter& line) const {
-    line.AppendText(head == OrderHead::kPlain ? "!!" : "|PL=S!!");
-    AppendTo(line);
+  // The key as a piece, behind a plain header and behind a signed one.
+  ALWAYS_INLINE auto Plain() const {
+    return MakePiece(WIRE("%s_%s_%s_%c"), origin.branch, identity.second, identity.first, function);
+  }
+  ALWAYS_INLINE auto Signed() const {
+    return MakePiece(WIRE("%s,%s,%04d%02d%02d,%s-%s,%s,%c"), serialNo, address, stamp.year,
+                     stamp.month, stamp.day, origin.branch, identity.second, identity.first,
+                     function);
   }
 
-  OrderHead head = OrderHead::kBrief;
-  char function;
-  const OrderOrigin* origin;
-  std::string_view first, second;  // of the identity
-  std::string_view serialNo, address;
-  Stamp stamp;
-  SerialScratch scratch;  // of serialNo
+  // The key of its header; nothing where the header has none.
+  void AppendTo(CTextWriter& text) const;
+
+  const OrderHead head;
+  const char function;
+  const OrderOrigin& origin;
+  const char market;  // securities or futures
+  const PaddedText edition;
+  const PaddedText address;
+  const PaddedText serialNo;
+  const IdentityParts identity;
+  const Stamp& stamp;
 };
 
 #endif  // QUORVANE_GATEWAY_CORE_REQUEST_HEAD_H_

@@ -27,6 +27,8 @@ char* RenewHeapText(const HeapText& owner, size_t length);
 // fails once, for good.
 class CResultText : public CWireText<CResultText> {
  public:
+  static constexpr bool kGrows = true;
+
   // `owner`'s text is replaced. `expected` is a fair guess of the list's size: a first allocation
   // holds that much, and a second eight times as much, more than any reply of that size can give.
   CResultText(const HeapText& owner, size_t expected);
@@ -46,7 +48,7 @@ class CResultText : public CWireText<CResultText> {
   friend class CWireText<CResultText>;
   static constexpr size_t kOpeningRoom = 20;
 
-  bool MakeRoom(size_t count);
+  __attribute__((noinline, cold)) bool MakeRoom(size_t count);
 
   HeapText m_owner;
   size_t m_nExpected;

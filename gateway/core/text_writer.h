@@ -8,6 +8,8 @@
 // nor is anything after it; the writer's user asks once, at the end.
 class CTextWriter : public CWireText<CTextWriter> {
  public:
+  static constexpr bool kGrows = false;
+
   // Starts an empty text in `buffer`, which has `size` >= 1 bytes, terminator included, and
   // outlives the writer. Nothing is cleared but the text's own end.
   CTextWriter(char* buffer, size_t size)
@@ -34,7 +36,7 @@ class CTextWriter : public CWireText<CTextWriter> {
 
  private:
   friend class CWireText<CTextWriter>;
-  bool MakeRoom(size_t count);
+  __attribute__((noinline, cold)) bool MakeRoom(size_t count);
 
   char* m_pBegin;
   char* m_pLimit;  // the buffer's last byte

@@ -1,9 +1,9 @@
 // The wire's own format texts, read by the compiler: a wrong value type does not build, and at run
 // time nothing is interpreted.
 //
-// Marks: "%s" (a C text, null read as empty, a std::string_view or a FixedText), "%c" (char), "%d"
-// (int),
-// "%ld" (any integer) and the zero-padded "%0Nd" (int).
+// Marks: "%s" (a C text, null read as empty, a std::string_view, a PaddedText or a FixedText), "%c"
+// (char), "%d" (int, a byte of the host's or a RepeatedNumber), "%ld" (any integer) and the
+// zero-padded "%0Nd" (int).
 #ifndef QUORVANE_GATEWAY_CORE_WIRE_FORMAT_H_
 #define QUORVANE_GATEWAY_CORE_WIRE_FORMAT_H_
 

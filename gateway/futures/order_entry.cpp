@@ -231,8 +231,9 @@ char* CGatewayFut::EncodeOrder(OrderHead head, const OrderOrigin& origin, const 
                                int* status) {
   *status = 1;
   CTextWriter line = StartRequest();
-  OrderKey key;
-  if (!WriteOrderHead(head, order.function, origin, line, key)) {
+  KeyStore store;
+  const OrderKey key(*this, head, order.function, origin, store);
+  if (!WriteOrderHead(line, key)) {
     *status = -1;
     return line.Text();
   }

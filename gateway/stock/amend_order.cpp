@@ -55,7 +55,7 @@ void WriteCancel(CTextWriter& line, const StockOrder& order, const OrderKey& key
   const Reference reference = SplitReference(order);
   WriteBody(line, WIRE("|10=%08d|36=%s|46=%s|28=%d|29=%s|31=%d|32=%c|N6=%d|27=%d|UT=1000|13=%c"),
             order, reference, order.n6, order.kind, order.flag13);
-  key.OpenPayload(line);
+  line.AppendPieces(OpenBare(), key.Plain());
   line.Append(WIRE("_%s_%c_%s__"), reference.order, order.side, order.stockCode);
 }
 
@@ -64,7 +64,7 @@ void WriteChange(CTextWriter& line, const StockOrder& order, const OrderKey& key
   WriteBody(line,
             WIRE("|10=%08d|36=%s|46=%s|28=%d|29=%s|31=%d|32=%c|37=%d|N6=%d|27=%d|UT=%d|13=%c"),
             order, reference, SentQuantity(order), order.n6, order.kind, order.unit, order.flag13);
-  key.OpenPayload(line);
+  line.AppendPieces(OpenBare(), key.Plain());
   line.Append(WIRE("_%s_%c_%s_%d_"), reference.order, order.side, order.stockCode,
               SentQuantity(order));
 }
@@ -79,7 +79,7 @@ void WriteTaggedBody(CTextWriter& line, const StockOrder& order, const Reference
 void WriteTaggedCancel(CTextWriter& line, const StockOrder& order, const OrderKey& key) {
   const Reference reference = SplitReference(order);
   WriteTaggedBody(line, order, reference);
-  key.OpenPayload(line);
+  line.AppendPieces(OpenTagged(), key.Signed());
   line.Append(WIRE(",%c,%s,,%d,,,,%s"), order.side, order.stockCode, order.tradeType,
               reference.order);
 }
@@ -87,7 +87,7 @@ void WriteTaggedCancel(CTextWriter& line, const StockOrder& order, const OrderKe
 void WriteTaggedChange(CTextWriter& line, const StockOrder& order, const OrderKey& key) {
   const Reference reference = SplitReference(order);
   WriteTaggedBody(line, order, reference);
-  key.OpenPayload(line);
+  line.AppendPieces(OpenTagged(), key.Signed());
   line.Append(WIRE(",%c,%s,,%d,,%d,,%s"), order.side, order.stockCode, order.tradeType,
               SentQuantity(order), reference.order);
 }

@@ -42,9 +42,11 @@ constexpr CTagTable kTags({{"67"},
                            {"51"}});
 static_assert(OpensListTable(kTags), "the list frame reads its rows");
 
+constexpr COrderTypes kOrderTypes(kOrderTypeRows, kLiveOrderTypeRows);
+
 int TypeCodeOf(const CRecord& record) {
-  return FindLiveOrderType(record.Number(kKind, kFieldSize), record.Number(kTradeType, kFieldSize),
-                           record.Text(kSide, kFieldSize) == "B");
+  return kOrderTypes.Find(record.Number(kKind, kFieldSize), record.Number(kTradeType, kFieldSize),
+                          record.Text(kSide, kFieldSize) == "B");
 }
 
 void AppendFill(CResultText& list, const CRecord& record, int typeCode) {

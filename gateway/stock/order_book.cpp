@@ -7,6 +7,8 @@
 //            time @ 21 @ 44 @ N6 @ change flag ! )*
 //
 // An order whose type has no code fails the whole list.
+#include <algorithm>
+
 #include "gateway/core/conversions.h"
 #include "gateway/stock/gateway_stk.h"
 #include "gateway/stock/messages.h"
@@ -59,12 +61,11 @@ constexpr OrderTypeRow kBookRows[] = {
     {SetOf(7), kEveryNumber, 31, 31},
 };
 
+constexpr COrderTypes kOrderTypes(kOrderTypeRows, kLiveOrderTypeRows, kBookRows);
+
 int TypeCodeOf(const CRecord& record) {
-  const int kind = record.Number(kKind, kFieldSize);
-  const int tradeType = record.Number(kTradeType, kFieldSize);
-  const bool buys = record.Text(kSide, kFieldSize) == "B";
-  const int code = FindLiveOrderType(kind, tradeType, buys);
-  return code != kNoOrderType ? code : FindOrderType(kBookRows, kind, tradeType, buys);
+  return kOrderTypes.Find(record.Number(kKind, kFieldSize), record.Number(kTradeType, kFieldSize),
+                          record.Text(kSide, kFieldSize) == "B");
 }
 
 struct Quantities {
@@ -82,7 +83,8 @@ bool CallsSentOrdersReceived(int market) {
 }
 
 // The state of an order that did not fail: by the gateway's text, else by what became of it.
-const char* StateOf(const Quantities& order, std::string_view text, bool reserved, int market) {
+std::string_view StateOf(const Quantities& order, std::string_view text, bool reserved,
+                         int market) {
   if (text == kAllCancelledText) return kCancelledState;
   if (text == kSentText) {
     return CallsSentOrdersReceived(market) ? kReceivedState : kProcessingState;
@@ -97,33 +99,28 @@ const char* StateOf(const Quantities& order, std::string_view text, bool reserve
   return kPartlyFilledState;
 }
 
-// The text of a failed order, with no '!' that would end the record; empty for any other order.
+// What the gateway says of a failed order, with no '!' that would end the record; empty for any
+// other order.
 class CFailure {
  public:
-  explicit CFailure(const CRecord& record) {
-    if (record.Text(kState, kFieldSize) != "E") return;
-    for (const char c : record.Text(kText, kTextSize)) {
-      m_szText[m_nLength++] = c == '!' ? ' ' : c;
-    }
+  explicit CFailure(const CRecord& record) : m_bFailed(record.Text(kState, kFieldSize) == "E") {
+    if (!m_bFailed) return;
+    m_nLength = record.Text(kText, kTextSize).copy(m_szText, sizeof m_szText);
+    std::replace(m_szText, m_szText + m_nLength, '!', ' ');
   }
 
+  bool Failed() const { return m_bFailed; }
   std::string_view Text() const { return {m_szText, m_nLength}; }
 
  private:
-  char m_szText[kTextSize];
+  bool m_bFailed;
   size_t m_nLength = 0;
+  char m_szText[kTextSize];
 };
 
-void AppendState(CResultText& list, const CRecord& record, const Quantities& order,
-                 const CFailure& failure, int market) {
-  if (record.Text(kState, kFieldSize) != "E") {
-    const bool reserved = record.Text(kN6, kFieldSize) == "0";
-    list.AppendText(StateOf(order, record.Text(kText, kTextSize), reserved, market));
-  } else if (market == kWaitingMarket && failure.Text() == kWaitingText) {
-    list.AppendText(kWaitingState);
-  } else if (!failure.Text().empty()) {
-    list.Append(WIRE("%s&%s"), kFailedState, failure.Text());
-  }
+void AppendFailure(CResultText& list, std::string_view text, int market) {
+  if (market == kWaitingMarket && text == kWaitingText) return list.AppendText(kWaitingState);
+  if (!text.empty()) list.Append(WIRE("%s&%s"), kFailedState, text);
 }
 
 void AppendPrice(CResultText& list, const CRecord& record) {
@@ -142,25 +139,29 @@ void AppendPrice(CResultText& list, const CRecord& record) {
 }
 
 // 1: the order can be changed, 2: it cannot, empty: nothing is known.
-const char* ChangeFlagOf(const CRecord& record, const CFailure& failure) {
+std::string_view ChangeFlagOf(const CRecord& record, const CFailure& failure) {
   const std::string_view flag = record.Text(kChangeable, kFieldSize);
   if (flag == "Y") return "1";
-  if (flag == "N") return "2";
-  return failure.Text().empty() ? "" : "2";
+  return flag == "N" || !failure.Text().empty() ? "2" : "";
 }
 
 void AppendOrder(CResultText& list, const CRecord& record, int typeCode, int market) {
   const Quantities order = QuantitiesOf(record);
   const CFailure failure(record);
+  const std::string_view n6 = record.Text(kN6, kFieldSize);
   list.Append(WIRE("%s@%s@%d@%s@%d@"), record.Text(kNumber, kFieldSize),
               record.Text(kReference, kFieldSize), typeCode, record.Text(kStockCode, kFieldSize),
               order.ordered);
-  AppendState(list, record, order, failure, market);
+  if (failure.Failed()) {
+    AppendFailure(list, failure.Text(), market);
+  } else {
+    list.AppendText(StateOf(order, record.Text(kText, kTextSize), n6 == "0", market));
+  }
   list.Append(WIRE("@%d@%d@"), order.filled, order.cancelled);
   AppendPrice(list, record);
   list.Append(WIRE("@%s@%s@%s@%s@%s!"), FirstSix(record.Text(kTime, kFieldSize)),
               CTransDate(record.Text(kEntryDate, kFieldSize)).Text(),
-              CTransDate(record.Text(kOrderDate, kFieldSize)).Text(), record.Text(kN6, kFieldSize),
+              CTransDate(record.Text(kOrderDate, kFieldSize)).Text(), n6,
               ChangeFlagOf(record, failure));
 }
 
@@ -179,7 +180,7 @@ char* CGatewayStk::QueryOrderEncode(const char* branch, const char* identity, co
   return FinishEscaped(line, status, kBadParameters);
 }
 
-char* CGatewayStk::QueryOrderDecode(const char* reply, int* status) {
+IN_ONE_PIECE char* CGatewayStk::QueryOrderDecode(const char* reply, int* status) {
   *status = 1;
   const std::string_view text = AsText(reply);
   LogReply("QueryOrderDecode", text);

@@ -69,13 +69,14 @@ struct KindRange {
 
 constexpr KindRange kKindRanges[] = {{5, 17, 19}, {20, 25, 32}, {26, 26, 39}};
 
+constexpr COrderTypes kOrderTypes(kOrderTypeRows);
+
 int TypeCodeOf(const CRecord& record) {
   const int kind = record.Number(kKind, kAny);
   for (const KindRange& range : kKindRanges) {
     if (kind >= range.first && kind <= range.last) return range.code + (kind - range.first);
   }
-  return FindOrderType(kOrderTypeRows, kind, record.Number(kTradeType, kAny),
-                       record.Text(kSide, kAny) == "B");
+  return kOrderTypes.Find(kind, record.Number(kTradeType, kAny), record.Text(kSide, kAny) == "B");
 }
 
 // The two amounts that records of these kinds or types show.

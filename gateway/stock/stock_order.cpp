@@ -3,27 +3,13 @@
 
 #include "gateway/stock/gateway_stk.h"
 
-char* CGatewayStk::EncodeOrder(const OrderForm& form, const StockOrder& order, int* status) {
-  *status = 1;
-  CTextWriter line = StartRequest();
-  OrderKey key;
-  if (!WriteOrderHead(form.head, form.function, order.origin, line, key)) {
-    *status = -1;
-    return line.Text();
-  }
-  const char* const fault = form.fault(order);
-  if (fault != nullptr) return Fail(line, status, fault);
-  form.write(line, order, key);
-  return Finish(line, status, kBadParameters);
-}
-
 // The trade type follows whatever the header left, its message too.
 char* CGatewayStk::SubmitOrderEncode2(const char* branch, const char* identity,
                                       const char* password, char function, char tradeType) {
   CTextWriter line = StartRequest();
-  OrderKey unusedKey;
   const OrderOrigin origin = {AsText(branch), AsText(identity), AsText(password), {}};
-  WriteOrderHead(OrderHead::kBrief, function, origin, line, unusedKey);
+  KeyStore store;
+  WriteOrderHead(line, OrderKey(*this, OrderHead::kBrief, function, origin, store));
   line.Append(WIRE("|28=%d"), StockOrder::NumberOf(tradeType));
   int unusedStatus = 1;
   return Finish(line, &unusedStatus, kBadParameters);

@@ -2,8 +2,10 @@
 #ifndef QUORVANE_GATEWAY_STOCK_STOCK_ORDER_H_
 #define QUORVANE_GATEWAY_STOCK_STOCK_ORDER_H_
 
+#include "gateway/core/branch_hints.h"
 #include "gateway/core/number_set.h"
 #include "gateway/core/request_head.h"
+#include "gateway/stock/gateway_stk.h"
 #include "gateway/stock/messages.h"
 
 // The arguments of one order by name. The host's bytes are unsigned numbers, but for the two that
@@ -27,7 +29,7 @@ struct StockOrder {
         n6(NumberOf(hostN6)) {}
 
   // The number of a host's byte.
-  static int NumberOf(char byte) { return static_cast<unsigned char>(byte); }
+  static uint8_t NumberOf(char byte) { return static_cast<uint8_t>(byte); }
 
   OrderOrigin origin;
   std::string_view stockCode;
@@ -37,10 +39,10 @@ struct StockOrder {
   int price;                   // hundredths
   char side;
   char flag13;
-  int kind;
-  int priceKind;
-  int tradeType;
-  int n6;
+  uint8_t kind;
+  uint8_t priceKind;
+  uint8_t tradeType;
+  uint8_t n6;
 };
 
 // Trade types: lots, an odd lot, lots at the session's fixed price.
@@ -68,6 +70,15 @@ inline bool IsStockCodeTooLong(const StockOrder& order) {
   return order.stockCode.size() > kStockCodeChars;
 }
 
+// What opens a payload, in front of the order's key: it stands bare behind the last field, or in
+// tag PL.
+ALWAYS_INLINE inline auto OpenBare() {
+  return MakePiece(WIRE("!!"));
+}
+ALWAYS_INLINE inline auto OpenTagged() {
+  return MakePiece(WIRE("|PL=S!!"));
+}
+
 // What one encoder sends: behind the plain header a bare payload, behind the signed one a payload
 // in tag PL. `fault` tells what keeps an order from being sent, null for nothing; `write` appends
 // body and payload to the header.
@@ -77,5 +88,22 @@ struct OrderForm {
   const char* (*fault)(const StockOrder& order);
   void (*write)(CTextWriter& line, const StockOrder& order, const OrderKey& key);
 };
+
+// The road that every stock order takes; `form` is a constant, so that its functions are known.
+ALWAYS_INLINE inline char* CGatewayStk::EncodeOrder(const OrderForm& form, const StockOrder& order,
+                                                    int* status) {
+  *status = 1;
+  CTextWriter line = StartRequest();
+  KeyStore store;
+  const OrderKey key(*this, form.head, form.function, order.origin, store);
+  if (!WriteOrderHead(line, key)) {
+    *status = -1;
+    return line.Text();
+  }
+  const char* const fault = form.fault(order);
+  if (fault != nullptr) return Fail(line, status, fault);
+  form.write(line, order, key);
+  return Finish(line, status, kBadParameters);
+}
 
 #endif  // QUORVANE_GATEWAY_STOCK_STOCK_ORDER_H_

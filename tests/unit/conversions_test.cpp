@@ -100,6 +100,66 @@ TEST_F(Conversions, TransDateGoesBackAndForth) {
   }
 }
 
+// Every year of four digits, of three and of two, by the arithmetic of plain numbers.
+TEST_F(Conversions, TransDateMovesEveryYear) {
+  for (int year = 0; year <= 9999; ++year) {
+    char date[20], expected[20];
+    snprintf(date, sizeof date, "%04d0115", year);
+    snprintf(expected, sizeof expected, "%d0115", year - 1911);
+    EXPECT_EQ(CTransDate(date).Text(), expected);
+    if (year > 999) continue;
+    snprintf(expected, sizeof expected, "%04d0115", year + 1911);
+    snprintf(date, sizeof date, "%03d0115", year);
+    EXPECT_EQ(CTransDate(date).Text(), expected);
+    if (year > 99) continue;
+    snprintf(date, sizeof date, "%02d0115", year);
+    EXPECT_EQ(CTransDate(date).Text(), expected);
+  }
+}
+
+// What ScalePrice says of a text that begins with no sign, digit by digit.
+int32_t PlainPrice(const std::string& text, int decimals) {
+  const auto power = [](int exponent) {
+    return exponent < 0   ? int64_t{0}
+           : exponent > 9 ? INT32_MAX
+                          : static_cast<int64_t>(pow(10, exponent));
+  };
+  const size_t point = text.find('.');
+  const auto whole = static_cast<int32_t>(atoll(text.substr(0, point).c_str()));
+  auto price = static_cast<uint32_t>(whole * power(decimals));
+  if (point != std::string::npos) {
+    const std::string digits = text.substr(point + 1);
+    const auto fraction = static_cast<int32_t>(atoll(digits.c_str()));
+    const int missing = decimals - static_cast<int>(digits.size());
+    price += static_cast<uint32_t>(missing >= 0 ? fraction * power(missing)
+                                                : fraction / power(-missing));
+  }
+  return static_cast<int32_t>(price);
+}
+
+TEST_F(Conversions, PricesOfEveryShapeAreReadDigitByDigit) {
+  const std::string digits = "9876543210";
+  for (int decimals = -2; decimals <= 11; ++decimals) {
+    for (size_t size = 0; size <= digits.size(); ++size) {
+      const std::string whole = digits.substr(0, size);
+      EXPECT_EQ(ScalePrice(whole, decimals), PlainPrice(whole, decimals))
+          << whole << ", " << decimals;
+      for (size_t at = 0; at < size; ++at) {
+        for (const char* letters : {".", "-", "x", " ", "\xff"}) {
+          std::string text = whole;
+          text[at] = letters[0];
+          if (text[0] == '-') continue;
+          EXPECT_EQ(ScalePrice(text, decimals), PlainPrice(text, decimals))
+              << text << ", " << decimals;
+          text[size / 2] = '.';
+          EXPECT_EQ(ScalePrice(text, decimals), PlainPrice(text, decimals))
+              << text << ", " << decimals;
+        }
+      }
+    }
+  }
+}
+
 TEST_F(Conversions, RocDateToStandardDateAddsTheYears) {
   const struct {
     int given, expected;

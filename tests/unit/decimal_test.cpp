@@ -7,6 +7,7 @@
 #include <cstdio>
 #include <cstdlib>
 #include <random>
+#include <string>
 
 #include "tests/unit/session.h"
 
@@ -89,6 +90,64 @@ TEST(Decimal, GeneratedTextsAreReadAsTheCLibraryReadsThem) {
     std::string text(random() % 26, '0');
     for (char& c : text) c = letters[random() % letters.size()];
     ExpectReadAsC(text);
+  }
+}
+
+// Each short text of digits, and with any other character in any of its places.
+TEST(Decimal, ShortTextsAreReadAsTheCLibraryReadsThem) {
+  const std::string digits = "1839204756";
+  for (size_t size = 0; size <= digits.size(); ++size) {
+    const std::string text = digits.substr(0, size);
+    ExpectReadAsC(text);
+    for (size_t at = 0; at < size; ++at) {
+      for (int c = 1; c < 256; ++c) {
+        std::string changed = text;
+        changed[at] = static_cast<char>(c);
+        ExpectReadAsC(changed);
+      }
+    }
+  }
+  for (int number = 0; number <= 99999; ++number) ExpectReadAsC(std::to_string(number));
+}
+
+TEST(Decimal, ReadingTouchesNothingOutsideTheSlice) {
+  const std::string digits = "1234567890";
+  for (const EPlacement placement : {EPlacement::kBeforeUnreadable, EPlacement::kAfterUnreadable}) {
+    for (size_t size = 1; size <= digits.size(); ++size) {
+      const CGuardedBlock block(placement, digits.data(), size);
+      EXPECT_EQ(ReadInt32({block.Data(), size}), std::stoi(digits.substr(0, size)));
+    }
+  }
+}
+
+TEST(Decimal, FourDigitsAreToldAndRead) {
+  for (uint32_t number = 0; number <= 9999; ++number) {
+    char text[8];
+    snprintf(text, sizeof text, "%04u", number);
+    uint32_t word;
+    memcpy(&word, text, sizeof word);
+    ASSERT_TRUE(AreFourDigits(word));
+    ASSERT_EQ(ValueOfFourDigits(word), number);
+    for (int at = 0; at < 4; ++at) {
+      for (char c : {'/', ':', '@', ' ', '\xb0', '\0', '\xff'}) {
+        char changed[4];
+        memcpy(changed, text, sizeof changed);
+        changed[at] = c;
+        memcpy(&word, changed, sizeof word);
+        ASSERT_FALSE(AreFourDigits(word)) << number << ", " << at << ", " << int{c};
+      }
+    }
+  }
+}
+
+TEST(Decimal, CharactersAreFoundInAWord) {
+  const std::string text = "a.b..\xae.\x2f";
+  for (size_t size = 4; size <= text.size(); ++size) {
+    const uint64_t found = BytesEqual(LoadWord({text.data(), size}), '.');
+    for (size_t at = 0; at < 8; ++at) {
+      const bool expected = at < size && text[at] == '.';
+      EXPECT_EQ(found >> 8 * at & 0xff, expected ? 0x80U : 0U) << size << ", " << at;
+    }
   }
 }
 
@@ -187,9 +246,23 @@ TEST(Decimal, ArithmeticWraps) {
   EXPECT_EQ(WrapMultiply(int64_t{INT64_MIN}, int64_t{-1}), INT64_MIN);
 }
 
-TEST(Decimal, ShortNumbersHaveNoZerosBefore) {
-  for (int64_t number = 0; number <= 1200; ++number) {
-    char text[8];
+TEST(Decimal, ShortDigitsHaveNoZerosBefore) {
+  for (uint32_t number = 0; number < kShortNumberEnd; ++number) {
+    char text[4];
+    EXPECT_EQ(std::string(text, ShortDigits(number).WriteTo(text)), std::to_string(number));
+  }
+}
+
+TEST(Decimal, NumbersOfEveryLengthHaveNoZerosBefore) {
+  for (int64_t power = 1; power <= INT64_MAX / 10; power *= 10) {
+    for (int64_t number : {power - 1, power, power + 1, 7 * power, -power}) {
+      char text[20];
+      EXPECT_EQ(std::string(text, WriteNumber(text, number)), std::to_string(number));
+    }
+  }
+  for (int64_t number :
+       {int64_t{INT32_MAX}, int64_t{INT32_MIN}, int64_t{INT64_MAX}, int64_t{INT64_MIN}}) {
+    char text[20];
     EXPECT_EQ(std::string(text, WriteNumber(text, number)), std::to_string(number));
   }
 }

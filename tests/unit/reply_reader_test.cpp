@@ -62,9 +62,28 @@ std::string TagOfFullTable(int row) {
   return row < 30 ? "75" + std::to_string(row - 20) : row == 30 ? "75" : "76";
 }
 
+// The key of a reply of this one field. Every key by which a table finds it is the same, as long as
+// the table lists it.
 TagKey KeyOf(const std::string& field) {
-  const CGuardedBlock block(EPlacement::kBeforeUnreadable, field.data(), field.size());
-  return TagKeyOf(block.Data(), block.Data() + field.size());
+  const std::string reply = "|" + field;
+  const CGuardedBlock block(EPlacement::kBeforeUnreadable, reply.data(), reply.size());
+  const CTagReader tags(block.Data(), block.Data() + reply.size());
+  const TagKey key = tags.KeyBehind(block.Data());
+  const TagKey shortKey = tags.ShortKeyBehind(block.Data());
+  EXPECT_TRUE(shortKey == key || kTags.Find(shortKey) == CTagTable::kNone) << field;
+  EXPECT_TRUE(shortKey == key || kFullTable.Find(shortKey) == CTagTable::kNone) << field;
+  return key;
+}
+
+TEST(ReplyReader, KeysOfFieldsBehindTheFirst) {
+  const std::string reply = "|68=0000|751=5|29=";
+  const CTagReader tags(reply.data(), reply.data() + reply.size());
+  EXPECT_EQ(tags.KeyBehind(reply.data()), MakeTagKey("68"));
+  EXPECT_EQ(tags.KeyBehind(reply.data() + 8), MakeTagKey("751"));
+  EXPECT_EQ(tags.KeyBehind(reply.data() + 14), MakeTagKey("29"));
+  EXPECT_EQ(tags.ShortKeyBehind(reply.data()), MakeTagKey("68"));
+  EXPECT_EQ(tags.ShortKeyBehind(reply.data() + 14), MakeTagKey("29"));
+  EXPECT_EQ(tags.KeyBehind(reply.data() + reply.size()), kNoTag);
 }
 
 TEST(ReplyReader, FieldsAreToldByTagsOfTwoAndThreeCharacters) {

@@ -2,9 +2,11 @@
 
 #include "gateway/core/text_writer.h"
 
+#include <algorithm>
 #include <climits>
 #include <cstdio>
 #include <cstdlib>
+#include <cstring>
 #include <utility>
 
 #include "tests/unit/session.h"
@@ -156,6 +158,96 @@ TEST(TextWriter, PieceThatFitsExactlyIsWhole) {
     EXPECT_EQ(line.writer.Overflowed(), !fits) << size;
     EXPECT_STREQ(line.writer.Text(), fits ? expected.c_str() : "") << size;
   }
+}
+
+// The same with every kind of value at once, whose writing may touch more than it prints.
+TEST(TextWriter, ValuesOfEveryKindFitExactly) {
+  const char padded[32] = "192.168.100.123";
+  for (const int number : {0, 7, 12, 345, 6789, 10000, 12345678, 123456789, INT_MAX, -1, INT_MIN}) {
+    const RepeatedNumber repeated(number);
+    char expected[200];
+    snprintf(expected, sizeof expected, "%d|%d|%d|%s|%s|x%s", number, number, number & 0xff,
+             "192.168", "abc", "1234567");
+    for (size_t size = 1; size <= strlen(expected) + 90; ++size) {
+      Line line(size);
+      line.writer.Append(WIRE("%d|%d|%d|%s|%s|%c%s"), number, repeated,
+                         static_cast<uint8_t>(number & 0xff), PaddedText{{padded, 7}},
+                         FixedText<3>{{'a', 'b', 'c'}}, 'x', "1234567");
+      const bool fits = strlen(expected) < size;
+      EXPECT_EQ(line.writer.Overflowed(), !fits) << size;
+      EXPECT_STREQ(line.writer.Text(), fits ? expected : "") << size;
+    }
+  }
+}
+
+TEST(TextWriter, LongNumbersOfEveryWidthFitExactly) {
+  for (const int64_t number : {int64_t{5}, int64_t{-5}, int64_t{INT64_MAX}, int64_t{INT64_MIN}}) {
+    char expected[80];
+    snprintf(expected, sizeof expected, "%lld|%010d|%02d", static_cast<long long>(number),
+             static_cast<int>(number % 1000), static_cast<int>(number % 1000));
+    for (size_t size = 1; size <= strlen(expected) + 60; ++size) {
+      Line line(size);
+      line.writer.Append(WIRE("%ld|%010d|%02d"), number, static_cast<int>(number % 1000),
+                         static_cast<int>(number % 1000));
+      const bool fits = strlen(expected) < size;
+      EXPECT_EQ(line.writer.Overflowed(), !fits) << size;
+      EXPECT_STREQ(line.writer.Text(), fits ? expected : "") << size;
+    }
+  }
+}
+
+// Several pieces are joined as if each were appended alone: those that fit before the first that
+// does not are written, and a NUL character ends its own piece.
+TEST(TextWriter, PiecesTogetherAreAsPiecesOneByOne) {
+  for (const char c : {'c', '\0'}) {
+    for (size_t size = 1; size <= 60; ++size) {
+      Line together(size), alone(size);
+      together.writer.AppendPieces(MakePiece(WIRE("|1=%d"), 12345),
+                                   MakePiece(WIRE("|2=%c|3=%s"), c, "ab"), MakePiece(WIRE("!!")),
+                                   MakePiece(WIRE("%s_"), "12345"));
+      alone.writer.Append(WIRE("|1=%d"), 12345);
+      alone.writer.Append(WIRE("|2=%c|3=%s"), c, "ab");
+      alone.writer.Append(WIRE("!!"));
+      alone.writer.Append(WIRE("%s_"), "12345");
+      EXPECT_EQ(together.writer.Overflowed(), alone.writer.Overflowed()) << size;
+      EXPECT_STREQ(together.writer.Text(), alone.writer.Text()) << size;
+    }
+  }
+}
+
+TEST(TextWriter, PaddedTextsOfEveryLengthAreCopied) {
+  const std::string letters = "abcdefghijklmnopqrstuvwxyz0123456789ABCDEFGHIJ";
+  for (size_t length = 0; length <= 40; ++length) {
+    const CGuardedBlock source(EPlacement::kBeforeUnreadable, letters.data(),
+                               std::max(length, PaddedText::kReadable));
+    for (size_t size : {length + 3, length + PaddedText::kReadable + 4}) {
+      Line line(size);
+      line.writer.Append(WIRE("|%s|"), PaddedText{{source.Data(), length}});
+      EXPECT_EQ(std::string(line.writer.Text()), "|" + letters.substr(0, length) + "|");
+    }
+  }
+}
+
+TEST(TextWriter, BytesArePrintedAsNumbers) {
+  for (int number = 0; number < 256; ++number) {
+    Line line(16);
+    line.writer.Append(WIRE("%d|"), static_cast<uint8_t>(number));
+    EXPECT_EQ(std::string(line.writer.Text()), std::to_string(number) + "|");
+  }
+}
+
+// Neither end of either side is passed.
+TEST(TextWriter, CopiesTouchNothingElse) {
+  const std::string letters = "abcdefghijklmnopqrstuvwxyz0123456789ABCDEFGHIJ";
+  for (const EPlacement placement : {EPlacement::kBeforeUnreadable, EPlacement::kAfterUnreadable}) {
+    for (size_t size = 1; size <= 40; ++size) {
+      const CGuardedBlock from(placement, letters.data(), size);
+      const CGuardedBlock to(placement, std::string(size, '#').data(), size);
+      CopyShort(to.Data(), from.Data(), size);
+      EXPECT_EQ(std::string(to.Data(), size), letters.substr(0, size));
+    }
+  }
+  CopyShort(nullptr, nullptr, 0);
 }
 
 TEST(TextWriter, PieceThatANulEndsNeedsNoRoomForItsRest) {

@@ -1,0 +1,54 @@
+// The codes of order types: what the tables hold beforehand, against the rows searched one by one.
+
+#include "gateway/stock/order_type_codes.h"
+
+#include <gtest/gtest.h>
+
+#include <climits>
+#include <vector>
+
+namespace gateway_tests {
+namespace {
+
+int SearchRows(const std::vector<OrderTypeRow>& rows, int kind, int tradeType, bool buys) {
+  for (const OrderTypeRow& row : rows) {
+    if (row.kinds.Has(kind) && row.tradeTypes.Has(tradeType)) return buys ? row.buy : row.other;
+  }
+  return kNoOrderType;
+}
+
+std::vector<int> Numbers() {
+  std::vector<int> numbers = {INT_MIN, INT_MAX, 255, 256, -256};
+  for (int number = -3; number <= 40; ++number) numbers.push_back(number);
+  return numbers;
+}
+
+template <class... Lists>
+void ExpectRowsInOrder(const COrderTypes& types, const Lists&... lists) {
+  std::vector<OrderTypeRow> rows;
+  (rows.insert(rows.end(), std::begin(lists), std::end(lists)), ...);
+  for (int kind : Numbers()) {
+    for (int tradeType : Numbers()) {
+      for (bool buys : {false, true}) {
+        EXPECT_EQ(types.Find(kind, tradeType, buys), SearchRows(rows, kind, tradeType, buys))
+            << kind << ", " << tradeType << ", " << buys;
+      }
+    }
+  }
+}
+
+TEST(OrderTypeCodes, TablesHoldTheFirstRowThatNamesAnOrder) {
+  ExpectRowsInOrder(COrderTypes(kOrderTypeRows), kOrderTypeRows);
+  ExpectRowsInOrder(COrderTypes(kOrderTypeRows, kLiveOrderTypeRows), kOrderTypeRows,
+                    kLiveOrderTypeRows);
+}
+
+TEST(OrderTypeCodes, EarlierRowsHideLaterOnes) {
+  constexpr OrderTypeRow kFirst[] = {{SetOf(1), SetOf(2), 1, 2}};
+  constexpr OrderTypeRow kSecond[] = {{SetOf(1), kEveryNumber, 3, 4},
+                                      {SetOf(1, 8), SetOf(3), 5, 6}};
+  ExpectRowsInOrder(COrderTypes(kFirst, kSecond), kFirst, kSecond);
+}
+
+}  // namespace
+}  // namespace gateway_tests
