@@ -7,10 +7,13 @@ size_t PrintPiece(const char* format, const WireArgument* values, char* at) {
     size += text.size();
   };
   for (;; ++format) {
-    const size_t literal = strcspn(format, "%");
-    put({format, literal});
-    format += literal;
-    if (*format == '\0') return size;
+    const char* const mark = strchr(format, '%');
+    if (mark == nullptr) {
+      put(format);
+      return size;
+    }
+    put({format, static_cast<size_t>(mark - format)});
+    format = mark;
     size_t width = 0;
     for (size_t digit; (digit = static_cast<size_t>(*++format - '0')) <= 9;) {
       width = width * 10 + digit;
