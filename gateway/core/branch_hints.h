@@ -4,8 +4,8 @@
 #ifndef QUORVANE_GATEWAY_CORE_BRANCH_HINTS_H_
 #define QUORVANE_GATEWAY_CORE_BRANCH_HINTS_H_
 
-// A build for a debugger or for coverage counters keeps its functions apart.
-#ifdef __OPTIMIZE__
+// A build without inlining, as for a debugger, keeps its functions apart.
+#ifndef __NO_INLINE__
 #define ALWAYS_INLINE __attribute__((always_inline))
 #define IN_ONE_PIECE __attribute__((flatten))
 #else

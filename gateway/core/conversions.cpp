@@ -21,12 +21,6 @@ std::string_view UpTo(std::string_view text, size_t end) {
   return {text.data(), end < text.size() ? end : text.size()};
 }
 
-// A number that begins with another digit than 0 need not be read.
-bool IsZero(std::string_view number) {
-  const char first = number.front();
-  return (first < '1' || first > '9') && ReadInt32(number) == 0;
-}
-
 // 32- and 64-bit arithmetic of one and the same reading.
 struct Narrow {
   using Number = int32_t;
@@ -101,7 +95,7 @@ CTransDate::CTransDate(std::string_view date) : m_text(date) {
 // A year that is no number, or one before the calendar.
 void CTransDate::ConvertUnusual() {
   const std::string_view date = m_text;
-  if (IsZero(date)) return;
+  if (ReadInt32(date) == 0) return;
   const std::string_view monthAndDay = From(date, date.size() - 4);
   const int year = ReadInt32(UpTo(date, date.size() - 4));
   CTextWriter text(m_szDate, sizeof m_szDate);

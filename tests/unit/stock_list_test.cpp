@@ -338,7 +338,10 @@ TEST_F(StockLists, FailedOrder) {
 TEST_F(StockLists, ChangeFlagOfAnOrderThatDidNotFail) {
   for (const auto& [flag, shown] :
        TFields{{"Y", "1"}, {"N", "2"}, {"", ""}, {"y", ""}, {"YY", ""}}) {
-    EXPECT_EQ(BookField(With(kOrder, "JV", flag), 13), shown) << flag;
+    for (const char* remark : {"", "委託成功", "全部取消", "!"}) {
+      EXPECT_EQ(BookField(With(With(kOrder, "JV", flag), "K1", remark), 13), shown)
+          << flag << remark;
+    }
   }
 }
 
