@@ -189,7 +189,8 @@ class CGatewayPub {
   static char* FinishEscaped(CTextWriter& line, int* status, const char* overflow);
 
   // Ends an encoder with `message` in place of the request and status -1.
-  static char* Fail(CTextWriter& line, int* status, const char* message);
+  __attribute__((noinline, cold)) static char* Fail(CTextWriter& line, int* status,
+                                                    const char* message);
 
   // Ends a decoder with a short result that lies in m_szBuffer.
   char* Answer(std::string_view text);

@@ -61,7 +61,7 @@ bool WriteIdentity(CTextWriter& line, const OrderKey& key) {
 }
 
 // Any other origin than an account behind the usual header.
-bool WriteUnusualOrigin(CTextWriter& line, const OrderKey& key) {
+__attribute__((noinline, cold)) bool WriteUnusualOrigin(CTextWriter& line, const OrderKey& key) {
   if (key.head == OrderHead::kBrief) {
     line.Append(WIRE("F=1|KIND=%c|CB=1|BHNO=%s|VER=%s|SN=%s|11=%s|65=00%s|14=%c"), key.market,
                 key.origin.branch, kProtocolVersion, key.serialNo, key.edition, key.stamp.requestId,

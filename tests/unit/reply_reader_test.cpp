@@ -128,6 +128,18 @@ TEST(ReplyReader, FullTableFindsEachOfItsTagsAndNoOther) {
   EXPECT_EQ(kFullTable.Find(kNoTag), CTagTable::kNone);
 }
 
+TEST(ReplyReader, UnknownFieldsAreKeptNowhere) {
+  struct {
+    CRecord record{kTags};
+    char behind[8192];
+  } host;
+  memset(host.behind, '#', sizeof host.behind);
+  const std::string_view reply = "|00=1|Zz=7|x|Zzz=8|=|68=0000|01=";
+  CRecordWalker walker(reply, 300);
+  ASSERT_TRUE(walker.Next(host.record));
+  EXPECT_EQ(std::string_view(host.behind, sizeof host.behind), std::string(8192, '#'));
+}
+
 TEST(ReplyReader, RecordOfAFullTableHoldsEveryField) {
   std::string reply = "|00=";
   for (int row = 31; row >= 0; --row)
