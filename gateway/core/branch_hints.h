@@ -1,6 +1,9 @@
-// What a condition nearly always is, so that the usual way through the code runs straight on, and
-// what becomes part of every caller. Only where it was measured to pay: in what every request and
-// every field passes through.
+// Hints to the compiler. Only where they were measured to pay: in what every request and every
+// field passes through.
+//
+//   Mostly, Rarely   what a condition nearly always is, so that the usual way runs straight on
+//   ALWAYS_INLINE    becomes part of each caller
+//   IN_ONE_PIECE     takes in all that it calls
 #ifndef QUORVANE_GATEWAY_CORE_BRANCH_HINTS_H_
 #define QUORVANE_GATEWAY_CORE_BRANCH_HINTS_H_
 

@@ -1,4 +1,4 @@
-// The road that every stock order takes, and the brief order.
+// The brief order, which is a header and its trade type.
 #include "gateway/stock/stock_order.h"
 
 #include "gateway/stock/gateway_stk.h"
