@@ -28,7 +28,7 @@ import org.junit.jupiter.api.Test;
 /** Holds the table of operations against the natives that it describes. */
 class OperationTableTest {
     private static final Path HOST_CLASS =
-            Path.of("java/com/brindlex/kernel/quorvane/gatewayjni.java");
+            Path.of("java/client/com/brindlex/kernel/quorvane/gatewayjni.java");
 
     private static Map<String, Method> natives() {
         Map<String, Method> natives = new TreeMap<>();
