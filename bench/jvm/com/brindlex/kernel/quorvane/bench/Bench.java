@@ -1,11 +1,18 @@
 package com.brindlex.kernel.quorvane.bench;
 
+import static com.brindlex.kernel.quorvane.bench.EntryPoints.ADDRESS;
+import static com.brindlex.kernel.quorvane.bench.EntryPoints.BRANCH;
+import static com.brindlex.kernel.quorvane.bench.EntryPoints.DATE;
+import static com.brindlex.kernel.quorvane.bench.EntryPoints.IDENTITY;
+import static com.brindlex.kernel.quorvane.bench.EntryPoints.PASSWORD;
+import static com.brindlex.kernel.quorvane.bench.EntryPoints.REFERENCE;
+import static com.brindlex.kernel.quorvane.bench.EntryPoints.SERIAL;
+import static com.brindlex.kernel.quorvane.bench.EntryPoints.STATUS;
+
 import com.brindlex.kernel.quorvane.gatewayjni;
 import java.io.IOException;
-import java.nio.charset.StandardCharsets;
 import java.nio.file.Files;
 import java.nio.file.Path;
-import java.util.LinkedHashMap;
 import java.util.Map;
 import java.util.function.BiFunction;
 import java.util.function.Supplier;
@@ -16,17 +23,7 @@ import java.util.function.Supplier;
  * folder of replies, {@code DECODER.RECORDS}; the ratios are written to the file JSON as well.
  */
 final class Bench {
-    private static final String SERIAL = "A1B2C3D4E5F60718";
-    private static final String ADDRESS = "192.168.100.123";
-    private static final String BRANCH = "9A00";
-    private static final String IDENTITY = "A123456789&1234567";
-    private static final String PASSWORD = "s3cretpw";
-    private static final String REFERENCE = "20240115-100123&A0012345";
-    private static final String DATE = "1130115";
-
-    private static final int[] STATUS = new int[1];
-
-    private static final Map<String, BiFunction<String, int[], String>> LISTS = lists();
+    private static final long WARM_UP_NANOS = 700_000_000L;
 
     private final Path samples;
     private final RatioTable table = new RatioTable();
@@ -44,25 +41,6 @@ final class Bench {
         System.exit(bench.table.allMet() ? 0 : 1);
     }
 
-    private static Map<String, BiFunction<String, int[], String>> lists() {
-        Map<String, BiFunction<String, int[], String>> all = new LinkedHashMap<>();
-        all.put("AuthDecode", gatewayjni::AuthDecode);
-        all.put("GetTotalAccountDecode", gatewayjni::GetTotalAccountDecode);
-        all.put("QueryReplyDecode", gatewayjni::QueryReplyDecode);
-        all.put("QueryInventoryDecode", gatewayjni::QueryInventoryDecode);
-        all.put("QueryInventoryDecodeJZG", gatewayjni::QueryInventoryDecodeJZG);
-        all.put("PaymentDecode", gatewayjni::PaymentDecode);
-        all.put("PaymentDecodeJZG", gatewayjni::PaymentDecodeJZG);
-        all.put("FutQueryOrderDecode", gatewayjni::FutQueryOrderDecode);
-        all.put("FutQueryReplyDecode", gatewayjni::FutQueryReplyDecode);
-        all.put("FutQueryInventoryDecode", gatewayjni::FutQueryInventoryDecode);
-        return all;
-    }
-
-    private String sample(String decoder, int records) throws IOException {
-        return Files.readString(samples.resolve(decoder + "." + records), StandardCharsets.UTF_8);
-    }
-
     private static void demandEqual(String what, String expected, String got) {
         if (!expected.equals(got)) {
             throw new IllegalStateException(what + " differs from the library:\n"
@@ -75,13 +53,13 @@ final class Bench {
         StockBook byIndex = new IndexOfStockBook();
         StockBook bySplit = new SplitStockBook();
         for (int records : new int[] {1000, 1, 20, 20000}) {
-            String reply = sample("QueryOrderDecode", records);
-            String result = gatewayjni.QueryOrderDecode(0, reply, STATUS);
+            String reply = EntryPoints.sample(samples, "QueryOrderDecode", records);
+            String result = EntryPoints.stockBook(reply, STATUS);
             demandEqual("The indexOf decoder", result, byIndex.decode(reply));
             demandEqual("The split + HashMap decoder", result, bySplit.decode(reply));
             CrossingFloor.layReady(result);
-            Contest contest = new Contest()
-                    .add(() -> gatewayjni.QueryOrderDecode(0, reply, STATUS))
+            Contest contest = new Contest(WARM_UP_NANOS)
+                    .add(() -> EntryPoints.stockBook(reply, STATUS))
                     .add(() -> CrossingFloor.decode(reply, STATUS))
                     .add(() -> byIndex.decode(reply))
                     .add(() -> bySplit.decode(reply))
@@ -100,21 +78,18 @@ final class Bench {
 
     private static Contest beside(Supplier<String> call, Supplier<String> floor) {
         CrossingFloor.layReady(call.get());
-        return new Contest().add(call).add(floor).run();
+        return new Contest(WARM_UP_NANOS).add(call).add(floor).run();
     }
 
     private void orders() {
         table.group("Requests through the JVM: entry point / crossing floor");
         byte zero = 0;
         byte one = 1;
-        byte buy = 'B';
         Contest stock = beside(
-                () -> gatewayjni.SubmitOrderEncode(
-                        0, 0, 7, SERIAL, ADDRESS, BRANCH, IDENTITY, PASSWORD, "2330", DATE, 2, 1000,
-                        58550, buy, (byte) '0', zero, zero, zero, one, STATUS),
+                EntryPoints::submitOrder,
                 () -> CrossingFloor.stockOrder(
                         0, 0, 7, SERIAL, ADDRESS, BRANCH, IDENTITY, PASSWORD, "2330", DATE, 2, 1000,
-                        58550, buy, (byte) '0', zero, zero, zero, one, STATUS));
+                        58550, (byte) 'B', (byte) '0', zero, zero, zero, one, STATUS));
         table.atMost("SubmitOrderEncode", stock, 0, 1, 1.9, 1.6);
         Contest futures = beside(
                 () -> gatewayjni.FutSubmitOrderEncode(
@@ -136,8 +111,8 @@ final class Bench {
 
     private void lists1000() throws IOException {
         table.group("Other lists through the JVM, 1,000 records: entry point / floor");
-        for (Map.Entry<String, BiFunction<String, int[], String>> list : LISTS.entrySet()) {
-            String reply = sample(list.getKey(), 1000);
+        for (Map.Entry<String, BiFunction<String, int[], String>> list : EntryPoints.otherLists().entrySet()) {
+            String reply = EntryPoints.sample(samples, list.getKey(), 1000);
             Contest contest = beside(
                     () -> list.getValue().apply(reply, STATUS),
                     () -> CrossingFloor.decode(reply, STATUS));

@@ -9,11 +9,10 @@ import java.util.function.Supplier;
 
 /**
  * Measures several ways of doing one thing side by side: all are warmed up first, then they take
- * turns, and the median of the turns counts, of a ratio as of a time. Time is the thread's own, so that other programs
- * and the collector's threads do not count.
+ * turns, and the median of the turns counts, of a ratio as of a time. Time is the thread's own, so
+ * that other programs and the collector's threads do not count.
  */
 final class Contest {
-    private static final long WARM_UP_NANOS = 700_000_000L;
     private static final long TURN_NANOS = 1_000_000L;
     private static final int TURNS = 201;
 
@@ -33,6 +32,12 @@ final class Contest {
     }
 
     private final List<Contestant> contestants = new ArrayList<>();
+    private final long warmUpNanos;
+
+    /** A contest without ways yet, each of which is warmed up for so long. */
+    Contest(long warmUpNanos) {
+        this.warmUpNanos = warmUpNanos;
+    }
 
     /** Adds a way. */
     Contest add(Supplier<?> call) {
@@ -46,7 +51,9 @@ final class Contest {
             warmUp(contestant);
         }
         for (int turn = 0; turn < TURNS; turn++) {
-            for (Contestant contestant : contestants) {
+            for (int i = 0; i < contestants.size(); i++) {
+                // The order turns with the turns: none is always the one that comes after another.
+                Contestant contestant = contestants.get((i + turn) % contestants.size());
                 long nanos = time(contestant.call, contestant.repeats);
                 contestant.turns[turn] = (double) nanos / contestant.repeats;
             }
@@ -68,10 +75,10 @@ final class Contest {
         return median(ratios);
     }
 
-    private static void warmUp(Contestant contestant) {
+    private void warmUp(Contestant contestant) {
         long calls = 0;
         long spent = 0;
-        while (spent < WARM_UP_NANOS || calls < 3) {
+        while (spent < warmUpNanos || calls < 3) {
             spent += time(contestant.call, 1 + calls / 8);
             calls += 1 + calls / 8;
         }
