@@ -13,46 +13,46 @@ constexpr char kSeparators[] = " ,\t\n";
 constexpr size_t kMostFilters = 32;
 
 struct Filter {
-  const char* m_szTag;
-  size_t m_nTagLen;
-  int m_nLowest;  // the lowest priority to write
+  const char* tag;
+  size_t tagLen;
+  int lowest;  // the lowest priority to write
 };
 
-/// The filters of ANDROID_LOG_TAGS: filled at the first line, read-only from then on.
+// The filters of ANDROID_LOG_TAGS: filled at the first line, read-only from then on.
 struct Filters {
-  char* m_szText;  // a copy, since the environment may change; it lives as long as the process
-  Filter m_aFilter[kMostFilters];
-  size_t m_nCount;
-  int m_nLowest;  // no filter lets anything below this through
+  char* text;  // a copy, since the environment may change; it lives as long as the process
+  Filter filter[kMostFilters];
+  size_t count;
+  int lowest;  // no filter lets anything below this through
 };
 
 Filters g_filters = {nullptr, {}, 0, ANDROID_LOG_SILENT};
 pthread_once_t g_once = PTHREAD_ONCE_INIT;
 
-/// The priority that stands behind a filter's colon; what is no priority asks for nothing.
+// The priority that stands behind a filter's colon; what is no priority asks for nothing.
 int PriorityOf(char letter) {
   const char* first = kLetters + ANDROID_LOG_VERBOSE;
   const char* found = letter == '\0' ? nullptr : strchr(first, letter);
   return found == nullptr ? ANDROID_LOG_SILENT : static_cast<int>(found - kLetters);
 }
 
-/// Adds one filter, `tag:priority` or `tag` alone, which asks for everything.
+// Adds one filter, `tag:priority` or `tag` alone, which asks for everything.
 void Add(const char* text, size_t length) {
-  if (g_filters.m_nCount == kMostFilters) return;
+  if (g_filters.count == kMostFilters) return;
   const void* colon = memchr(text, ':', length);
   const size_t tag =
       colon == nullptr ? length : static_cast<size_t>(static_cast<const char*>(colon) - text);
   const int lowest = tag + 1 < length ? PriorityOf(text[tag + 1]) : ANDROID_LOG_VERBOSE;
-  g_filters.m_aFilter[g_filters.m_nCount++] = {text, tag, lowest};
-  if (lowest < g_filters.m_nLowest) g_filters.m_nLowest = lowest;
+  g_filters.filter[g_filters.count++] = {text, tag, lowest};
+  if (lowest < g_filters.lowest) g_filters.lowest = lowest;
 }
 
 void ReadFilters() {
   const char* wanted = getenv("ANDROID_LOG_TAGS");
   if (wanted == nullptr) return;
-  g_filters.m_szText = strdup(wanted);
-  if (g_filters.m_szText == nullptr) return;
-  const char* text = g_filters.m_szText + strspn(g_filters.m_szText, kSeparators);
+  g_filters.text = strdup(wanted);
+  if (g_filters.text == nullptr) return;
+  const char* text = g_filters.text + strspn(g_filters.text, kSeparators);
   while (*text != '\0') {
     const size_t length = strcspn(text, kSeparators);
     Add(text, length);
@@ -61,17 +61,17 @@ void ReadFilters() {
   }
 }
 
-/// The lowest priority to write under `tag`: that of its own last filter, else of the last `*`.
+// The lowest priority to write under `tag`: that of its own last filter, else of the last `*`.
 int LowestFor(const char* tag) {
   const size_t length = strlen(tag);
   int others = ANDROID_LOG_SILENT;
   int own = -1;
-  for (size_t i = 0; i < g_filters.m_nCount; ++i) {
-    const Filter& filter = g_filters.m_aFilter[i];
-    if (filter.m_nTagLen == length && memcmp(filter.m_szTag, tag, length) == 0) {
-      own = filter.m_nLowest;
-    } else if (filter.m_nTagLen == 1 && filter.m_szTag[0] == '*') {
-      others = filter.m_nLowest;
+  for (size_t i = 0; i < g_filters.count; ++i) {
+    const Filter& filter = g_filters.filter[i];
+    if (filter.tagLen == length && memcmp(filter.tag, tag, length) == 0) {
+      own = filter.lowest;
+    } else if (filter.tagLen == 1 && filter.tag[0] == '*') {
+      others = filter.lowest;
     }
   }
   return own < 0 ? others : own;
@@ -82,7 +82,7 @@ int LowestFor(const char* tag) {
 __attribute__((visibility("default"))) int __android_log_write(int prio, const char* tag,
                                                                const char* text) {
   pthread_once(&g_once, ReadFilters);
-  if (prio < g_filters.m_nLowest || prio >= ANDROID_LOG_SILENT) return -EPERM;
+  if (prio < g_filters.lowest || prio >= ANDROID_LOG_SILENT) return -EPERM;
   if (tag == nullptr) tag = "";
   if (prio < LowestFor(tag)) return -EPERM;
   if (text == nullptr) text = "";

@@ -16,7 +16,7 @@
 
 namespace {
 
-using gateway_tests::TExport;
+using gateway_tests::Export;
 
 // An argument list as text: numbers for i, b and c, anything for S, the status left out.
 struct Case {
@@ -56,9 +56,9 @@ constexpr std::string_view kAnswers[] = {
 
 void Run(std::string_view operation, const std::vector<const char*>& arguments,
          const std::string& label) {
-  const TExport* const row = gateway_tests::FindExport(operation);
+  const Export* const row = gateway_tests::FindExport(operation);
   void* const entryPoint = row->EntryPoint();
-  if (entryPoint == nullptr || arguments.size() + row->HasStatus() != row->m_szShape.size()) {
+  if (entryPoint == nullptr || arguments.size() + row->HasStatus() != row->shape.size()) {
     fprintf(stderr, "no such call: %s\n", label.c_str());
     exit(2);
   }
@@ -66,7 +66,7 @@ void Run(std::string_view operation, const std::vector<const char*>& arguments,
   std::vector<jvalue> values(arguments.size() + 1);
   for (size_t i = 0; i < arguments.size(); ++i) {
     const int number = atoi(arguments[i]);
-    switch (row->m_szShape[i]) {
+    switch (row->shape[i]) {
       case 'S':
         values[i].l = gateway_tests::BareText(arguments[i]);
         break;
@@ -84,7 +84,7 @@ void Run(std::string_view operation, const std::vector<const char*>& arguments,
   JNIEnv* const env = gateway_tests::BareHost();
 
   CALLGRIND_ZERO_STATS;
-  row->m_pCall(entryPoint, env, values.data());
+  row->call(entryPoint, env, values.data());
   CALLGRIND_DUMP_STATS_AT(label.c_str());
   if (status != 1) {
     fprintf(stderr, "%s failed\n", label.c_str());

@@ -58,8 +58,8 @@ constexpr int64_t kNumbers[] = {0,    1,     2,     3,         4,          7,   
 
 constexpr size_t kLongest = 20000;
 
-template <typename TItem, size_t kCount>
-const TItem& Pick(const TItem (&items)[kCount], CDraw& draw) {
+template <typename Item, size_t kCount>
+const Item& Pick(const Item (&items)[kCount], CDraw& draw) {
   return items[draw.Below(kCount)];
 }
 
@@ -67,7 +67,7 @@ int64_t DrawNumber(CDraw& draw) {
   return draw.Below(4) == 0 ? static_cast<int32_t>(draw.Next()) : Pick(kNumbers, draw);
 }
 
-/// Where the value of one of the fields of `text` begins; its length goes to `length`.
+// Where the value of one of the fields of `text` begins; its length goes to `length`.
 size_t DrawValue(const std::string& text, size_t& length, CDraw& draw) {
   size_t begin = text.find('=', draw.Below(text.size() + 1));
   begin = begin == std::string::npos ? text.size() : begin + 1;
@@ -108,23 +108,23 @@ void DisturbText(std::string& text, CDraw& draw) {
   }
 }
 
-void DisturbOne(TArgument& argument, CDraw& draw) {
-  switch (argument.m_chLetter) {
+void DisturbOne(Argument& argument, CDraw& draw) {
+  switch (argument.letter) {
     case 'i':
-      argument.m_nNumber = DrawNumber(draw);
+      argument.number = DrawNumber(draw);
       break;
     case 'b':
-      argument.m_nNumber = static_cast<int8_t>(draw.Next());
+      argument.number = static_cast<int8_t>(draw.Next());
       break;
     case 'c':
-      argument.m_nNumber = draw.Below(4) == 0 ? static_cast<uint16_t>(draw.Next())
-                                              : static_cast<int64_t>(draw.Below(128));
+      argument.number = draw.Below(4) == 0 ? static_cast<uint16_t>(draw.Next())
+                                           : static_cast<int64_t>(draw.Below(128));
       break;
     default:
-      if (!argument.m_Text.has_value()) argument.m_Text.emplace();
-      for (size_t left = 1 + draw.Below(4); left > 0; --left) DisturbText(*argument.m_Text, draw);
-      if (argument.m_Text->find('\0') != std::string::npos) argument.m_Text->clear();
-      if (draw.Below(100) == 0) argument.m_Text.reset();
+      if (!argument.text.has_value()) argument.text.emplace();
+      for (size_t left = 1 + draw.Below(4); left > 0; --left) DisturbText(*argument.text, draw);
+      if (argument.text->find('\0') != std::string::npos) argument.text->clear();
+      if (draw.Below(100) == 0) argument.text.reset();
   }
 }
 
@@ -137,7 +137,7 @@ uint64_t CDraw::Next() {
   return mixed ^ (mixed >> 31);
 }
 
-TArguments Disturb(TArguments arguments, CDraw& draw) {
+Arguments Disturb(Arguments arguments, CDraw& draw) {
   for (size_t left = 1 + draw.Below(3); left > 0; --left) {
     DisturbOne(arguments[draw.Below(arguments.size())], draw);
   }

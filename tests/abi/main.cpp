@@ -21,18 +21,18 @@ namespace {
 
 constexpr size_t kDefaultCalls = 300;
 
-/// FNV-1a over 64 bits; texts are ended, so that no two sequences of texts run into the same bytes.
+// FNV-1a over 64 bits; texts are ended, so that no two sequences of texts run into the same bytes.
 class CDigest {
  public:
   void Add(std::string_view text) {
     for (char c : text) AddByte(static_cast<unsigned char>(c));
     AddByte(0);
   }
-  void Add(const TOutcome& outcome) {
-    Add(outcome.m_Result.has_value() ? "result" : "no result");
-    Add(outcome.m_Result.value_or(""));
-    Add(outcome.m_Status.has_value() ? std::to_string(*outcome.m_Status) : "none");
-    for (const std::string& line : outcome.m_LogLines) Add(line);
+  void Add(const Outcome& outcome) {
+    Add(outcome.result.has_value() ? "result" : "no result");
+    Add(outcome.result.value_or(""));
+    Add(outcome.status.has_value() ? std::to_string(*outcome.status) : "none");
+    for (const std::string& line : outcome.logLines) Add(line);
     Add("end");
   }
   std::string Text() const {
@@ -49,57 +49,57 @@ class CDigest {
 
 class CAbiRun {
  public:
-  bool Golden(const TGoldenCases& golden) {
-    for (const std::string& error : golden.m_Errors) Fault(error, "is not well formed");
-    for (const TGoldenCase& one : golden.m_Cases) PlayGolden(one);
+  bool Golden(const GoldenCases& golden) {
+    for (const std::string& error : golden.errors) Fault(error, "is not well formed");
+    for (const GoldenCase& one : golden.cases) PlayGolden(one);
     return m_nFaults == 0;
   }
 
-  /// Calls `row` as its golden cases do and as often as asked with disturbed arguments.
-  void Load(const TExport& row, const std::vector<const TGoldenCase*>& cases, size_t calls) {
-    if (cases.empty()) return Fault(std::string(row.m_szName), "has no golden case");
+  // Calls `row` as its golden cases do and as often as asked with disturbed arguments.
+  void Load(const Export& row, const std::vector<const GoldenCase*>& cases, size_t calls) {
+    if (cases.empty()) return Fault(std::string(row.name), "has no golden case");
     CDraw draw(cases.size());
     CRecordingHost host;
     for (size_t call = 0; call < calls; ++call) {
-      const TGoldenCase& golden = *cases[draw.Below(cases.size())];
+      const GoldenCase& golden = *cases[draw.Below(cases.size())];
       SetClockOf(golden);
-      const TOutcome outcome = host.Call(row, Disturb(golden.m_Arguments, draw));
+      const Outcome outcome = host.Call(row, Disturb(golden.arguments, draw));
       if (!outcome.IsSound()) Fault(golden.Where(), "disturbed, is not answered soundly");
-      m_Digests[row.m_szName].Add(outcome);
+      m_digests[row.name].Add(outcome);
       ++m_nCalls;
     }
   }
 
-  /// Prints the digests; the exit status of the program.
+  // Prints the digests; the exit status of the program.
   int Finish() const {
     CDigest all;
-    for (const auto& [name, digest] : m_Digests) {
+    for (const auto& [name, digest] : m_digests) {
       std::printf("%-24.*s %s\n", static_cast<int>(name.size()), name.data(),
                   digest.Text().c_str());
       all.Add(digest.Text());
     }
-    std::printf("all %zu exports, %zu calls %s\n", m_Digests.size(), m_nCalls, all.Text().c_str());
-    return m_nFaults == 0 && m_Digests.size() == kExportCount ? EXIT_SUCCESS : EXIT_FAILURE;
+    std::printf("all %zu exports, %zu calls %s\n", m_digests.size(), m_nCalls, all.Text().c_str());
+    return m_nFaults == 0 && m_digests.size() == kExportCount ? EXIT_SUCCESS : EXIT_FAILURE;
   }
 
  private:
-  void PlayGolden(const TGoldenCase& golden) {
-    const TExport& row = *FindExport(golden.m_Operation);
+  void PlayGolden(const GoldenCase& golden) {
+    const Export& row = *FindExport(golden.operation);
     const std::string platform = PlatformName(golden.PlatformRow());
     if (!SetClockOf(golden)) Fault(golden.Where(), "has an odd clock");
-    CRecordingHost host(EPlacement::kBeforeUnreadable);
-    const TOutcome outcome = host.Call(row, golden.m_Arguments);
-    if (!outcome.m_Violations.empty()) Fault(golden.Where(), outcome.m_Violations.front());
-    if (outcome.m_Result != FillPlatformName(golden.m_Result, platform)) {
-      Fault(golden.Where(), "answered " + outcome.m_Result.value_or("(null)"));
+    CRecordingHost host(Placement::kBeforeUnreadable);
+    const Outcome outcome = host.Call(row, golden.arguments);
+    if (!outcome.violations.empty()) Fault(golden.Where(), outcome.violations.front());
+    if (outcome.result != FillPlatformName(golden.result, platform)) {
+      Fault(golden.Where(), "answered " + outcome.result.value_or("(null)"));
     }
-    if (outcome.m_Status != golden.m_Status) Fault(golden.Where(), "has another status");
-    if (golden.m_LogLines.has_value()) {
-      std::vector<std::string> expected = *golden.m_LogLines;
+    if (outcome.status != golden.status) Fault(golden.Where(), "has another status");
+    if (golden.logLines.has_value()) {
+      std::vector<std::string> expected = *golden.logLines;
       for (std::string& line : expected) line = FillPlatformName(line, platform);
-      if (outcome.m_LogLines != expected) Fault(golden.Where(), "has other log lines");
+      if (outcome.logLines != expected) Fault(golden.Where(), "has other log lines");
     }
-    m_Digests[row.m_szName].Add(outcome);
+    m_digests[row.name].Add(outcome);
     ++m_nCalls;
   }
 
@@ -108,20 +108,20 @@ class CAbiRun {
     ++m_nFaults;
   }
 
-  std::map<std::string_view, CDigest> m_Digests;
+  std::map<std::string_view, CDigest> m_digests;
   size_t m_nCalls = 0;
   size_t m_nFaults = 0;
 };
 
 int Run(const char* directory, size_t calls) {
   EnterMarketTimeZone();
-  const TGoldenCases golden = ReadGoldenCases(directory);
+  const GoldenCases golden = ReadGoldenCases(directory);
   CAbiRun run;
   if (!run.Golden(golden)) return EXIT_FAILURE;
-  for (const TExport& row : AllExports()) {
-    std::vector<const TGoldenCase*> cases;
-    for (const TGoldenCase& one : golden.m_Cases) {
-      if (one.m_Operation == row.m_szName && !one.m_Arguments.empty()) cases.push_back(&one);
+  for (const Export& row : AllExports()) {
+    std::vector<const GoldenCase*> cases;
+    for (const GoldenCase& one : golden.cases) {
+      if (one.operation == row.name && !one.arguments.empty()) cases.push_back(&one);
     }
     run.Load(row, cases, calls);
   }

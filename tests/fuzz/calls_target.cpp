@@ -17,33 +17,33 @@ namespace gateway_fuzz {
 namespace {
 
 using gateway_tests::AllExports;
+using gateway_tests::Argument;
+using gateway_tests::Arguments;
+using gateway_tests::Export;
 using gateway_tests::kExportCount;
 using gateway_tests::SetClock;
-using gateway_tests::TArgument;
-using gateway_tests::TArguments;
-using gateway_tests::TExport;
 
-/// The entry points, looked up once.
+// The entry points, looked up once.
 void* s_pEntryPoints[kExportCount];
 
-/// Prints what the call does in a host that keeps all of it.
-void PrintRecord(const TFuzzCall& call) {
-  TArguments arguments;
-  for (const TFuzzArgument& argument : call) {
-    TArgument copy{argument.m_chLetter, argument.m_nNumber, std::nullopt};
-    if (argument.m_chLetter == 'S' && !argument.m_bNull) copy.m_Text = argument.m_Text;
+// Prints what the call does in a host that keeps all of it.
+void PrintRecord(const FuzzCall& call) {
+  Arguments arguments;
+  for (const FuzzArgument& argument : call) {
+    Argument copy{argument.letter, argument.number, std::nullopt};
+    if (argument.letter == 'S' && !argument.null) copy.text = argument.text;
     arguments.push_back(copy);
   }
-  const gateway_tests::TOutcome outcome = gateway_tests::CRecordingHost().CallAt(
-      s_pEntryPoints[call.m_nRow], AllExports()[call.m_nRow], arguments);
-  for (const std::string& event : outcome.m_Events) std::fprintf(stderr, "  %s\n", event.c_str());
-  std::fprintf(stderr, "  status %d\n", outcome.m_Status.value_or(0));
+  const gateway_tests::Outcome outcome = gateway_tests::CRecordingHost().CallAt(
+      s_pEntryPoints[call.row], AllExports()[call.row], arguments);
+  for (const std::string& event : outcome.events) std::fprintf(stderr, "  %s\n", event.c_str());
+  std::fprintf(stderr, "  status %d\n", outcome.status.value_or(0));
 }
 
-[[noreturn]] void Broken(const TFuzzCall& call, const char* rule, const TAnswer& answer) {
-  const std::string_view name = AllExports()[call.m_nRow].m_szName;
+[[noreturn]] void Broken(const FuzzCall& call, const char* rule, const Answer& answer) {
+  const std::string_view name = AllExports()[call.row].name;
   std::fprintf(stderr, "%.*s: %s\nresult: %.*s\n", static_cast<int>(name.size()), name.data(), rule,
-               static_cast<int>(answer.m_Result.size()), answer.m_Result.data());
+               static_cast<int>(answer.result.size()), answer.result.data());
   for (const char* const turn : {"first", "second"}) {
     std::fprintf(stderr, "the call, a %s time in the recording host:\n", turn);
     PrintRecord(call);
@@ -59,34 +59,34 @@ bool EndsWith(std::string_view text, std::string_view end) {
   return text.size() >= end.size() && text.substr(text.size() - end.size()) == end;
 }
 
-/// Characters that the result may have at most. The last argument may be a text: a reply, or the
-/// message of a certificate.
-size_t ResultBound(const TExport& row, const TFuzzCall& call) {
+// Characters that the result may have at most. The last argument may be a text: a reply, or the
+// message of a certificate.
+size_t ResultBound(const Export& row, const FuzzCall& call) {
   constexpr size_t kRequest = 4095;
-  const size_t text = call.m_Arguments[call.m_nArguments - 1].m_Text.size();
+  const size_t text = call.arguments[call.argumentCount - 1].text.size();
   if (row.IsDecoder()) return kRequest + 8 * text;
   // Four characters of Base64 for three of the message, and a line end behind every 1024.
-  if (row.m_szName == "RegisterCertEncode") return kRequest + 2 * text;
+  if (row.name == "RegisterCertEncode") return kRequest + 2 * text;
   return kRequest;
 }
 
-/// What holds for every answer.
-void CheckAnswer(const TExport& row, const TFuzzCall& call, const TAnswer& answer) {
-  if (answer.m_szViolation != nullptr) Broken(call, answer.m_szViolation, answer);
-  const std::string_view result = answer.m_Result;
+// What holds for every answer.
+void CheckAnswer(const Export& row, const FuzzCall& call, const Answer& answer) {
+  if (answer.violation != nullptr) Broken(call, answer.violation, answer);
+  const std::string_view result = answer.result;
   if (result.size() > ResultBound(row, call)) Broken(call, "the result is too long", answer);
   if (row.IsDecoder() || !row.HasStatus()) return;
   const bool request = StartsWith(result, "F=");
-  if (answer.m_nStatus == 1 && !request) Broken(call, "no request, and status 1", answer);
+  if (answer.status == 1 && !request) Broken(call, "no request, and status 1", answer);
   // A message stands alone, or, for futures orders, behind the header.
-  if (answer.m_nStatus == -1 && request && !EndsWith(result, "[CLIENT]傳入的參數錯誤")) {
+  if (answer.status == -1 && request && !EndsWith(result, "[CLIENT]傳入的參數錯誤")) {
     Broken(call, "a request, and status -1", answer);
   }
 }
 
 }  // namespace
 
-TRows FuzzRows() {
+Rows FuzzRows() {
   return {AllExports(), kExportCount};
 }
 
@@ -106,17 +106,17 @@ extern "C" int LLVMFuzzerTestOneInput(const uint8_t* data, size_t size) {
   using namespace gateway_fuzz;
   static CLeanHost s_Host;
   if (size > kMaxInput) return 0;
-  const TFuzzCall call = ReadCall(FuzzRows(), data, size);
-  const TExport& row = AllExports()[call.m_nRow];
-  void* const entryPoint = s_pEntryPoints[call.m_nRow];
+  const FuzzCall call = ReadCall(FuzzRows(), data, size);
+  const Export& row = AllExports()[call.row];
+  void* const entryPoint = s_pEntryPoints[call.row];
   SetClock(static_cast<std::time_t>(call.Clock()));
-  const TAnswer first = s_Host.Call(entryPoint, row, call);
+  const Answer first = s_Host.Call(entryPoint, row, call);
   CheckAnswer(row, call, first);
-  const TAnswer second = s_Host.Call(entryPoint, row, call);
+  const Answer second = s_Host.Call(entryPoint, row, call);
   CheckAnswer(row, call, second);
-  if (second.m_nDigest != first.m_nDigest) {
+  if (second.digest != first.digest) {
     Broken(call, "the same call answers differently", second);
   }
-  CountExecution(call.m_nRow);
+  CountExecution(call.row);
   return 0;
 }

@@ -38,12 +38,12 @@ void CountExecution(size_t row) {
   __atomic_fetch_add(&s_pCounts[row], uint64_t{1}, __ATOMIC_RELAXED);
 }
 
-bool PrintCounts(const TRows& rows) {
+bool PrintCounts(const Rows& rows) {
   bool all = true;
   unsigned long long total = 0;
-  for (size_t row = 0; row < rows.m_nCount; ++row) {
+  for (size_t row = 0; row < rows.count; ++row) {
     const unsigned long long count = s_pCounts[row];
-    const std::string_view name = rows.m_pRows[row].m_szName;
+    const std::string_view name = rows.rows[row].name;
     std::printf("executions %.*s %llu\n", static_cast<int>(name.size()), name.data(), count);
     total += count;
     all = all && count > 0;

@@ -11,13 +11,13 @@
 
 namespace gateway_fuzz {
 
-/// Opens the counts; without the variable they are this process's own.
+// Opens the counts; without the variable they are this process's own.
 void OpenCounts();
 
 void CountExecution(size_t row);
 
-/// Prints one line for each row and one for all; false when some row was never executed.
-bool PrintCounts(const TRows& rows);
+// Prints one line for each row and one for all; false when some row was never executed.
+bool PrintCounts(const Rows& rows);
 
 }  // namespace gateway_fuzz
 

@@ -8,9 +8,9 @@ namespace {
 
 constexpr std::string_view kNullText = "\xff";
 
-/// The letters of the arguments that a call passes.
-std::string_view Letters(const gateway_tests::TExport& row) {
-  std::string_view shape = row.m_szShape;
+// The letters of the arguments that a call passes.
+std::string_view Letters(const gateway_tests::Export& row) {
+  std::string_view shape = row.shape;
   if (row.HasStatus()) shape.remove_suffix(1);
   return shape;
 }
@@ -19,7 +19,7 @@ size_t BytesOf(char letter) {
   return letter == 'i' ? 4 : letter == 'c' ? 2 : 1;
 }
 
-/// The bytes that are left; behind the last one stand zeros.
+// The bytes that are left; behind the last one stand zeros.
 class CReader {
  public:
   CReader(const uint8_t* data, size_t size) : m_pAt(data), m_pEnd(data + size) {}
@@ -48,7 +48,7 @@ class CReader {
   const uint8_t* m_pEnd;
 };
 
-/// The bytes that there is room for.
+// The bytes that there is room for.
 class CWriter {
  public:
   CWriter(uint8_t* data, size_t size) : m_pBegin(data), m_pAt(data), m_pEnd(data + size) {}
@@ -73,16 +73,16 @@ class CWriter {
 
 }  // namespace
 
-int64_t TFuzzCall::Clock() const {
-  return int64_t{m_nMoment} * 9277711 + 1700000000 % 86399;
+int64_t FuzzCall::Clock() const {
+  return int64_t{moment} * 9277711 + 1700000000 % 86399;
 }
 
-TFuzzCall ReadCall(const TRows& rows, const uint8_t* data, size_t size) {
+FuzzCall ReadCall(const Rows& rows, const uint8_t* data, size_t size) {
   CReader reader(data, size);
-  TFuzzCall call;
-  call.m_nRow = reader.Byte() % rows.m_nCount;
-  call.m_nMoment = reader.Byte();
-  for (char letter : Letters(rows.m_pRows[call.m_nRow])) {
+  FuzzCall call;
+  call.row = reader.Byte() % rows.count;
+  call.moment = reader.Byte();
+  for (char letter : Letters(rows.rows[call.row])) {
     if (letter == 'S') {
       const std::string_view text = reader.Text();
       const bool null = text == kNullText;
@@ -94,34 +94,33 @@ TFuzzCall ReadCall(const TRows& rows, const uint8_t* data, size_t size) {
   return call;
 }
 
-size_t WriteCall(const TFuzzCall& call, uint8_t* data, size_t maxSize) {
+size_t WriteCall(const FuzzCall& call, uint8_t* data, size_t maxSize) {
   CWriter writer(data, maxSize);
-  writer.Byte(call.m_nRow);
-  writer.Byte(call.m_nMoment);
-  for (const TFuzzArgument& argument : call) {
-    if (argument.m_chLetter == 'S') {
-      writer.Text(argument.m_bNull ? kNullText : argument.m_Text);
+  writer.Byte(call.row);
+  writer.Byte(call.moment);
+  for (const FuzzArgument& argument : call) {
+    if (argument.letter == 'S') {
+      writer.Text(argument.null ? kNullText : argument.text);
       writer.Byte(0);
       continue;
     }
-    const auto value = static_cast<uint64_t>(argument.m_nNumber);
-    for (size_t i = 0; i < BytesOf(argument.m_chLetter); ++i) writer.Byte(value >> (8 * i));
+    const auto value = static_cast<uint64_t>(argument.number);
+    for (size_t i = 0; i < BytesOf(argument.letter); ++i) writer.Byte(value >> (8 * i));
   }
   return writer.Size();
 }
 
-void FitArguments(const TRows& rows, TFuzzCall& call) {
-  const TFuzzCall old = call;
-  call.m_nArguments = 0;
+void FitArguments(const Rows& rows, FuzzCall& call) {
+  const FuzzCall old = call;
+  call.argumentCount = 0;
   size_t text = 0;
   size_t number = 0;
-  for (char letter : Letters(rows.m_pRows[call.m_nRow])) {
+  for (char letter : Letters(rows.rows[call.row])) {
     size_t& at = letter == 'S' ? text : number;
-    while (at < old.m_nArguments && (old.m_Arguments[at].m_chLetter == 'S') != (letter == 'S'))
-      ++at;
-    TFuzzArgument argument = {letter, false, 0, {}};
-    if (at < old.m_nArguments) argument = old.m_Arguments[at++];
-    argument.m_chLetter = letter;
+    while (at < old.argumentCount && (old.arguments[at].letter == 'S') != (letter == 'S')) ++at;
+    FuzzArgument argument = {letter, false, 0, {}};
+    if (at < old.argumentCount) argument = old.arguments[at++];
+    argument.letter = letter;
     call.Add(argument);
   }
 }

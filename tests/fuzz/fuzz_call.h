@@ -22,48 +22,48 @@
 
 namespace gateway_fuzz {
 
-/// What a target calls: rows by number.
-struct TRows {
-  const gateway_tests::TExport* m_pRows;
-  size_t m_nCount;
+// What a target calls: rows by number.
+struct Rows {
+  const gateway_tests::Export* rows;
+  size_t count;
 };
 
-/// The rows of the target that is linked into this program.
-TRows FuzzRows();
+// The rows of the target that is linked into this program.
+Rows FuzzRows();
 
-/// One Java argument: a text, or null, for 'S', a number for 'i', 'b' and 'c'. A call owns no text:
-/// it lies in the input, or where the mutator made it. Nothing is allocated for an execution.
-struct TFuzzArgument {
-  char m_chLetter;
-  bool m_bNull;
-  int64_t m_nNumber;
-  std::string_view m_Text;
+// One Java argument: a text, or null, for 'S', a number for 'i', 'b' and 'c'. A call owns no text:
+// it lies in the input, or where the mutator made it. Nothing is allocated for an execution.
+struct FuzzArgument {
+  char letter;
+  bool null;
+  int64_t number;
+  std::string_view text;
 };
 
-struct TFuzzCall {
+struct FuzzCall {
   static constexpr size_t kMaxArguments = 31;
 
-  size_t m_nRow = 0;
-  uint8_t m_nMoment = 0;
-  size_t m_nArguments = 0;
-  TFuzzArgument m_Arguments[kMaxArguments];
+  size_t row = 0;
+  uint8_t moment = 0;
+  size_t argumentCount = 0;
+  FuzzArgument arguments[kMaxArguments];
 
-  void Add(const TFuzzArgument& argument) { m_Arguments[m_nArguments++] = argument; }
-  const TFuzzArgument* begin() const { return m_Arguments; }
-  const TFuzzArgument* end() const { return m_Arguments + m_nArguments; }
+  void Add(const FuzzArgument& argument) { arguments[argumentCount++] = argument; }
+  const FuzzArgument* begin() const { return arguments; }
+  const FuzzArgument* end() const { return arguments + argumentCount; }
 
-  /// The time that m_nMoment stands for: hours and minutes of all kinds, 1970 to 2045.
+  // The time that moment stands for: hours and minutes of all kinds, 1970 to 2045.
   int64_t Clock() const;
 };
 
-TFuzzCall ReadCall(const TRows& rows, const uint8_t* data, size_t size);
+FuzzCall ReadCall(const Rows& rows, const uint8_t* data, size_t size);
 
-/// Writes the bytes that ReadCall makes the same call of, as many as there is room for.
-size_t WriteCall(const TFuzzCall& call, uint8_t* data, size_t maxSize);
+// Writes the bytes that ReadCall makes the same call of, as many as there is room for.
+size_t WriteCall(const FuzzCall& call, uint8_t* data, size_t maxSize);
 
-/// Gives the call the arguments that its row takes, made of those it has: texts stay texts, in
-/// their order, and so do numbers.
-void FitArguments(const TRows& rows, TFuzzCall& call);
+// Gives the call the arguments that its row takes, made of those it has: texts stay texts, in
+// their order, and so do numbers.
+void FitArguments(const Rows& rows, FuzzCall& call);
 
 }  // namespace gateway_fuzz
 

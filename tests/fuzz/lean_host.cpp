@@ -5,20 +5,20 @@
 #include "tests/fuzz/lent_memory.h"
 #include "tests/support/forbidden_calls.h"
 
-/// Of the sanitizers' runtimes; absent where there is none.
+// Of the sanitizers' runtimes; absent where there is none.
 extern "C" __attribute__((weak)) int __sanitizer_install_malloc_and_free_hooks(
     void (*onMalloc)(const volatile void*, size_t), void (*onFree)(const volatile void*));
 
 namespace gateway_fuzz {
 namespace {
 
-using gateway_tests::TExport;
+using gateway_tests::Export;
 
-/// Not a value that any entry point writes.
+// Not a value that any entry point writes.
 constexpr jint kUntouched = 0x5A5A;
 
-/// Blocks that this thread allocated and did not free since the call began; the fuzzer has a thread
-/// of its own that allocates when it likes.
+// Blocks that this thread allocated and did not free since the call began; the fuzzer has a thread
+// of its own that allocates when it likes.
 thread_local int64_t t_nBlocks = 0;
 
 void OnMalloc(const volatile void* block, size_t) {
@@ -28,7 +28,7 @@ void OnFree(const volatile void* block) {
   if (block != nullptr) --t_nBlocks;
 }
 
-/// Each step can be taken back, so that two words differ in what comes out when they differ.
+// Each step can be taken back, so that two words differ in what comes out when they differ.
 void Mix(uint64_t& digest, uint64_t word) {
   digest = (digest ^ word) * 0x9E3779B97F4A7C15U;
   digest ^= digest >> 29;
@@ -36,49 +36,47 @@ void Mix(uint64_t& digest, uint64_t word) {
 
 }  // namespace
 
-/// The five functions that exist.
-struct TLeanFunctions {
-  static CLeanHost& HostOf(JNIEnv* env) {
-    return *static_cast<CLeanHost::TEnvironment*>(env)->m_pHost;
-  }
+// The five functions that exist.
+struct LeanFunctions {
+  static CLeanHost& HostOf(JNIEnv* env) { return *static_cast<CLeanHost::Environment*>(env)->host; }
 
   static const char* JNICALL GetStringUTFChars(JNIEnv* env, jstring string, jboolean* isCopy) {
     CLeanHost& host = HostOf(env);
     const size_t number = host.Find(string);
     host.Note('G', number);
     if (isCopy != nullptr) host.Violation("GetStringUTFChars: is-copy pointer given");
-    if (number == host.m_nTexts || host.m_Texts[number].m_bNull) {
+    if (number == host.m_nTexts || host.m_texts[number].null) {
       host.Violation("GetStringUTFChars: not a string of this call");
       return nullptr;
     }
-    CLeanHost::TText& text = host.m_Texts[number];
-    if (text.m_pCharacters != nullptr) {
+    CLeanHost::Text& text = host.m_texts[number];
+    if (text.characters != nullptr) {
       host.Violation("GetStringUTFChars: string held twice");
-      return text.m_pCharacters;
+      return text.characters;
     }
-    text.m_pCharacters = LendText(text.m_Text);
-    return text.m_pCharacters;
+    text.characters = LendText(text.text);
+    return text.characters;
   }
 
   static void JNICALL ReleaseStringUTFChars(JNIEnv* env, jstring string, const char* characters) {
     CLeanHost& host = HostOf(env);
     const size_t number = host.Find(string);
     host.Note('R', number);
-    if (number == host.m_nTexts || host.m_Texts[number].m_pCharacters == nullptr) {
+    if (number == host.m_nTexts || host.m_texts[number].characters == nullptr) {
       host.Violation("ReleaseStringUTFChars: string is not held");
       return;
     }
-    CLeanHost::TText& text = host.m_Texts[number];
-    const size_t size = text.m_Text.size();
-    if (characters != text.m_pCharacters) {
+    CLeanHost::Text& text = host.m_texts[number];
+    const size_t size = text.text.size();
+    if (characters != text.characters) {
       host.Violation("ReleaseStringUTFChars: not the pointer handed out");
     }
-    if (!SameText({text.m_pCharacters, size}, text.m_Text) || text.m_pCharacters[size] != '\0') {
+    if (!SameText({text.characters, size}, text.text) || text.characters[size] != '\0') {
       host.Violation("ReleaseStringUTFChars: the characters were written to");
     }
-    TakeBack(text.m_pCharacters, size + 1);
-    text.m_pCharacters = nullptr;
-    text.m_bReleased = true;
+    TakeBack(text.characters, size + 1);
+    text.characters = nullptr;
+    text.released = true;
   }
 
   static jint* JNICALL GetIntArrayElements(JNIEnv* env, jintArray array, jboolean* isCopy) {
@@ -129,77 +127,77 @@ struct TLeanFunctions {
       return nullptr;
     }
     std::memcpy(host.m_szResult, characters, size);
-    host.m_Answer.m_Result = {host.m_szResult, size};
+    host.m_answer.result = {host.m_szResult, size};
     host.m_bResultMade = true;
-    host.NoteText('N', host.m_Answer.m_Result);
+    host.NoteText('N', host.m_answer.result);
     return host.ResultHandle();
   }
 };
 
-CLeanHost::CLeanHost() : m_Table(gateway_tests::ForbiddenCalls()) {
-  m_Table.GetStringUTFChars = &TLeanFunctions::GetStringUTFChars;
-  m_Table.ReleaseStringUTFChars = &TLeanFunctions::ReleaseStringUTFChars;
-  m_Table.GetIntArrayElements = &TLeanFunctions::GetIntArrayElements;
-  m_Table.ReleaseIntArrayElements = &TLeanFunctions::ReleaseIntArrayElements;
-  m_Table.NewStringUTF = &TLeanFunctions::NewStringUTF;
-  m_Environment.functions = &m_Table;
-  m_Environment.m_pHost = this;
+CLeanHost::CLeanHost() : m_table(gateway_tests::ForbiddenCalls()) {
+  m_table.GetStringUTFChars = &LeanFunctions::GetStringUTFChars;
+  m_table.ReleaseStringUTFChars = &LeanFunctions::ReleaseStringUTFChars;
+  m_table.GetIntArrayElements = &LeanFunctions::GetIntArrayElements;
+  m_table.ReleaseIntArrayElements = &LeanFunctions::ReleaseIntArrayElements;
+  m_table.NewStringUTF = &LeanFunctions::NewStringUTF;
+  m_environment.functions = &m_table;
+  m_environment.host = this;
   Forbid(m_chHandles, sizeof m_chHandles);
   if (__sanitizer_install_malloc_and_free_hooks != nullptr) {
     __sanitizer_install_malloc_and_free_hooks(&OnMalloc, &OnFree);
   }
 }
 
-TAnswer CLeanHost::Call(void* entryPoint, const TExport& row, const TFuzzCall& call) {
-  jvalue values[TFuzzCall::kMaxArguments + 1];
+Answer CLeanHost::Call(void* entryPoint, const Export& row, const FuzzCall& call) {
+  jvalue values[FuzzCall::kMaxArguments + 1];
   Begin(row, call, values);
   gateway_tests::ListenToLog(this);
   t_nBlocks = 0;
-  const jstring returned = row.m_pCall(entryPoint, &m_Environment, values);
+  const jstring returned = row.call(entryPoint, &m_environment, values);
   if (t_nBlocks > 0) Violation("memory was never freed");
   if (t_nBlocks < 0) Violation("memory of another was freed");
   gateway_tests::ListenToLog(nullptr);
   Finish(row, returned);
-  return m_Answer;
+  return m_answer;
 }
 
-void CLeanHost::Begin(const TExport& row, const TFuzzCall& call, jvalue* values) {
+void CLeanHost::Begin(const Export& row, const FuzzCall& call, jvalue* values) {
   m_nTexts = 0;
   m_bResultMade = false;
   m_pElements = nullptr;
   m_nStatus = kUntouched;
-  m_Answer = {1, {}, 0, nullptr};
-  for (const TFuzzArgument& argument : call) {
+  m_answer = {1, {}, 0, nullptr};
+  for (const FuzzArgument& argument : call) {
     jvalue& value = *values++;
-    if (argument.m_chLetter == 'i') {
-      value.i = static_cast<jint>(argument.m_nNumber);
-    } else if (argument.m_chLetter == 'b') {
-      value.b = static_cast<jbyte>(argument.m_nNumber);
-    } else if (argument.m_chLetter == 'c') {
-      value.c = static_cast<jchar>(argument.m_nNumber);
+    if (argument.letter == 'i') {
+      value.i = static_cast<jint>(argument.number);
+    } else if (argument.letter == 'b') {
+      value.b = static_cast<jbyte>(argument.number);
+    } else if (argument.letter == 'c') {
+      value.c = static_cast<jchar>(argument.number);
     } else {
-      value.l = argument.m_bNull ? nullptr : static_cast<jobject>(Handle(m_nTexts));
-      m_Texts[m_nTexts++] = {argument.m_Text, argument.m_bNull, false, nullptr};
+      value.l = argument.null ? nullptr : static_cast<jobject>(Handle(m_nTexts));
+      m_texts[m_nTexts++] = {argument.text, argument.null, false, nullptr};
     }
   }
   if (row.HasStatus()) values->l = StatusHandle();
 }
 
-void CLeanHost::Finish(const TExport& row, jstring returned) {
+void CLeanHost::Finish(const Export& row, jstring returned) {
   if (!m_bResultMade) Violation("there is no result");
   if (returned != ResultHandle()) Violation("the returned string is not the one made");
   if (m_pElements != nullptr) Violation("the status elements were never released");
-  m_Answer.m_nStatus = row.HasStatus() ? m_nStatus : 1;
-  if (m_Answer.m_nStatus != 1 && m_Answer.m_nStatus != -1) Violation("the status is not 1 or -1");
-  Note('s', static_cast<uint32_t>(m_Answer.m_nStatus));
-  const size_t firstKept = m_nTexts - static_cast<size_t>(row.m_nKeptStrings);
+  m_answer.status = row.HasStatus() ? m_nStatus : 1;
+  if (m_answer.status != 1 && m_answer.status != -1) Violation("the status is not 1 or -1");
+  Note('s', static_cast<uint32_t>(m_answer.status));
+  const size_t firstKept = m_nTexts - static_cast<size_t>(row.keptStrings);
   for (size_t i = 0; i < m_nTexts; ++i) {
-    const TText& text = m_Texts[i];
-    if (i < firstKept && text.m_pCharacters != nullptr) Violation("a string was never released");
-    if (i >= firstKept && text.m_bReleased) {
+    const Text& text = m_texts[i];
+    if (i < firstKept && text.characters != nullptr) Violation("a string was never released");
+    if (i >= firstKept && text.released) {
       Violation("a string was released that this export keeps");
     }
-    if (text.m_pCharacters != nullptr) TakeBack(text.m_pCharacters, text.m_Text.size() + 1);
+    if (text.characters != nullptr) TakeBack(text.characters, text.text.size() + 1);
   }
 }
 
@@ -221,17 +219,17 @@ void CLeanHost::OnLog(int priority, const char* tag, const char* text) {
 }
 
 void CLeanHost::Violation(const char* text) {
-  if (m_Answer.m_szViolation == nullptr) m_Answer.m_szViolation = text;
+  if (m_answer.violation == nullptr) m_answer.violation = text;
 }
 
 void CLeanHost::Note(char event, uint64_t number) {
-  Mix(m_Answer.m_nDigest, static_cast<uint64_t>(event));
-  Mix(m_Answer.m_nDigest, number);
+  Mix(m_answer.digest, static_cast<uint64_t>(event));
+  Mix(m_answer.digest, number);
 }
 
 void CLeanHost::NoteText(char event, std::string_view text) {
   Note(event, text.size());
-  uint64_t digest = m_Answer.m_nDigest;
+  uint64_t digest = m_answer.digest;
   size_t at = 0;
   for (; text.size() - at >= sizeof(uint64_t); at += sizeof(uint64_t)) {
     Mix(digest, WordAt(text.data() + at));
@@ -239,7 +237,7 @@ void CLeanHost::NoteText(char event, std::string_view text) {
   uint64_t rest = 0;
   for (; at < text.size(); ++at) rest = rest << 8 | static_cast<uint8_t>(text[at]);
   Mix(digest, rest);
-  m_Answer.m_nDigest = digest;
+  m_answer.digest = digest;
 }
 
 }  // namespace gateway_fuzz

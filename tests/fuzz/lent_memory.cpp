@@ -23,9 +23,9 @@
 namespace gateway_fuzz {
 namespace {
 
-/// A poisoned region may end, and a readable one begin, at such places alone.
+// A poisoned region may end, and a readable one begin, at such places alone.
 constexpr size_t kGrain = 8;
-/// What stands between two blocks at least.
+// What stands between two blocks at least.
 constexpr size_t kGap = 64;
 
 alignas(64) char s_Ring[kLentRoom];
@@ -91,10 +91,10 @@ CLent::CLent(size_t size) : m_nSize(size), m_pData(Lend(size)) {
   std::memset(m_pData, '#', size);
 }
 
-CLent::CLent(std::string_view text, EEnd end)
-    : m_nSize(text.size() + (end == EEnd::kTerminated ? 1 : 0)), m_pData(Lend(m_nSize)) {
+CLent::CLent(std::string_view text, End end)
+    : m_nSize(text.size() + (end == End::kTerminated ? 1 : 0)), m_pData(Lend(m_nSize)) {
   if (!text.empty()) std::memcpy(m_pData, text.data(), text.size());
-  if (end == EEnd::kTerminated) m_pData[text.size()] = '\0';
+  if (end == End::kTerminated) m_pData[text.size()] = '\0';
 }
 
 }  // namespace gateway_fuzz

@@ -5,7 +5,7 @@ namespace {
 
 constexpr size_t kNowhere = std::string_view::npos;
 
-/// `at` is not behind the text's end.
+// `at` is not behind the text's end.
 inline bool StandsAt(std::string_view text, size_t at, std::string_view what) {
   if (what.size() > text.size() - at) return false;
   for (size_t i = 0; i < what.size(); ++i) {
@@ -14,7 +14,7 @@ inline bool StandsAt(std::string_view text, size_t at, std::string_view what) {
   return true;
 }
 
-/// Where "|tag=" stands.
+// Where "|tag=" stands.
 size_t FindField(std::string_view text, std::string_view tag, size_t from) {
   for (size_t at = from; at < text.size(); ++at) {
     if (text[at] == '|' && StandsAt(text, at + 1, tag) &&
@@ -38,7 +38,8 @@ std::string_view PlainBounded(std::string_view value, size_t bound) {
   return value.size() < bound ? value : std::string_view();
 }
 
-TPlainToken PlainToken(std::string_view tag, std::string_view reply, size_t bound, bool skipBlank) {
+PlainToken ReadPlainToken(std::string_view tag, std::string_view reply, size_t bound,
+                          bool skipBlank) {
   size_t from = 0;
   for (;;) {
     const size_t found = FindField(reply, tag, from);
@@ -55,7 +56,7 @@ TPlainToken PlainToken(std::string_view tag, std::string_view reply, size_t boun
   }
 }
 
-TPlainRecord PlainRecord(std::string_view reply, size_t pos, size_t bound) {
+PlainRecord ReadPlainRecord(std::string_view reply, size_t pos, size_t bound) {
   const size_t opening = PlainFind(reply, "|00=", pos);
   const size_t closing = PlainFind(reply, "|01=", pos);
   if (opening == kNowhere || closing == kNowhere) return {"", reply.size()};
@@ -75,15 +76,15 @@ bool PlainNextRecord(std::string_view reply, size_t bound, size_t& pos, std::str
   return true;
 }
 
-EPlainTransport PlainTransport(std::string_view reply) {
-  if (PlainFind(reply, "[GATEWAY]error", 0) != kNowhere) return EPlainTransport::kGatewayDown;
+PlainTransport JudgePlainTransport(std::string_view reply) {
+  if (PlainFind(reply, "[GATEWAY]error", 0) != kNowhere) return PlainTransport::kGatewayDown;
   if (reply.empty() || PlainFind(reply, "[BROKER]timeout", 0) != kNowhere) {
-    return EPlainTransport::kBrokerDown;
+    return PlainTransport::kBrokerDown;
   }
-  return EPlainTransport::kOk;
+  return PlainTransport::kOk;
 }
 
-TPlainField PlainField(std::string_view text, std::string_view separator) {
+PlainField ReadPlainField(std::string_view text, std::string_view separator) {
   const size_t found = PlainFind(text, separator, 0);
   if (found == kNowhere) return {text, ""};
   return {text.substr(0, found), text.substr(found + separator.size())};

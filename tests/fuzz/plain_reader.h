@@ -9,43 +9,44 @@
 
 namespace gateway_fuzz {
 
-/// What a buffer holds: the value, and the length that was found, fit or not.
-struct TPlainToken {
-  std::string_view m_Text;
-  size_t m_nLength = 0;
+// What a buffer holds: the value, and the length that was found, fit or not.
+struct PlainToken {
+  std::string_view text;
+  size_t length = 0;
 };
 
-/// Where `what`, which is not empty, stands in `text` from `from` on; npos when nowhere.
+// Where `what`, which is not empty, stands in `text` from `from` on; npos when nowhere.
 size_t PlainFind(std::string_view text, std::string_view what, size_t from);
 
-/// `value` as a buffer of `bound` bytes holds it.
+// `value` as a buffer of `bound` bytes holds it.
 std::string_view PlainBounded(std::string_view value, size_t bound);
 
-/// The value of the first field `tag` of `reply`, which stands behind a '|'; with `skipBlank` the
-/// first that is not an empty or blank one closed by a '|'.
-TPlainToken PlainToken(std::string_view tag, std::string_view reply, size_t bound, bool skipBlank);
+// The value of the first field `tag` of `reply`, which stands behind a '|'; with `skipBlank` the
+// first that is not an empty or blank one closed by a '|'.
+PlainToken ReadPlainToken(std::string_view tag, std::string_view reply, size_t bound,
+                          bool skipBlank);
 
-/// One record from `pos` on, and where the next one is to be looked for.
-struct TPlainRecord {
-  std::string_view m_Text;
-  size_t m_nNext = 0;
+// One record from `pos` on, and where the next one is to be looked for.
+struct PlainRecord {
+  std::string_view text;
+  size_t next = 0;
 };
-TPlainRecord PlainRecord(std::string_view reply, size_t pos, size_t bound);
+PlainRecord ReadPlainRecord(std::string_view reply, size_t pos, size_t bound);
 
-/// The next complete record from `pos` on, which moves behind it; a closing mark that no opening
-/// one stands before gives an empty record, and so does a record of `bound` characters or more.
-/// False when there is none.
+// The next complete record from `pos` on, which moves behind it; a closing mark that no opening
+// one stands before gives an empty record, and so does a record of `bound` characters or more.
+// False when there is none.
 bool PlainNextRecord(std::string_view reply, size_t bound, size_t& pos, std::string_view& record);
 
-enum class EPlainTransport { kOk, kGatewayDown, kBrokerDown };
-EPlainTransport PlainTransport(std::string_view reply);
+enum class PlainTransport { kOk, kGatewayDown, kBrokerDown };
+PlainTransport JudgePlainTransport(std::string_view reply);
 
-/// Text up to a separator, and what is left behind it.
-struct TPlainField {
-  std::string_view m_Text;
-  std::string_view m_Rest;
+// Text up to a separator, and what is left behind it.
+struct PlainField {
+  std::string_view text;
+  std::string_view rest;
 };
-TPlainField PlainField(std::string_view text, std::string_view separator);
+PlainField ReadPlainField(std::string_view text, std::string_view separator);
 
 }  // namespace gateway_fuzz
 

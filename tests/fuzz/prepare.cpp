@@ -18,42 +18,42 @@ namespace gateway_fuzz {
 namespace {
 
 using gateway_tests::AllExports;
+using gateway_tests::Argument;
 using gateway_tests::FindExport;
-using gateway_tests::TArgument;
-using gateway_tests::TGoldenCase;
+using gateway_tests::GoldenCase;
 
 constexpr size_t kMaxSeed = 65536;
 
-void Write(const std::filesystem::path& file, const TFuzzCall& call) {
+void Write(const std::filesystem::path& file, const FuzzCall& call) {
   uint8_t bytes[kMaxSeed];
   const size_t size = WriteCall(call, bytes, kMaxSeed);
   std::ofstream(file, std::ios::binary)
       .write(reinterpret_cast<const char*>(bytes), static_cast<std::streamsize>(size));
 }
 
-TFuzzArgument Argument(const TArgument& golden) {
-  const bool null = golden.m_chLetter == 'S' && !golden.m_Text.has_value();
-  return {golden.m_chLetter, null, golden.m_nNumber,
-          golden.m_Text.has_value() ? std::string_view(*golden.m_Text) : std::string_view()};
+FuzzArgument Argument(const Argument& golden) {
+  const bool null = golden.letter == 'S' && !golden.text.has_value();
+  return {golden.letter, null, golden.number,
+          golden.text.has_value() ? std::string_view(*golden.text) : std::string_view()};
 }
 
 void WriteSeeds(const char* vectors, const char* calls, const char* readers) {
   std::filesystem::create_directories(calls);
   std::filesystem::create_directories(readers);
-  for (const TGoldenCase& golden : gateway_tests::ReadGoldenCases(vectors).m_Cases) {
-    const gateway_tests::TExport* const row = FindExport(golden.m_Operation);
-    const std::string name = golden.m_File + "-" + std::to_string(golden.m_nLine);
-    TFuzzCall call;
-    call.m_nRow = static_cast<size_t>(row - AllExports());
-    call.m_nMoment = 54;
-    for (const TArgument& argument : golden.m_Arguments) call.Add(Argument(argument));
+  for (const GoldenCase& golden : gateway_tests::ReadGoldenCases(vectors).cases) {
+    const gateway_tests::Export* const row = FindExport(golden.operation);
+    const std::string name = golden.file + "-" + std::to_string(golden.line);
+    FuzzCall call;
+    call.row = static_cast<size_t>(row - AllExports());
+    call.moment = 54;
+    for (const Argument& argument : golden.arguments) call.Add(Argument(argument));
     Write(std::filesystem::path(calls) / name, call);
     if (!row->IsDecoder()) continue;
-    TFuzzCall reading;
+    FuzzCall reading;
     reading.Add({'b', false, -1, {}});
     reading.Add({'b', false, 1, {}});
     reading.Add({'S', false, 0, "68"});
-    reading.Add(Argument(golden.m_Arguments.back()));
+    reading.Add(Argument(golden.arguments.back()));
     Write(std::filesystem::path(readers) / name, reading);
   }
 }

@@ -18,14 +18,14 @@
 namespace gateway_fuzz {
 namespace {
 
-using gateway_tests::TExport;
+using gateway_tests::Export;
 
-/// An input's arguments: a choice of bound, whether blanks are skipped, a tag, the reply.
-constexpr TExport kReaders = {"Readers", "bbSS", nullptr, 0};
+// An input's arguments: a choice of bound, whether blanks are skipped, a tag, the reply.
+constexpr Export kReaders = {"Readers", "bbSS", nullptr, 0};
 
 constexpr size_t kBounds[] = {1, 2, 3, 5, 8, 16, 20, 40, 64, 128, 200, 218, 400, 512, 1024, 8192};
 
-/// The marks of a record, "00" and "01", are no fields of it.
+// The marks of a record, "00" and "01", are no fields of it.
 const char* const kRowTags[] = {"67", "68", "M2", "17", "751", "75", "W5", "18", "M22"};
 constexpr CTagTable kTable({{"67"},
                             {"68", Blanks::kSkipped},
@@ -57,9 +57,9 @@ void CheckToken(std::string_view tag, std::string_view reply, size_t bound, bool
   const CLent out(bound);
   const int length =
       gateway.GetToken(lentTag.get(), text.get(), out.get(), static_cast<int>(bound), skipBlank);
-  const TPlainToken plain = PlainToken(tag, reply, bound, skipBlank);
-  Expect("GetToken", out.get(), plain.m_Text);
-  ExpectNumber("GetToken's length", static_cast<size_t>(length), plain.m_nLength);
+  const PlainToken plain = ReadPlainToken(tag, reply, bound, skipBlank);
+  Expect("GetToken", out.get(), plain.text);
+  ExpectNumber("GetToken's length", static_cast<size_t>(length), plain.length);
   Expect("GetToken's reply", text.get(), reply);
 }
 
@@ -69,25 +69,25 @@ void CheckSubStrings(std::string_view reply, size_t bound) {
   const CLent out(bound);
   int pos = 0;
   for (int turn = 0; turn < 16 && static_cast<size_t>(pos) < reply.size(); ++turn) {
-    const TPlainRecord plain = PlainRecord(reply, static_cast<size_t>(pos), bound);
+    const PlainRecord plain = ReadPlainRecord(reply, static_cast<size_t>(pos), bound);
     gateway.GetSubString(text.get(), pos, out.get(), static_cast<int>(bound));
-    Expect("GetSubString", out.get(), plain.m_Text);
-    ExpectNumber("GetSubString's place", static_cast<size_t>(pos), plain.m_nNext);
+    Expect("GetSubString", out.get(), plain.text);
+    ExpectNumber("GetSubString's place", static_cast<size_t>(pos), plain.next);
   }
 }
 
 void CheckRecord(const CRecord& record, std::string_view plain, size_t valueBound) {
   ExpectNumber("an empty record", record.Empty() ? 1 : 0, plain.empty() ? 1 : 0);
   for (int row = 0; row < static_cast<int>(std::size(kRowTags)); ++row) {
-    const TPlainToken token =
-        PlainToken(kRowTags[row], plain, valueBound, (kTable.Skips() >> row & 1) != 0);
-    Expect(kRowTags[row], record.Text(row, valueBound), token.m_Text);
-    ExpectNumber(kRowTags[row], record.Has(row) ? 1 : 0, token.m_nLength > 0 ? 1 : 0);
+    const PlainToken token =
+        ReadPlainToken(kRowTags[row], plain, valueBound, (kTable.Skips() >> row & 1) != 0);
+    Expect(kRowTags[row], record.Text(row, valueBound), token.text);
+    ExpectNumber(kRowTags[row], record.Has(row) ? 1 : 0, token.length > 0 ? 1 : 0);
   }
 }
 
 void CheckRecords(std::string_view reply, size_t bound, size_t valueBound) {
-  const CLent text(reply, CLent::EEnd::kBare);  // the walker needs no terminator
+  const CLent text(reply, CLent::End::kBare);  // the walker needs no terminator
   CRecordWalker walker({text.get(), reply.size()}, bound);
   CRecord record(kTable);
   size_t pos = 0;
@@ -107,17 +107,17 @@ void CheckFields(std::string_view reply, std::string_view separator, size_t boun
   const CLent lentSeparator(separator);
   const CLent out(bound);
   char* cursor = text.get();
-  TPlainField plain = {"", reply};
-  for (int turn = 0; turn < 16 && !plain.m_Rest.empty(); ++turn) {
-    plain = PlainField(plain.m_Rest, separator);
+  PlainField plain = {"", reply};
+  for (int turn = 0; turn < 16 && !plain.rest.empty(); ++turn) {
+    plain = ReadPlainField(plain.rest, separator);
     out.get()[0] = '\0';
     gateway.GetFieldString(&cursor, lentSeparator.get(), out.get(), static_cast<int>(bound));
-    Expect("GetFieldString", out.get(), PlainBounded(plain.m_Text, bound));
-    Expect("GetFieldString's rest", cursor, plain.m_Rest);
+    Expect("GetFieldString", out.get(), PlainBounded(plain.text, bound));
+    Expect("GetFieldString's rest", cursor, plain.rest);
   }
 }
 
-/// A part of an identity field as its buffer holds it: one that does not fit leaves it as it was.
+// A part of an identity field as its buffer holds it: one that does not fit leaves it as it was.
 std::string_view PartOf(std::string_view part, size_t bound) {
   return part.empty() || part.size() >= bound ? "old" : part;
 }
@@ -146,21 +146,21 @@ void CheckTransport(std::string_view reply) {
   char message[64] = "old";
   int status = 1;
   gateway.CheckError(text.get(), &status, message, sizeof message);
-  const EPlainTransport plain = PlainTransport(reply);
-  const char* const expected = plain == EPlainTransport::kOk            ? ""
-                               : plain == EPlainTransport::kGatewayDown ? "[GATEWAY]主機連線失敗"
-                                                                        : "[BROKER]主機連線失敗";
+  const PlainTransport plain = JudgePlainTransport(reply);
+  const char* const expected = plain == PlainTransport::kOk            ? ""
+                               : plain == PlainTransport::kGatewayDown ? "[GATEWAY]主機連線失敗"
+                                                                       : "[BROKER]主機連線失敗";
   Expect("CheckError", message, expected);
   ExpectNumber("CheckError's status", status == -1 ? 1 : 0, *expected == '\0' ? 0 : 1);
 }
 
-void CheckReply(const TFuzzCall& call) {
-  const TFuzzArgument* const arguments = call.m_Arguments;
-  const size_t bound = kBounds[static_cast<size_t>(arguments[0].m_nNumber & 15)];
-  const size_t valueBound = kBounds[static_cast<size_t>(arguments[0].m_nNumber >> 4 & 15)];
-  const bool skipBlank = (arguments[1].m_nNumber & 1) != 0;
-  const std::string_view tag = arguments[2].m_Text;
-  const std::string_view reply = arguments[3].m_Text;
+void CheckReply(const FuzzCall& call) {
+  const FuzzArgument* const arguments = call.arguments;
+  const size_t bound = kBounds[static_cast<size_t>(arguments[0].number & 15)];
+  const size_t valueBound = kBounds[static_cast<size_t>(arguments[0].number >> 4 & 15)];
+  const bool skipBlank = (arguments[1].number & 1) != 0;
+  const std::string_view tag = arguments[2].text;
+  const std::string_view reply = arguments[3].text;
   // What has a bar in it is no tag.
   if (PlainFind(tag, "|", 0) == std::string_view::npos) {
     CheckToken(tag, reply, valueBound, skipBlank);
@@ -175,7 +175,7 @@ void CheckReply(const TFuzzCall& call) {
 
 }  // namespace
 
-TRows FuzzRows() {
+Rows FuzzRows() {
   return {&kReaders, 1};
 }
 

@@ -32,7 +32,7 @@ extern "C" size_t LLVMFuzzerCustomCrossOver(const uint8_t* data1, size_t size1,
 
 namespace {
 
-using TBytes = std::vector<uint8_t>;
+using Bytes = std::vector<uint8_t>;
 
 constexpr size_t kMaxSize = 6000;
 
@@ -43,13 +43,13 @@ size_t Below(size_t bound) {
   return (s_nRandom >> 8) % bound;
 }
 
-bool ReadFile(const std::string& path, std::vector<TBytes>& inputs) {
+bool ReadFile(const std::string& path, std::vector<Bytes>& inputs) {
   FILE* const file = std::fopen(path.c_str(), "rb");
   if (file == nullptr) {
     std::perror(path.c_str());
     return false;
   }
-  TBytes bytes(1 << 20);
+  Bytes bytes(1 << 20);
   bytes.resize(std::fread(bytes.data(), 1, bytes.size(), file));
   bytes.shrink_to_fit();  // a read behind the input is seen
   std::fclose(file);
@@ -57,7 +57,7 @@ bool ReadFile(const std::string& path, std::vector<TBytes>& inputs) {
   return true;
 }
 
-bool ReadAll(const char* path, std::vector<TBytes>& inputs) {
+bool ReadAll(const char* path, std::vector<Bytes>& inputs) {
   DIR* const folder = opendir(path);
   if (folder == nullptr) return ReadFile(path, inputs);
   bool good = true;
@@ -69,17 +69,17 @@ bool ReadAll(const char* path, std::vector<TBytes>& inputs) {
   return good;
 }
 
-void Play(const TBytes& input) {
+void Play(const Bytes& input) {
   LLVMFuzzerTestOneInput(input.data(), input.size());
 }
 
-/// The file that always holds the input that is being played: where to find what broke.
+// The file that always holds the input that is being played: where to find what broke.
 class CLastInput {
  public:
   explicit CLastInput(const char* path)
       : m_nFile(path == nullptr ? -1 : open(path, O_WRONLY | O_CREAT | O_TRUNC, 0666)) {}
 
-  void Keep(const TBytes& input) const {
+  void Keep(const Bytes& input) const {
     if (m_nFile < 0) return;
     if (pwrite(m_nFile, input.data(), input.size(), 0) < 0 ||
         ftruncate(m_nFile, static_cast<off_t>(input.size())) != 0) {
@@ -91,24 +91,24 @@ class CLastInput {
   int m_nFile;
 };
 
-/// The clock of the wall; `time` is stopped by the targets.
+// The clock of the wall; `time` is stopped by the targets.
 std::time_t Now() {
   std::timespec now{};
   clock_gettime(CLOCK_MONOTONIC, &now);
   return now.tv_sec;
 }
 
-void PlayMutations(std::vector<TBytes>& inputs, int seconds) {
+void PlayMutations(std::vector<Bytes>& inputs, int seconds) {
   const CLastInput last(std::getenv("QUORVANE_FUZZ_INPUT"));
   const std::time_t end = Now() + seconds;
   while (Now() < end) {
-    TBytes bytes(kMaxSize);
-    const TBytes& parent = inputs[Below(inputs.size())];
+    Bytes bytes(kMaxSize);
+    const Bytes& parent = inputs[Below(inputs.size())];
     size_t size = std::min(parent.size(), kMaxSize);
     std::copy(parent.begin(), parent.begin() + static_cast<std::ptrdiff_t>(size), bytes.begin());
     if (Below(8) == 0) {
-      const TBytes& other = inputs[Below(inputs.size())];
-      TBytes child(kMaxSize);
+      const Bytes& other = inputs[Below(inputs.size())];
+      Bytes child(kMaxSize);
       size = LLVMFuzzerCustomCrossOver(bytes.data(), size, other.data(), other.size(), child.data(),
                                        kMaxSize, s_nRandom);
       bytes.swap(child);
@@ -125,7 +125,7 @@ void PlayMutations(std::vector<TBytes>& inputs, int seconds) {
 
 }  // namespace
 
-/// Stands in for the fuzzer's own mutations.
+// Stands in for the fuzzer's own mutations.
 extern "C" size_t LLVMFuzzerMutate(uint8_t* data, size_t size, size_t maxSize) {
   const size_t at = Below(size + 1);
   if (Below(3) == 0 && size < maxSize) {
@@ -145,10 +145,10 @@ extern "C" size_t LLVMFuzzerMutate(uint8_t* data, size_t size, size_t maxSize) {
 int main(int argc, char** argv) {
   LLVMFuzzerInitialize(&argc, &argv);
   const bool mutates = argc > 4 && std::strcmp(argv[1], "--mutate") == 0;
-  std::vector<TBytes> inputs;
+  std::vector<Bytes> inputs;
   bool good = true;
   for (int i = mutates ? 4 : 1; i < argc; ++i) good = ReadAll(argv[i], inputs) && good;
-  for (const TBytes& input : inputs) Play(input);
+  for (const Bytes& input : inputs) Play(input);
   if (mutates && !inputs.empty()) {
     s_nRandom = static_cast<uint32_t>(std::atoi(argv[3]));
     PlayMutations(inputs, std::atoi(argv[2]));

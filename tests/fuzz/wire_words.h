@@ -7,7 +7,7 @@
 
 namespace gateway_fuzz {
 
-/// Tags of replies, near misses among them.
+// Tags of replies, near misses among them.
 inline constexpr const char* kTags[] = {
     "00", "01", "67",  "68",  "M2",  "M3",  "M5",  "M8",  "M22",  "07", "10", "11", "13",
     "14", "15", "16",  "17",  "18",  "19",  "21",  "22",  "27",   "28", "29", "31", "32",
@@ -18,7 +18,7 @@ inline constexpr const char* kTags[] = {
     "RA", "RF", "U5",  "U9",  "V5",  "V8",  "V9",  "W0",  "W1",   "W2", "W3", "W5", "0",
     "6",  "M",  "751", "752", "761", "762", "771", "772", "7511", ""};
 
-/// Values of fields, and texts that a host passes.
+// Values of fields, and texts that a host passes.
 inline constexpr const char* kValues[] = {"",
                                           " ",
                                           "  ",
@@ -96,13 +96,13 @@ inline constexpr const char* kValues[] = {"",
                                           "a b",
                                           "\xe8\xad\x89\xe5\x88\xb8"};
 
-/// Lengths just below, at and above the sizes of the buffers that bound values and requests.
+// Lengths just below, at and above the sizes of the buffers that bound values and requests.
 inline constexpr size_t kLengths[] = {
     1,   2,   3,   7,   8,   9,   10,  11,  15,  16,   17,   19,   20,   21,   39,  40,
     41,  63,  64,  65,  127, 128, 129, 199, 200, 201,  217,  218,  255,  256,  299, 300,
     399, 400, 401, 511, 512, 513, 767, 768, 769, 1023, 1024, 1025, 3800, 4095, 4096};
 
-/// Numbers that a host passes.
+// Numbers that a host passes.
 inline constexpr int64_t kNumbers[] = {
     0,   1,   2,   3,   4,    5,  6,  7,   8,    9,     10,         14,        15,
     16,  48,  49,  50,  66,   67, 68, 73,  83,   99,    100,        101,       127,

@@ -19,7 +19,7 @@ void Count() {
   if (t_bCounting) ++t_nAllocations;
 }
 
-/// Where the library's code lies.
+// Where the library's code lies.
 uintptr_t s_nLibrary = 0;
 uintptr_t s_nLibraryEnd = 0;
 
@@ -48,7 +48,7 @@ bool IsOfLibrary(const void* caller) {
   return t_bFailing && address >= s_nLibrary && address < s_nLibraryEnd;
 }
 
-/// Whether a request must be refused.
+// Whether a request must be refused.
 bool Refuses(const void* caller) {
   if (!IsOfLibrary(caller)) return false;
   ++t_nRequests;

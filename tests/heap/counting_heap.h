@@ -5,8 +5,8 @@
 
 namespace gateway_tests {
 
-/// Counts what the calling thread asks of the heap while the object lives. This program's own
-/// `malloc`, `calloc`, `realloc` and `free` take the place of the C library's, for the library too.
+// Counts what the calling thread asks of the heap while the object lives. This program's own
+// `malloc`, `calloc`, `realloc` and `free` take the place of the C library's, for the library too.
 class CHeapCount {
  public:
   CHeapCount();
@@ -16,21 +16,21 @@ class CHeapCount {
   int Releases() const;
 };
 
-/// Refuses what the library asks of the heap on the calling thread, while the object lives; the
-/// program's own requests and those of other libraries are served.
+// Refuses what the library asks of the heap on the calling thread, while the object lives; the
+// program's own requests and those of other libraries are served.
 class CFailingHeap {
  public:
   static constexpr size_t kNever = ~size_t{0};
 
-  /// Refuses the requests number `first` to `last`, counted from 1.
+  // Refuses the requests number `first` to `last`, counted from 1.
   CFailingHeap(size_t first, size_t last);
   CFailingHeap(const CFailingHeap&) = delete;
   CFailingHeap& operator=(const CFailingHeap&) = delete;
   ~CFailingHeap();
 
-  /// Requests of the library so far, refused ones too.
+  // Requests of the library so far, refused ones too.
   size_t Requests() const;
-  /// Blocks that the library was given and has not released.
+  // Blocks that the library was given and has not released.
   long Unreleased() const;
 };
 

@@ -14,43 +14,43 @@
 namespace gateway_tests {
 namespace {
 
-struct TAnswer {
-  TOutcome m_Outcome;
-  size_t m_nRequests = 0;
-  long m_nUnreleased = 0;
+struct Answer {
+  Outcome outcome;
+  size_t requests = 0;
+  long unreleased = 0;
 };
 
-TAnswer Play(const TGoldenCase& golden, size_t first, size_t last) {
-  SetClock(golden.m_Clock.empty() ? "2024-01-15 13:45:21" : golden.m_Clock);
+Answer Play(const GoldenCase& golden, size_t first, size_t last) {
+  SetClock(golden.clock.empty() ? "2024-01-15 13:45:21" : golden.clock);
   CRecordingHost host;
-  TAnswer answer;
+  Answer answer;
   const CFailingHeap heap(first, last);
-  answer.m_Outcome = host.Call(*FindExport(golden.m_Operation), golden.m_Arguments);
-  answer.m_nRequests = heap.Requests();
-  answer.m_nUnreleased = heap.Unreleased();
+  answer.outcome = host.Call(*FindExport(golden.operation), golden.arguments);
+  answer.requests = heap.Requests();
+  answer.unreleased = heap.Unreleased();
   return answer;
 }
 
-/// Nothing, with status -1; a reply that is refused for a reason of its own may still say so.
-void ExpectFailure(const TAnswer& answer, const TOutcome& whole, const std::string& where) {
-  const TOutcome& outcome = answer.m_Outcome;
-  const bool refused = whole.m_Status == -1 && outcome.m_Result == whole.m_Result;
-  EXPECT_TRUE(outcome.IsSound()) << where << testing::PrintToString(outcome.m_Violations);
-  EXPECT_TRUE(outcome.m_Result == "" || refused) << where << ": " << *outcome.m_Result;
-  EXPECT_EQ(outcome.m_Status, -1) << where;
-  EXPECT_EQ(answer.m_nUnreleased, 0) << where;
+// Nothing, with status -1; a reply that is refused for a reason of its own may still say so.
+void ExpectFailure(const Answer& answer, const Outcome& whole, const std::string& where) {
+  const Outcome& outcome = answer.outcome;
+  const bool refused = whole.status == -1 && outcome.result == whole.result;
+  EXPECT_TRUE(outcome.IsSound()) << where << testing::PrintToString(outcome.violations);
+  EXPECT_TRUE(outcome.result == "" || refused) << where << ": " << *outcome.result;
+  EXPECT_EQ(outcome.status, -1) << where;
+  EXPECT_EQ(answer.unreleased, 0) << where;
 }
 
 TEST(FailingHeap, EachRefusalIsAnsweredByNothingAndStatusMinusOne) {
   std::set<std::string> asking;
-  for (const TGoldenCase& golden : ReadGoldenCases(TEST_VECTORS).m_Cases) {
-    const TAnswer whole = Play(golden, CFailingHeap::kNever, 0);
-    EXPECT_EQ(whole.m_nUnreleased, 0) << golden.Where();
-    if (whole.m_nRequests > 0) asking.insert(golden.m_Operation);
-    for (size_t nth = 1; nth <= whole.m_nRequests; ++nth) {
+  for (const GoldenCase& golden : ReadGoldenCases(TEST_VECTORS).cases) {
+    const Answer whole = Play(golden, CFailingHeap::kNever, 0);
+    EXPECT_EQ(whole.unreleased, 0) << golden.Where();
+    if (whole.requests > 0) asking.insert(golden.operation);
+    for (size_t nth = 1; nth <= whole.requests; ++nth) {
       const std::string where = golden.Where() + ", request " + std::to_string(nth);
-      ExpectFailure(Play(golden, nth, nth), whole.m_Outcome, where + " alone");
-      ExpectFailure(Play(golden, nth, CFailingHeap::kNever), whole.m_Outcome,
+      ExpectFailure(Play(golden, nth, nth), whole.outcome, where + " alone");
+      ExpectFailure(Play(golden, nth, CFailingHeap::kNever), whole.outcome,
                     where + " and all after it");
     }
   }
@@ -66,18 +66,18 @@ TEST(FailingHeap, EachRefusalIsAnsweredByNothingAndStatusMinusOne) {
 
 // A list that outgrows its first block, refused the second one.
 TEST(FailingHeap, ListThatCannotGrowIsAnsweredByNothing) {
-  TGoldenCase golden;
-  golden.m_Operation = "QueryOrderDecode";
+  GoldenCase golden;
+  golden.operation = "QueryOrderDecode";
   std::string reply = "|00=1|67=1|68=0000";
   for (int i = 0; i < 5000; ++i) reply += "|00=|68=0000|01=";
-  golden.m_Arguments = {TArgument::Int(0), TArgument::Text(reply)};
-  const TAnswer whole = Play(golden, CFailingHeap::kNever, 0);
-  EXPECT_EQ(whole.m_Outcome.m_Status, 1);
-  EXPECT_EQ(whole.m_nRequests, 2U);
-  EXPECT_EQ(whole.m_nUnreleased, 0);
+  golden.arguments = {Argument::Int(0), Argument::Text(reply)};
+  const Answer whole = Play(golden, CFailingHeap::kNever, 0);
+  EXPECT_EQ(whole.outcome.status, 1);
+  EXPECT_EQ(whole.requests, 2U);
+  EXPECT_EQ(whole.unreleased, 0);
   for (const size_t nth : {1U, 2U}) {
-    ExpectFailure(Play(golden, nth, nth), whole.m_Outcome, std::to_string(nth));
-    ExpectFailure(Play(golden, nth, CFailingHeap::kNever), whole.m_Outcome,
+    ExpectFailure(Play(golden, nth, nth), whole.outcome, std::to_string(nth));
+    ExpectFailure(Play(golden, nth, CFailingHeap::kNever), whole.outcome,
                   std::to_string(nth) + " and after");
   }
 }

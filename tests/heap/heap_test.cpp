@@ -19,48 +19,48 @@ namespace {
 
 constexpr int kMostOfDecoder = 2;
 
-/// The blocks that one call takes from the heap.
-int AllocationsOf(const TExport& row, const TArguments& arguments) {
+// The blocks that one call takes from the heap.
+int AllocationsOf(const Export& row, const Arguments& arguments) {
   jint status = 0;
   std::vector<jvalue> values;
-  for (const TArgument& argument : arguments) {
+  for (const Argument& argument : arguments) {
     jvalue value{};
-    switch (argument.m_chLetter) {
+    switch (argument.letter) {
       case 'S':
-        value.l = argument.m_Text ? BareText(argument.m_Text->c_str()) : nullptr;
+        value.l = argument.text ? BareText(argument.text->c_str()) : nullptr;
         break;
       case 'b':
-        value.b = static_cast<jbyte>(argument.m_nNumber);
+        value.b = static_cast<jbyte>(argument.number);
         break;
       case 'c':
-        value.c = static_cast<jchar>(argument.m_nNumber);
+        value.c = static_cast<jchar>(argument.number);
         break;
       default:
-        value.i = static_cast<jint>(argument.m_nNumber);
+        value.i = static_cast<jint>(argument.number);
     }
     values.push_back(value);
   }
   values.emplace_back().l = BareStatus(&status);
   void* const entryPoint = row.EntryPoint();
   JNIEnv* const env = BareHost();
-  EXPECT_NE(entryPoint, nullptr) << row.m_szName;
+  EXPECT_NE(entryPoint, nullptr) << row.name;
   if (entryPoint == nullptr) return 0;
 
   const CHeapCount count;
-  row.m_pCall(entryPoint, env, values.data());
+  row.call(entryPoint, env, values.data());
   return count.Allocations();
 }
 
 int AllocationsOfReply(std::string_view decoder, const std::string& reply) {
-  const TExport* const row = FindExport(decoder);
-  TArguments arguments = {TArgument::Text(reply)};
-  if (row->m_szShape.front() == 'i') arguments.insert(arguments.begin(), TArgument::Int(0));
+  const Export* const row = FindExport(decoder);
+  Arguments arguments = {Argument::Text(reply)};
+  if (row->shape.front() == 'i') arguments.insert(arguments.begin(), Argument::Int(0));
   return AllocationsOf(*row, arguments);
 }
 
-int MostOf(const TExport& row) {
+int MostOf(const Export& row) {
   if (row.IsDecoder()) return kMostOfDecoder;
-  return row.m_szName == "RegisterCertEncode" ? kMostOfDecoder : 0;  // a message of any length
+  return row.name == "RegisterCertEncode" ? kMostOfDecoder : 0;  // a message of any length
 }
 
 TEST(Heap, CountsWhatIsAskedOfIt) {
@@ -79,12 +79,12 @@ TEST(Heap, CountsWhatTheLibraryAsksOfIt) {
 }
 
 TEST(Heap, IsLeftAloneByRequestsAndHardlyUsedByAnswers) {
-  const TGoldenCases golden = ReadGoldenCases(TEST_VECTORS);
-  ASSERT_FALSE(golden.m_Cases.empty());
-  for (const TGoldenCase& one : golden.m_Cases) {
-    const TExport* const row = FindExport(one.m_Operation);
+  const GoldenCases golden = ReadGoldenCases(TEST_VECTORS);
+  ASSERT_FALSE(golden.cases.empty());
+  for (const GoldenCase& one : golden.cases) {
+    const Export* const row = FindExport(one.operation);
     ASSERT_NE(row, nullptr) << one.Where();
-    EXPECT_LE(AllocationsOf(*row, one.m_Arguments), MostOf(*row)) << one.Where();
+    EXPECT_LE(AllocationsOf(*row, one.arguments), MostOf(*row)) << one.Where();
   }
 }
 
@@ -102,11 +102,11 @@ INSTANTIATE_TEST_SUITE_P(Heap, HeapOfList, testing::ValuesIn(kListDecoders),
 
 TEST(Heap, IsHardlyUsedByAnswersWithoutAList) {
   int answers = 0;
-  for (const TExport& row : AllExports()) {
-    const std::string reply = SampleAnswer(row.m_szName);
+  for (const Export& row : AllExports()) {
+    const std::string reply = SampleAnswer(row.name);
     if (reply.empty()) continue;
     ++answers;
-    EXPECT_LE(AllocationsOfReply(row.m_szName, reply), kMostOfDecoder) << row.m_szName;
+    EXPECT_LE(AllocationsOfReply(row.name, reply), kMostOfDecoder) << row.name;
   }
   EXPECT_EQ(answers, 16);  // with the lists, every decoder
 }

@@ -23,12 +23,12 @@ TEST(Operators, BlockOfNoBytesIsABlock) {
 }
 
 TEST(Operators, EachFormReleasesABlock) {
-  using TForm = void (*)(void*);
-  for (const TForm release : {
-           TForm([](void* block) { operator delete(block); }),
-           TForm([](void* block) { operator delete (block, size_t{1}); }),
-           TForm([](void* block) { operator delete[](block); }),
-           TForm([](void* block) { operator delete[](block, size_t{1}); }),
+  using Form = void (*)(void*);
+  for (const Form release : {
+           Form([](void* block) { operator delete(block); }),
+           Form([](void* block) { operator delete (block, size_t{1}); }),
+           Form([](void* block) { operator delete[](block); }),
+           Form([](void* block) { operator delete[](block, size_t{1}); }),
        }) {
     void* const block = operator new[](1, std::nothrow_t{});
     const CHeapCount count;

@@ -14,7 +14,7 @@ struct Outcome {
   bool accepted;        // liblog's answer
 };
 
-/// Runs print_line with `arguments` under `tags` as ANDROID_LOG_TAGS (null: not set).
+// Runs print_line with `arguments` under `tags` as ANDROID_LOG_TAGS (null: not set).
 Outcome Print(const char* tags, std::vector<std::string> arguments) {
   int ends[2];
   EXPECT_EQ(0, pipe(ends));

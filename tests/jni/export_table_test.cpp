@@ -13,8 +13,8 @@ namespace {
 TEST(ExportTable, HoldsEachMethodOnce) {
   std::set<std::string_view> names;
   int decoders = 0;
-  for (const TExport& row : AllExports()) {
-    EXPECT_TRUE(names.insert(row.m_szName).second) << row.m_szName;
+  for (const Export& row : AllExports()) {
+    EXPECT_TRUE(names.insert(row.name).second) << row.name;
     decoders += row.IsDecoder() ? 1 : 0;
   }
   EXPECT_EQ(names.size(), 59U);
@@ -26,14 +26,14 @@ TEST(ExportTable, DerivesTheJavaDescriptor) {
   EXPECT_EQ(FindExport("SubmitOrderEncode2")->Descriptor(),
             "(IIILjava/lang/String;Ljava/lang/String;Ljava/lang/String;Ljava/lang/String;"
             "Ljava/lang/String;BB)Ljava/lang/String;");
-  EXPECT_EQ(FindExport("QueryOrderDecode")->m_szShape, "iSs");
-  EXPECT_EQ(FindExport("FutSubmitOrderEncode1")->m_szShape, "iiiSSSSSSSSSSSSSSSbbbcccccciiis");
+  EXPECT_EQ(FindExport("QueryOrderDecode")->shape, "iSs");
+  EXPECT_EQ(FindExport("FutSubmitOrderEncode1")->shape, "iiiSSSSSSSSSSSSSSSbbbcccccciiis");
 }
 
 TEST(ExportTable, EachMethodIsExported) {
   std::string missing;
-  for (const TExport& row : AllExports()) {
-    if (row.EntryPoint() == nullptr) missing.append(" ").append(row.m_szName);
+  for (const Export& row : AllExports()) {
+    if (row.EntryPoint() == nullptr) missing.append(" ").append(row.name);
   }
   EXPECT_EQ(missing, "");
 }

@@ -11,7 +11,7 @@
 namespace gateway_tests {
 namespace {
 
-using TEvents = std::vector<std::string>;
+using Events = std::vector<std::string>;
 
 constexpr int32_t kUntouched = 0x5A5A;
 const std::string kHeader =
@@ -19,54 +19,54 @@ const std::string kHeader =
     "15=1|IDNO=A123456789|ACNO=1234567|PWD=secret|";
 const std::string kBrokerDown = "[BROKER]主機連線失敗";
 
-/// The arguments of a request, in Java order.
-TArguments Request() {
-  return {TArgument::Int(0),
-          TArgument::Int(0),
-          TArgument::Int(7),
-          TArgument::Text("SN0001"),
-          TArgument::Text("10.0.0.1"),
-          TArgument::Text("9A00"),
-          TArgument::Text("A123456789&1234567"),
-          TArgument::Text("secret")};
+// The arguments of a request, in Java order.
+Arguments Request() {
+  return {Argument::Int(0),
+          Argument::Int(0),
+          Argument::Int(7),
+          Argument::Text("SN0001"),
+          Argument::Text("10.0.0.1"),
+          Argument::Text("9A00"),
+          Argument::Text("A123456789&1234567"),
+          Argument::Text("secret")};
 }
 
-struct TOperation {
-  const char* m_szEncode;
-  const char* m_szDecode;
-  const char* m_szFunction;
+struct Operation {
+  const char* encode;
+  const char* decode;
+  const char* function;
 };
-void PrintTo(const TOperation& operation, std::ostream* out) {
-  *out << operation.m_szEncode;
+void PrintTo(const Operation& operation, std::ostream* out) {
+  *out << operation.encode;
 }
 
-class Frame : public testing::TestWithParam<TOperation> {
+class Frame : public testing::TestWithParam<Operation> {
  protected:
   void SetUp() override { ASSERT_TRUE(SetClock("2024-01-15 13:45:21")); }
-  TOutcome Encode(const TArguments& arguments) {
-    return m_Host.Call(*FindExport(GetParam().m_szEncode), arguments);
+  Outcome Encode(const Arguments& arguments) {
+    return m_host.Call(*FindExport(GetParam().encode), arguments);
   }
-  TOutcome Decode(const TArgument& reply) {
-    return m_Host.Call(*FindExport(GetParam().m_szDecode), {reply});
+  Outcome Decode(const Argument& reply) {
+    return m_host.Call(*FindExport(GetParam().decode), {reply});
   }
-  std::string RequestText() const { return kHeader + GetParam().m_szFunction; }
+  std::string RequestText() const { return kHeader + GetParam().function; }
 
-  CRecordingHost m_Host;
+  CRecordingHost m_host;
 };
 
-std::string NameOf(const testing::TestParamInfo<TOperation>& info) {
-  return info.param.m_szEncode;
+std::string NameOf(const testing::TestParamInfo<Operation>& info) {
+  return info.param.encode;
 }
 
 INSTANTIATE_TEST_SUITE_P(Operations, Frame,
-                         testing::Values(TOperation{"AuthEncode", "AuthDecode", "FUNC=0|01="},
-                                         TOperation{"GetTotalAccountEncode",
-                                                    "GetTotalAccountDecode", "FUNC=12|01="}),
+                         testing::Values(Operation{"AuthEncode", "AuthDecode", "FUNC=0|01="},
+                                         Operation{"GetTotalAccountEncode", "GetTotalAccountDecode",
+                                                   "FUNC=12|01="}),
                          NameOf);
 
 TEST_P(Frame, RequestHoldsAllThenBuildsThenReleasesThenAnswers) {
-  const TOutcome outcome = Encode(Request());
-  const TEvents expected = {
+  const Outcome outcome = Encode(Request());
+  const Events expected = {
       "GetStringUTFChars 1",
       "GetStringUTFChars 2",
       "GetStringUTFChars 3",
@@ -86,17 +86,17 @@ TEST_P(Frame, RequestHoldsAllThenBuildsThenReleasesThenAnswers) {
       "NewStringUTF " + RequestText(),
       "log ~CGatewayPub",
   };
-  EXPECT_EQ(outcome.m_Events, expected);
-  EXPECT_TRUE(outcome.IsSound()) << testing::PrintToString(outcome.m_Violations);
-  EXPECT_EQ(outcome.m_Result, RequestText());
-  EXPECT_EQ(outcome.m_Status, 1);
+  EXPECT_EQ(outcome.events, expected);
+  EXPECT_TRUE(outcome.IsSound()) << testing::PrintToString(outcome.violations);
+  EXPECT_EQ(outcome.result, RequestText());
+  EXPECT_EQ(outcome.status, 1);
 }
 
 TEST_P(Frame, RefusedRequestTakesTheSameRoad) {
-  TArguments arguments = Request();
-  arguments[4] = TArgument::Text("");
+  Arguments arguments = Request();
+  arguments[4] = Argument::Text("");
   const std::string message = "[CLIENT] 無法取得IP，請確認網路連線是否正常！";
-  const TEvents expected = {
+  const Events expected = {
       "GetStringUTFChars 1",     "GetStringUTFChars 2",
       "GetStringUTFChars 3",     "GetStringUTFChars 4",
       "GetStringUTFChars 5",     "GetIntArrayElements",
@@ -107,17 +107,17 @@ TEST_P(Frame, RefusedRequestTakesTheSameRoad) {
       "ReleaseIntArrayElements", "NewStringUTF " + message,
       "log ~CGatewayPub",
   };
-  const TOutcome outcome = Encode(arguments);
-  EXPECT_EQ(outcome.m_Events, expected);
-  EXPECT_EQ(outcome.m_Status, -1);
+  const Outcome outcome = Encode(arguments);
+  EXPECT_EQ(outcome.events, expected);
+  EXPECT_EQ(outcome.status, -1);
 }
 
 TEST_P(Frame, ReplyHoldsAllThenReadsThenReleasesThenAnswers) {
-  const TOutcome outcome = Decode(TArgument::Text("[BROKER]timeout"));
-  const TEvents expected = {
+  const Outcome outcome = Decode(Argument::Text("[BROKER]timeout"));
+  const Events expected = {
       "GetStringUTFChars 1",
       "GetIntArrayElements",
-      std::string("log ") + GetParam().m_szDecode + ": Len:15",
+      std::string("log ") + GetParam().decode + ": Len:15",
       "log [BROKER]timeout",
       "log " + kBrokerDown,
       "ReleaseStringUTFChars 1",
@@ -125,34 +125,34 @@ TEST_P(Frame, ReplyHoldsAllThenReadsThenReleasesThenAnswers) {
       "NewStringUTF " + kBrokerDown,
       "log ~CGatewayPub",
   };
-  EXPECT_EQ(outcome.m_Events, expected);
-  EXPECT_EQ(outcome.m_Status, -1);
+  EXPECT_EQ(outcome.events, expected);
+  EXPECT_EQ(outcome.status, -1);
 }
 
 TEST_P(Frame, NullReplyIsHandedOnWithoutAskingTheMachine) {
-  const TOutcome outcome = Decode(TArgument::Null());
-  const TEvents expected = {
+  const Outcome outcome = Decode(Argument::Null());
+  const Events expected = {
       "GetIntArrayElements",
-      std::string("log ") + GetParam().m_szDecode + ": Len:0",
+      std::string("log ") + GetParam().decode + ": Len:0",
       "log ",
       "log " + kBrokerDown,
       "ReleaseIntArrayElements",
       "NewStringUTF " + kBrokerDown,
       "log ~CGatewayPub",
   };
-  EXPECT_EQ(outcome.m_Events, expected);
-  EXPECT_TRUE(outcome.IsSound()) << testing::PrintToString(outcome.m_Violations);
+  EXPECT_EQ(outcome.events, expected);
+  EXPECT_TRUE(outcome.IsSound()) << testing::PrintToString(outcome.violations);
 }
 
 TEST_P(Frame, NullStringsOfARequestAreNeitherHeldNorReleased) {
-  TArguments arguments = Request();
-  arguments[3] = TArgument::Null();
-  arguments[5] = TArgument::Null();
-  arguments[6] = TArgument::Null();
+  Arguments arguments = Request();
+  arguments[3] = Argument::Null();
+  arguments[5] = Argument::Null();
+  arguments[6] = Argument::Null();
   const std::string header =
       "F=7|KIND=S|BHNO=|CB=1|IP=10.0.0.1|11=NO DEFINE|VER=24369|65=0013452107|SN=|";
-  const std::string request = header + GetParam().m_szFunction;
-  const TEvents expected = {
+  const std::string request = header + GetParam().function;
+  const Events expected = {
       "GetStringUTFChars 2",
       "GetStringUTFChars 5",
       "GetIntArrayElements",
@@ -165,80 +165,80 @@ TEST_P(Frame, NullStringsOfARequestAreNeitherHeldNorReleased) {
       "NewStringUTF " + request,
       "log ~CGatewayPub",
   };
-  EXPECT_EQ(Encode(arguments).m_Events, expected);
+  EXPECT_EQ(Encode(arguments).events, expected);
 }
 
 TEST_P(Frame, NullStatusArrayIsLeftAlone) {
-  m_Host.PassNullStatus(true);
-  const TOutcome request = Encode(Request());
-  EXPECT_TRUE(request.IsSound()) << testing::PrintToString(request.m_Violations);
-  EXPECT_EQ(request.m_Result, RequestText());
-  EXPECT_EQ(request.m_Status, std::nullopt);
-  const TEvents expected = {
+  m_host.PassNullStatus(true);
+  const Outcome request = Encode(Request());
+  EXPECT_TRUE(request.IsSound()) << testing::PrintToString(request.violations);
+  EXPECT_EQ(request.result, RequestText());
+  EXPECT_EQ(request.status, std::nullopt);
+  const Events expected = {
       "GetStringUTFChars 1",
-      std::string("log ") + GetParam().m_szDecode + ": Len:0",
+      std::string("log ") + GetParam().decode + ": Len:0",
       "log ",
       "log " + kBrokerDown,
       "ReleaseStringUTFChars 1",
       "NewStringUTF " + kBrokerDown,
       "log ~CGatewayPub",
   };
-  EXPECT_EQ(Decode(TArgument::Text("")).m_Events, expected);
+  EXPECT_EQ(Decode(Argument::Text("")).events, expected);
 }
 
 TEST_P(Frame, RefusedCharactersEndTheCallBeforeAnythingIsBuilt) {
   for (int failing = 1; failing <= 5; ++failing) {
-    m_Host.FailCall(failing);
-    TEvents expected;
+    m_host.FailCall(failing);
+    Events expected;
     for (int i = 1; i <= failing; ++i) {
       expected.push_back("GetStringUTFChars " + std::to_string(i));
     }
     for (int i = 1; i < failing; ++i) {
       expected.push_back("ReleaseStringUTFChars " + std::to_string(i));
     }
-    const TOutcome outcome = Encode(Request());
-    EXPECT_EQ(outcome.m_Events, expected) << failing;
-    EXPECT_EQ(outcome.m_Violations, TEvents()) << failing;
-    EXPECT_EQ(outcome.m_Result, std::nullopt) << failing;
-    EXPECT_EQ(outcome.m_Status, kUntouched) << failing;
+    const Outcome outcome = Encode(Request());
+    EXPECT_EQ(outcome.events, expected) << failing;
+    EXPECT_EQ(outcome.violations, Events()) << failing;
+    EXPECT_EQ(outcome.result, std::nullopt) << failing;
+    EXPECT_EQ(outcome.status, kUntouched) << failing;
   }
 }
 
 TEST_P(Frame, RefusedElementsEndTheCallBeforeAnythingIsBuilt) {
-  m_Host.FailCall(6);
-  const TOutcome request = Encode(Request());
-  const TEvents expected = {
+  m_host.FailCall(6);
+  const Outcome request = Encode(Request());
+  const Events expected = {
       "GetStringUTFChars 1",     "GetStringUTFChars 2",     "GetStringUTFChars 3",
       "GetStringUTFChars 4",     "GetStringUTFChars 5",     "GetIntArrayElements",
       "ReleaseStringUTFChars 1", "ReleaseStringUTFChars 2", "ReleaseStringUTFChars 3",
       "ReleaseStringUTFChars 4", "ReleaseStringUTFChars 5",
   };
-  EXPECT_EQ(request.m_Events, expected);
-  EXPECT_EQ(request.m_Result, std::nullopt);
+  EXPECT_EQ(request.events, expected);
+  EXPECT_EQ(request.result, std::nullopt);
 
-  m_Host.FailCall(2);
-  const TOutcome reply = Decode(TArgument::Text("|68=0000|"));
-  EXPECT_EQ(reply.m_Events,
-            (TEvents{"GetStringUTFChars 1", "GetIntArrayElements", "ReleaseStringUTFChars 1"}));
-  EXPECT_EQ(reply.m_Result, std::nullopt);
-  EXPECT_EQ(reply.m_Status, kUntouched);
+  m_host.FailCall(2);
+  const Outcome reply = Decode(Argument::Text("|68=0000|"));
+  EXPECT_EQ(reply.events,
+            (Events{"GetStringUTFChars 1", "GetIntArrayElements", "ReleaseStringUTFChars 1"}));
+  EXPECT_EQ(reply.result, std::nullopt);
+  EXPECT_EQ(reply.status, kUntouched);
 }
 
 TEST_P(Frame, RefusedResultStringGivesNullAndTheStatus) {
-  m_Host.FailCall(3);
-  const TOutcome outcome = Decode(TArgument::Text(""));
-  EXPECT_EQ(outcome.m_Events.back(), "log ~CGatewayPub");
-  EXPECT_EQ(outcome.m_Violations, TEvents());
-  EXPECT_EQ(outcome.m_Result, std::nullopt);
-  EXPECT_EQ(outcome.m_Status, -1);
+  m_host.FailCall(3);
+  const Outcome outcome = Decode(Argument::Text(""));
+  EXPECT_EQ(outcome.events.back(), "log ~CGatewayPub");
+  EXPECT_EQ(outcome.violations, Events());
+  EXPECT_EQ(outcome.result, std::nullopt);
+  EXPECT_EQ(outcome.status, -1);
 }
 
 TEST_P(Frame, NothingSurvivesACall) {
-  const TOutcome first = Encode(Request());
-  TArguments refused = Request();
-  refused[4] = TArgument::Null();
-  EXPECT_EQ(Encode(refused).m_Status, -1);
-  EXPECT_EQ(Encode(Request()).m_Events, first.m_Events);
+  const Outcome first = Encode(Request());
+  Arguments refused = Request();
+  refused[4] = Argument::Null();
+  EXPECT_EQ(Encode(refused).status, -1);
+  EXPECT_EQ(Encode(Request()).events, first.events);
 }
 
 TEST(PlatformNames, AreShortCapitalsAndOnlyTwoRowsAreAlike) {
@@ -247,9 +247,9 @@ TEST(PlatformNames, AreShortCapitalsAndOnlyTwoRowsAreAlike) {
   std::vector<std::string> names;
   CRecordingHost host;
   for (int row = 0; row < kRows; ++row) {
-    TArguments arguments = Request();
-    arguments[1] = TArgument::Int(row);
-    const std::string request = host.Call(*FindExport("AuthEncode"), arguments).m_Result.value();
+    Arguments arguments = Request();
+    arguments[1] = Argument::Int(row);
+    const std::string request = host.Call(*FindExport("AuthEncode"), arguments).result.value();
     const size_t begin = request.find("|11=") + 4;
     names.push_back(request.substr(begin, request.find('|', begin) - begin));
   }

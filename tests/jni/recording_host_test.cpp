@@ -11,15 +11,15 @@
 namespace gateway_tests {
 namespace {
 
-using TDecodeFunction = jstring (*)(JNIEnv*, jclass, jstring, jintArray);
+using DecodeFunction = jstring (*)(JNIEnv*, jclass, jstring, jintArray);
 
-TOutcome CallDecoder(TDecodeFunction function, const TArgument& reply = TArgument::Text("text"),
-                     EPlacement placement = EPlacement::kHeap) {
+Outcome CallDecoder(DecodeFunction function, const Argument& reply = Argument::Text("text"),
+                    Placement placement = Placement::kHeap) {
   CRecordingHost host(placement);
   return host.CallAt(reinterpret_cast<void*>(function), *FindExport("AuthDecode"), {reply});
 }
 
-/// An entry point as it should be; the others below are this one with one mistake.
+// An entry point as it should be; the others below are this one with one mistake.
 jstring Good(JNIEnv* env, jclass, jstring reply, jintArray status) {
   const char* text = env->GetStringUTFChars(reply, nullptr);
   jint* elements = env->GetIntArrayElements(status, nullptr);
@@ -30,117 +30,117 @@ jstring Good(JNIEnv* env, jclass, jstring reply, jintArray status) {
 }
 
 TEST(RecordingHost, PassesAGoodCall) {
-  const TOutcome outcome = CallDecoder(&Good);
+  const Outcome outcome = CallDecoder(&Good);
   EXPECT_TRUE(outcome.IsSound());
-  EXPECT_EQ(outcome.m_Result, "result");
-  EXPECT_EQ(outcome.m_Status, 1);
-  EXPECT_EQ(outcome.m_nFallibleCalls, 3);
+  EXPECT_EQ(outcome.result, "result");
+  EXPECT_EQ(outcome.status, 1);
+  EXPECT_EQ(outcome.fallibleCalls, 3);
 }
 
 TEST(RecordingHost, SeesAStringThatIsNeverReleased) {
-  const TOutcome outcome = CallDecoder([](JNIEnv* env, jclass, jstring reply, jintArray) {
+  const Outcome outcome = CallDecoder([](JNIEnv* env, jclass, jstring reply, jintArray) {
     env->GetStringUTFChars(reply, nullptr);
     return env->NewStringUTF("");
   });
-  EXPECT_EQ(outcome.m_Violations, std::vector<std::string>{"string 1 was never released"});
+  EXPECT_EQ(outcome.violations, std::vector<std::string>{"string 1 was never released"});
 }
 
 TEST(RecordingHost, SeesElementsThatAreNeverReleased) {
-  const TOutcome outcome = CallDecoder([](JNIEnv* env, jclass, jstring, jintArray status) {
+  const Outcome outcome = CallDecoder([](JNIEnv* env, jclass, jstring, jintArray status) {
     env->GetIntArrayElements(status, nullptr)[0] = 1;
     return env->NewStringUTF("");
   });
-  EXPECT_EQ(outcome.m_Violations,
+  EXPECT_EQ(outcome.violations,
             std::vector<std::string>{"the status elements were never released"});
-  EXPECT_NE(outcome.m_Status, 1) << "only a release writes back";
+  EXPECT_NE(outcome.status, 1) << "only a release writes back";
 }
 
 TEST(RecordingHost, WritesNothingBackWhenElementsAreAbandoned) {
-  const TOutcome outcome = CallDecoder([](JNIEnv* env, jclass, jstring, jintArray status) {
+  const Outcome outcome = CallDecoder([](JNIEnv* env, jclass, jstring, jintArray status) {
     jint* elements = env->GetIntArrayElements(status, nullptr);
     elements[0] = 1;
     env->ReleaseIntArrayElements(status, elements, JNI_ABORT);
     return env->NewStringUTF("");
   });
-  EXPECT_NE(outcome.m_Status, 1);
+  EXPECT_NE(outcome.status, 1);
   EXPECT_FALSE(outcome.IsSound());
 }
 
 TEST(RecordingHost, SeesADoubleReleaseAndAForeignPointer) {
-  const TOutcome twice = CallDecoder([](JNIEnv* env, jclass, jstring reply, jintArray) {
+  const Outcome twice = CallDecoder([](JNIEnv* env, jclass, jstring reply, jintArray) {
     const char* text = env->GetStringUTFChars(reply, nullptr);
     env->ReleaseStringUTFChars(reply, text);
     env->ReleaseStringUTFChars(reply, text);
     return env->NewStringUTF("");
   });
-  EXPECT_EQ(twice.m_Violations,
+  EXPECT_EQ(twice.violations,
             std::vector<std::string>{"ReleaseStringUTFChars: string is not held"});
-  const TOutcome foreign = CallDecoder([](JNIEnv* env, jclass, jstring reply, jintArray) {
+  const Outcome foreign = CallDecoder([](JNIEnv* env, jclass, jstring reply, jintArray) {
     env->ReleaseStringUTFChars(reply, env->GetStringUTFChars(reply, nullptr) + 1);
     return env->NewStringUTF("");
   });
-  EXPECT_EQ(foreign.m_Violations,
+  EXPECT_EQ(foreign.violations,
             std::vector<std::string>{"ReleaseStringUTFChars: not the pointer handed out"});
 }
 
 TEST(RecordingHost, SeesAWriteIntoTheCharacters) {
-  const TOutcome outcome = CallDecoder([](JNIEnv* env, jclass, jstring reply, jintArray) {
+  const Outcome outcome = CallDecoder([](JNIEnv* env, jclass, jstring reply, jintArray) {
     const char* text = env->GetStringUTFChars(reply, nullptr);
     const_cast<char*>(text)[0] = 'X';
     env->ReleaseStringUTFChars(reply, text);
     return env->NewStringUTF("");
   });
-  EXPECT_EQ(outcome.m_Violations,
+  EXPECT_EQ(outcome.violations,
             std::vector<std::string>{"ReleaseStringUTFChars: the characters were written to"});
 }
 
 TEST(RecordingHost, SeesARequestForTheCharactersOfNull) {
-  const TOutcome outcome = CallDecoder(
+  const Outcome outcome = CallDecoder(
       [](JNIEnv* env, jclass, jstring reply, jintArray) {
         env->GetStringUTFChars(reply, nullptr);
         return env->NewStringUTF("");
       },
-      TArgument::Null());
-  EXPECT_EQ(outcome.m_Violations,
+      Argument::Null());
+  EXPECT_EQ(outcome.violations,
             std::vector<std::string>{"GetStringUTFChars: not a string of this call"});
 }
 
 TEST(RecordingHost, SeesAResultThatTheMachineDidNotMake) {
-  const TOutcome outcome =
+  const Outcome outcome =
       CallDecoder([](JNIEnv*, jclass, jstring reply, jintArray) { return reply; });
-  EXPECT_EQ(outcome.m_Violations,
+  EXPECT_EQ(outcome.violations,
             std::vector<std::string>{"the returned string is not the one made"});
 }
 
 TEST(RecordingHost, SeesAStringMadeWhileAnExceptionIsPending) {
   CRecordingHost host;
   host.FailCall(1);
-  const TOutcome outcome = host.CallAt(reinterpret_cast<void*>(static_cast<TDecodeFunction>(
-                                           [](JNIEnv* env, jclass, jstring reply, jintArray) {
-                                             env->GetStringUTFChars(reply, nullptr);
-                                             return env->NewStringUTF("");
-                                           })),
-                                       *FindExport("AuthDecode"), {TArgument::Text("")});
-  EXPECT_FALSE(outcome.m_Violations.empty());
+  const Outcome outcome = host.CallAt(reinterpret_cast<void*>(static_cast<DecodeFunction>(
+                                          [](JNIEnv* env, jclass, jstring reply, jintArray) {
+                                            env->GetStringUTFChars(reply, nullptr);
+                                            return env->NewStringUTF("");
+                                          })),
+                                      *FindExport("AuthDecode"), {Argument::Text("")});
+  EXPECT_FALSE(outcome.violations.empty());
 }
 
 TEST(RecordingHost, KnowsTheStringsThatAccountOpeningKeeps) {
-  TArguments arguments(3, TArgument::Int(0));
-  arguments.resize(3 + 8, TArgument::Text(""));
-  arguments.resize(3 + 8 + 2, TArgument::Byte(0));
-  using TOpenFunction =
+  Arguments arguments(3, Argument::Int(0));
+  arguments.resize(3 + 8, Argument::Text(""));
+  arguments.resize(3 + 8 + 2, Argument::Byte(0));
+  using OpenFunction =
       jstring (*)(JNIEnv*, jclass, jint, jint, jint, jstring, jstring, jstring, jstring, jstring,
                   jstring, jstring, jstring, jbyte, jbyte, jintArray);
-  const TOpenFunction releasesAll = [](JNIEnv* env, jclass, jint, jint, jint, jstring, jstring,
-                                       jstring, jstring, jstring, jstring, jstring, jstring last,
-                                       jbyte, jbyte, jintArray) {
+  const OpenFunction releasesAll = [](JNIEnv* env, jclass, jint, jint, jint, jstring, jstring,
+                                      jstring, jstring, jstring, jstring, jstring, jstring last,
+                                      jbyte, jbyte, jintArray) {
     env->ReleaseStringUTFChars(last, env->GetStringUTFChars(last, nullptr));
     return env->NewStringUTF("");
   };
   CRecordingHost host;
-  const TOutcome outcome = host.CallAt(reinterpret_cast<void*>(releasesAll),
-                                       *FindExport("OpenAccountEncode"), arguments);
-  EXPECT_EQ(outcome.m_Violations,
+  const Outcome outcome = host.CallAt(reinterpret_cast<void*>(releasesAll),
+                                      *FindExport("OpenAccountEncode"), arguments);
+  EXPECT_EQ(outcome.violations,
             std::vector<std::string>{"string 8 was released, but this export keeps it"});
 }
 
@@ -162,7 +162,7 @@ TEST(RecordingHostDeathTest, EndsOnAForbiddenCallWithItsName) {
   EXPECT_DEATH(CallDecoder(&AskForException), "forbidden VM call: ExceptionCheck");
 }
 
-/// Reads `distance` bytes off the end (or, negative, off the begin) of the reply "text".
+// Reads `distance` bytes off the end (or, negative, off the begin) of the reply "text".
 template <int kDistance>
 jstring Overread(JNIEnv* env, jclass, jstring reply, jintArray) {
   const char* text = env->GetStringUTFChars(reply, nullptr);
@@ -173,10 +173,10 @@ jstring Overread(JNIEnv* env, jclass, jstring reply, jintArray) {
 }
 
 TEST(RecordingHostDeathTest, OneByteTooFarCrashes) {
-  const TArgument text = TArgument::Text("text");
-  EXPECT_DEATH(CallDecoder(&Overread<1>, text, EPlacement::kBeforeUnreadable), "");
-  EXPECT_DEATH(CallDecoder(&Overread<-1>, text, EPlacement::kAfterUnreadable), "");
-  EXPECT_EQ(CallDecoder(&Overread<0>, text, EPlacement::kBeforeUnreadable).m_Result, "");
+  const Argument text = Argument::Text("text");
+  EXPECT_DEATH(CallDecoder(&Overread<1>, text, Placement::kBeforeUnreadable), "");
+  EXPECT_DEATH(CallDecoder(&Overread<-1>, text, Placement::kAfterUnreadable), "");
+  EXPECT_EQ(CallDecoder(&Overread<0>, text, Placement::kBeforeUnreadable).result, "");
 }
 
 }  // namespace

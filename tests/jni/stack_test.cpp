@@ -34,12 +34,12 @@ constexpr size_t kStack = 1 << 20;
 constexpr size_t kPainted = kStack / 2;
 constexpr uint64_t kPaint = 0xa5c3a5c3a5c3a5c3;
 
-struct TCall {
-  const TExport* m_pRow = nullptr;
-  TArguments m_Arguments;
+struct Call {
+  const Export* row = nullptr;
+  Arguments arguments;
 };
 
-/// A thread's stack, painted to see how far down a call wrote.
+// A thread's stack, painted to see how far down a call wrote.
 class CPaintedStack {
  public:
   CPaintedStack()
@@ -51,9 +51,9 @@ class CPaintedStack {
   CPaintedStack& operator=(const CPaintedStack&) = delete;
   ~CPaintedStack() { munmap(m_pBottom, kStack); }
 
-  /// Bytes of stack that one call needs from its caller's frame on.
-  size_t DepthOf(const TCall& call) {
-    m_Call = call;
+  // Bytes of stack that one call needs from its caller's frame on.
+  size_t DepthOf(const Call& call) {
+    m_call = call;
     pthread_attr_t attributes;
     pthread_attr_init(&attributes);
     pthread_attr_setstack(&attributes, m_pBottom, kStack);
@@ -74,14 +74,14 @@ class CPaintedStack {
   __attribute__((noinline)) void MeasureCall() {
     CRecordingHost host;
     host.KeepRecord(false);
-    host.Call(*m_Call.m_pRow, m_Call.m_Arguments);  // what is done once is done
+    host.Call(*m_call.row, m_call.arguments);  // what is done once is done
     auto* const frame = static_cast<uint64_t*>(__builtin_frame_address(0));
     uint64_t* const edge = frame - 128;
     Paint(m_pBottom, edge);
-    const TOutcome outcome = host.Call(*m_Call.m_pRow, m_Call.m_Arguments);
+    const Outcome outcome = host.Call(*m_call.row, m_call.arguments);
     const uint64_t* const lowest =
         std::find_if(m_pBottom, edge, [](uint64_t word) { return word != kPaint; });
-    EXPECT_TRUE(outcome.IsSound()) << m_Call.m_pRow->m_szName;
+    EXPECT_TRUE(outcome.IsSound()) << m_call.row->name;
     m_nDepth = static_cast<size_t>(frame - lowest) * sizeof(uint64_t);
   }
 
@@ -92,22 +92,22 @@ class CPaintedStack {
   }
 
   uint64_t* m_pBottom;
-  TCall m_Call;
+  Call m_call;
   size_t m_nDepth = 0;
 };
 
-/// The golden cases, and for each export long texts in every place.
-std::vector<TCall> AllCalls() {
-  std::vector<TCall> calls;
-  for (TGoldenCase& golden : ReadGoldenCases(TEST_VECTORS).m_Cases) {
-    calls.push_back({FindExport(golden.m_Operation), std::move(golden.m_Arguments)});
+// The golden cases, and for each export long texts in every place.
+std::vector<Call> AllCalls() {
+  std::vector<Call> calls;
+  for (GoldenCase& golden : ReadGoldenCases(TEST_VECTORS).cases) {
+    calls.push_back({FindExport(golden.operation), std::move(golden.arguments)});
   }
-  for (const TExport& row : AllExports()) {
-    TCall call{&row, {}};
-    for (const char letter : row.m_szShape) {
-      if (letter == 'S') call.m_Arguments.push_back(TArgument::Text(std::string(65536, '7')));
+  for (const Export& row : AllExports()) {
+    Call call{&row, {}};
+    for (const char letter : row.shape) {
+      if (letter == 'S') call.arguments.push_back(Argument::Text(std::string(65536, '7')));
       if (letter == 'i' || letter == 'b' || letter == 'c') {
-        call.m_Arguments.push_back({letter, 49, {}});
+        call.arguments.push_back({letter, 49, {}});
       }
     }
     calls.push_back(std::move(call));
@@ -122,10 +122,10 @@ TEST(Stack, DeepestCallNeedsAtMost32KiB) {
   size_t deepest = 0;
   size_t shallowest = kStack;
   std::string_view where;
-  for (const TCall& call : AllCalls()) {
+  for (const Call& call : AllCalls()) {
     const size_t depth = stack.DepthOf(call);
     shallowest = std::min(shallowest, depth);
-    if (depth > deepest) where = call.m_pRow->m_szName;
+    if (depth > deepest) where = call.row->name;
     deepest = std::max(deepest, depth);
   }
   std::cout << "deepest stack: " << deepest << " bytes, in " << where << "\n"

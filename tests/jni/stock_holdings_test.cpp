@@ -12,22 +12,22 @@ namespace {
 const std::string kKindError = "[CLIENT] 委託種類錯誤";
 const std::string kEnd = "|00=|67=900000|01=";
 
-TOutcome Decode(const char* operation, const std::string& reply) {
-  CRecordingHost host(EPlacement::kBeforeUnreadable);
-  TOutcome outcome = host.Call(*FindExport(operation), {TArgument::Text(reply)});
-  EXPECT_TRUE(outcome.IsSound()) << testing::PrintToString(outcome.m_Violations);
+Outcome Decode(const char* operation, const std::string& reply) {
+  CRecordingHost host(Placement::kBeforeUnreadable);
+  Outcome outcome = host.Call(*FindExport(operation), {Argument::Text(reply)});
+  EXPECT_TRUE(outcome.IsSound()) << testing::PrintToString(outcome.violations);
   return outcome;
 }
 
-/// The rows that trade type and side decide: codes for side "B" and any other, 0 for none.
-struct TTypeRow {
-  int m_nKind;
-  int m_nTradeType;
-  int m_nBuy;
-  int m_nOther;
+// The rows that trade type and side decide: codes for side "B" and any other, 0 for none.
+struct TypeRow {
+  int kind;
+  int tradeType;
+  int buy;
+  int other;
 };
 
-constexpr TTypeRow kTypeRows[] = {
+constexpr TypeRow kTypeRows[] = {
     {0, -1, 0, 0}, {0, 0, 1, 2}, {0, 1, 1, 2}, {0, 2, 7, 8}, {0, 3, 9, 10},  {0, 4, 0, 0},
     {1, -1, 0, 0}, {1, 0, 3, 4}, {1, 1, 3, 4}, {1, 2, 0, 0}, {1, 3, 11, 12}, {1, 4, 0, 0},
     {2, -1, 0, 0}, {2, 0, 5, 6}, {2, 1, 5, 6}, {2, 2, 0, 0}, {2, 3, 13, 14}, {2, 4, 0, 0},
@@ -35,13 +35,13 @@ constexpr TTypeRow kTypeRows[] = {
     {4, -1, 0, 0}, {4, 0, 5, 6}, {4, 1, 5, 6}, {4, 2, 0, 0}, {4, 3, 13, 14}, {4, 4, 0, 0},
 };
 
-/// The kinds that decide alone.
-struct TKindRow {
-  int m_nKind;
-  int m_nCode;
+// The kinds that decide alone.
+struct KindRow {
+  int kind;
+  int code;
 };
 
-constexpr TKindRow kKindRows[] = {
+constexpr KindRow kKindRows[] = {
     {-2147483647, 0}, {-1, 0},  {5, 19},  {6, 20},  {7, 21},  {8, 22},  {9, 23},
     {10, 24},         {11, 25}, {12, 26}, {13, 27}, {14, 28}, {15, 29}, {16, 30},
     {17, 31},         {18, 0},  {19, 0},  {20, 32}, {21, 33}, {22, 34}, {23, 35},
@@ -56,40 +56,40 @@ std::string SettlementReply(int kind, int tradeType, const std::string& side) {
 void ExpectTypeCode(int kind, int tradeType, const std::string& side, int code) {
   SCOPED_TRACE("kind " + std::to_string(kind) + ", type " + std::to_string(tradeType) + ", side " +
                side);
-  const TOutcome outcome = Decode("PaymentDecode", SettlementReply(kind, tradeType, side));
+  const Outcome outcome = Decode("PaymentDecode", SettlementReply(kind, tradeType, side));
   if (code == 0) {
-    EXPECT_EQ(outcome.m_Result, kKindError);
-    EXPECT_EQ(outcome.m_Status, -1);
+    EXPECT_EQ(outcome.result, kKindError);
+    EXPECT_EQ(outcome.status, -1);
     return;
   }
   const std::string start = "1!@@" + std::to_string(code) + "@1@";
-  EXPECT_EQ(outcome.m_Result.value().substr(0, start.size()), start);
-  EXPECT_EQ(outcome.m_Status, 1);
+  EXPECT_EQ(outcome.result.value().substr(0, start.size()), start);
+  EXPECT_EQ(outcome.status, 1);
 }
 
 TEST(SettlementTypeCode, OfKinds0To4GoesByTradeTypeAndSide) {
-  for (const TTypeRow& row : kTypeRows) {
-    ExpectTypeCode(row.m_nKind, row.m_nTradeType, "B", row.m_nBuy);
+  for (const TypeRow& row : kTypeRows) {
+    ExpectTypeCode(row.kind, row.tradeType, "B", row.buy);
     for (const char* side : {"S", "", "b", "BB", "B "}) {
-      ExpectTypeCode(row.m_nKind, row.m_nTradeType, side, row.m_nOther);
+      ExpectTypeCode(row.kind, row.tradeType, side, row.other);
     }
   }
 }
 
 TEST(SettlementTypeCode, OfLaterKindsGoesByTheKindAlone) {
-  for (const TKindRow& row : kKindRows) {
+  for (const KindRow& row : kKindRows) {
     for (int tradeType : {-1, 0, 1, 2, 3, 4, 99}) {
-      ExpectTypeCode(row.m_nKind, tradeType, "B", row.m_nCode);
-      ExpectTypeCode(row.m_nKind, tradeType, "S", row.m_nCode);
+      ExpectTypeCode(row.kind, tradeType, "B", row.code);
+      ExpectTypeCode(row.kind, tradeType, "S", row.code);
     }
   }
 }
 
 TEST(SettlementTypeCode, OfJzgIsNoMatterOfKindsAtAll) {
-  for (const TKindRow& row : kKindRows) {
-    const TOutcome outcome = Decode("PaymentDecodeJZG", SettlementReply(row.m_nKind, 2, "S"));
-    EXPECT_EQ(outcome.m_Result, "1!@@@1@@0@@@@@0@0@0@0@0@@!") << row.m_nKind;
-    EXPECT_EQ(outcome.m_Status, 1) << row.m_nKind;
+  for (const KindRow& row : kKindRows) {
+    const Outcome outcome = Decode("PaymentDecodeJZG", SettlementReply(row.kind, 2, "S"));
+    EXPECT_EQ(outcome.result, "1!@@@1@@0@@@@@0@0@0@0@0@@!") << row.kind;
+    EXPECT_EQ(outcome.status, 1) << row.kind;
   }
 }
 
@@ -104,27 +104,27 @@ TEST(SettlementList, TwentyThousandRecordsAreAllListed) {
   }
   for (const std::string& end : {kEnd, std::string()}) {
     for (const char* operation : {"PaymentDecode", "PaymentDecodeJZG"}) {
-      EXPECT_TRUE(Decode(operation, reply + end).m_Result == std::to_string(kCount) + "!" + lines)
+      EXPECT_TRUE(Decode(operation, reply + end).result == std::to_string(kCount) + "!" + lines)
           << operation;
     }
   }
 }
 
-/// Records that give as much as they can for their length, `count` of them.
-struct TDenseReply {
-  const char* m_szName;
-  std::string m_Record;
-  std::string m_Sections[4];
-  std::string m_JzgSections[3];
+// Records that give as much as they can for their length, `count` of them.
+struct DenseReply {
+  const char* name;
+  std::string record;
+  std::string sections[4];
+  std::string jzgSections[3];
 };
-void PrintTo(const TDenseReply& reply, std::ostream* out) {
-  *out << reply.m_szName;
+void PrintTo(const DenseReply& reply, std::ostream* out) {
+  *out << reply.name;
 }
 
 const std::string kLongCode(19, 'C');
 const std::string kOpen = "|00=|68=0000";
 
-const TDenseReply kDenseReplies[] = {
+const DenseReply kDenseReplies[] = {
     {"ShortestRecords", kOpen + "|PS=1|01=", {"", "", "", "@1|0|0!"}, {"", "", ""}},
     {"AllSectionsWithoutACode",
      kOpen + "|75=1|76=1|77=1|PS=1|01=",
@@ -145,7 +145,7 @@ const TDenseReply kDenseReplies[] = {
       kLongCode + "@-2147483648|-2147483646|-2147483648@@@@@!", ""}},
 };
 
-class DensePositions : public testing::TestWithParam<TDenseReply> {
+class DensePositions : public testing::TestWithParam<DenseReply> {
  protected:
   template <size_t N>
   static std::string Expected(const std::string (&sections)[N], int count) {
@@ -159,8 +159,8 @@ class DensePositions : public testing::TestWithParam<TDenseReply> {
   }
 };
 
-std::string NameOf(const testing::TestParamInfo<TDenseReply>& info) {
-  return info.param.m_szName;
+std::string NameOf(const testing::TestParamInfo<DenseReply>& info) {
+  return info.param.name;
 }
 
 INSTANTIATE_TEST_SUITE_P(Replies, DensePositions, testing::ValuesIn(kDenseReplies), NameOf);
@@ -168,13 +168,13 @@ INSTANTIATE_TEST_SUITE_P(Replies, DensePositions, testing::ValuesIn(kDenseReplie
 TEST_P(DensePositions, LoseNoRecordHoweverManyThereAre) {
   for (int count : {1, 2, 100, 20000}) {
     std::string reply;
-    for (int n = 0; n < count; ++n) reply += GetParam().m_Record;
-    const TOutcome plain = Decode("QueryInventoryDecode", reply);
-    EXPECT_TRUE(plain.m_Result == Expected(GetParam().m_Sections, count)) << count;
-    EXPECT_EQ(plain.m_Status, 1);
-    const TOutcome jzg = Decode("QueryInventoryDecodeJZG", reply);
-    EXPECT_TRUE(jzg.m_Result == Expected(GetParam().m_JzgSections, count)) << count;
-    EXPECT_EQ(jzg.m_Status, 1);
+    for (int n = 0; n < count; ++n) reply += GetParam().record;
+    const Outcome plain = Decode("QueryInventoryDecode", reply);
+    EXPECT_TRUE(plain.result == Expected(GetParam().sections, count)) << count;
+    EXPECT_EQ(plain.status, 1);
+    const Outcome jzg = Decode("QueryInventoryDecodeJZG", reply);
+    EXPECT_TRUE(jzg.result == Expected(GetParam().jzgSections, count)) << count;
+    EXPECT_EQ(jzg.status, 1);
   }
 }
 

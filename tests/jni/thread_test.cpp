@@ -17,31 +17,31 @@ namespace {
 
 constexpr size_t kThreads = 16;
 
-/// Calls of each thread; longer runs ask for more by the environment.
+// Calls of each thread; longer runs ask for more by the environment.
 size_t CallsPerThread() {
   const char* const asked = std::getenv("QUORVANE_THREAD_CALLS");
   return asked != nullptr ? std::strtoul(asked, nullptr, 10) : 2000;
 }
 
-TOutcome Play(CRecordingHost& host, const TGoldenCase& golden) {
+Outcome Play(CRecordingHost& host, const GoldenCase& golden) {
   SetClockOf(golden);
-  return host.Call(*FindExport(golden.m_Operation), golden.m_Arguments);
+  return host.Call(*FindExport(golden.operation), golden.arguments);
 }
 
 TEST(Threads, MixedCallsAnswerAsOneAfterTheOther) {
-  TGoldenCases golden = ReadGoldenCases(TEST_VECTORS);
-  std::vector<TGoldenCase>& cases = golden.m_Cases;
+  GoldenCases golden = ReadGoldenCases(TEST_VECTORS);
+  std::vector<GoldenCase>& cases = golden.cases;
   cases.erase(std::remove_if(cases.begin(), cases.end(),
-                             [](const TGoldenCase& one) {
-                               const TExport* const row = FindExport(one.m_Operation);
+                             [](const GoldenCase& one) {
+                               const Export* const row = FindExport(one.operation);
                                return row == nullptr || row->EntryPoint() == nullptr;
                              }),
               cases.end());
   ASSERT_FALSE(cases.empty());
 
-  std::vector<TOutcome> serial;
+  std::vector<Outcome> serial;
   CRecordingHost serialHost;
-  for (const TGoldenCase& one : cases) serial.push_back(Play(serialHost, one));
+  for (const GoldenCase& one : cases) serial.push_back(Play(serialHost, one));
 
   const size_t calls = CallsPerThread();
   std::atomic<size_t> answered{0};
@@ -54,10 +54,10 @@ TEST(Threads, MixedCallsAnswerAsOneAfterTheOther) {
       const size_t stride = 2 * thread + 1;
       for (size_t call = 0; call < calls; ++call) {
         const size_t at = (thread + call * stride) % cases.size();
-        const TOutcome outcome = Play(host, cases[at]);
-        const bool same = outcome.m_Events == serial[at].m_Events &&
-                          outcome.m_Result == serial[at].m_Result &&
-                          outcome.m_Status == serial[at].m_Status && outcome.IsSound();
+        const Outcome outcome = Play(host, cases[at]);
+        const bool same = outcome.events == serial[at].events &&
+                          outcome.result == serial[at].result &&
+                          outcome.status == serial[at].status && outcome.IsSound();
         if (!same) ++different;
         ++answered;
       }

@@ -5,9 +5,9 @@
 
 namespace gateway_tests {
 
-/// A JNI environment that costs nothing: a jstring is the terminated text itself, a jintArray the
-/// number itself, and nothing is copied, checked or released. What a call does in it is the
-/// library's own doing. A text that a call returns dies with the call.
+// A JNI environment that costs nothing: a jstring is the terminated text itself, a jintArray the
+// number itself, and nothing is copied, checked or released. What a call does in it is the
+// library's own doing. A text that a call returns dies with the call.
 JNIEnv* BareHost();
 
 inline jstring BareText(const char* text) {

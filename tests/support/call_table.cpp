@@ -7,49 +7,49 @@
 namespace gateway_tests {
 namespace {
 
-template <typename TType>
-struct TLetter;
+template <typename Type>
+struct Letter;
 template <>
-struct TLetter<jint> {
+struct Letter<jint> {
   static constexpr char kValue = 'i';
   static jint Read(const jvalue& value) { return value.i; }
 };
 template <>
-struct TLetter<jstring> {
+struct Letter<jstring> {
   static constexpr char kValue = 'S';
   static jstring Read(const jvalue& value) { return static_cast<jstring>(value.l); }
 };
 template <>
-struct TLetter<jbyte> {
+struct Letter<jbyte> {
   static constexpr char kValue = 'b';
   static jbyte Read(const jvalue& value) { return value.b; }
 };
 template <>
-struct TLetter<jchar> {
+struct Letter<jchar> {
   static constexpr char kValue = 'c';
   static jchar Read(const jvalue& value) { return value.c; }
 };
 template <>
-struct TLetter<jintArray> {
+struct Letter<jintArray> {
   static constexpr char kValue = 's';
   static jintArray Read(const jvalue& value) { return static_cast<jintArray>(value.l); }
 };
 
-/// A Java argument list as types: knows its letters and how to make the call.
-template <typename... TArguments>
-struct TShape {
-  static constexpr char kLetters[] = {TLetter<TArguments>::kValue..., '\0'};
+// A Java argument list as types: knows its letters and how to make the call.
+template <typename... Arguments>
+struct Shape {
+  static constexpr char kLetters[] = {Letter<Arguments>::kValue..., '\0'};
 
   static jstring Call(void* entryPoint, JNIEnv* env, const jvalue* arguments) {
-    return CallAt(entryPoint, env, arguments, std::index_sequence_for<TArguments...>());
+    return CallAt(entryPoint, env, arguments, std::index_sequence_for<Arguments...>());
   }
 
   template <size_t... kIndex>
   static jstring CallAt(void* entryPoint, JNIEnv* env, const jvalue* arguments,
                         std::index_sequence<kIndex...>) {
-    using TFunction = jstring(JNICALL*)(JNIEnv*, jclass, TArguments...);
-    auto function = reinterpret_cast<TFunction>(entryPoint);
-    return function(env, nullptr, TLetter<TArguments>::Read(arguments[kIndex])...);
+    using Function = jstring(JNICALL*)(JNIEnv*, jclass, Arguments...);
+    auto function = reinterpret_cast<Function>(entryPoint);
+    return function(env, nullptr, Letter<Arguments>::Read(arguments[kIndex])...);
   }
 };
 
@@ -58,99 +58,99 @@ using I = jint;
 using B = jbyte;
 using C = jchar;
 
-template <typename... TArguments>
-using TEncode = TShape<I, I, I, S, S, TArguments..., jintArray>;
+template <typename... Arguments>
+using Encode = Shape<I, I, I, S, S, Arguments..., jintArray>;
 
-using TOneText = TEncode<S>;
-using TThreeTexts = TEncode<S, S, S>;
-using TThreeTextsInt = TEncode<S, S, S, I>;
-using TFourTexts = TEncode<S, S, S, S>;
-using TFourTextsInt = TEncode<S, S, S, S, I>;
-using TFiveTexts = TEncode<S, S, S, S, S>;
-using TOpenAccount = TEncode<S, S, S, S, S, S, B, B>;
-using TStockOrder = TEncode<S, S, S, S, S, I, I, I, B, B, B, B, B, B>;
-using TStockChange = TEncode<S, S, S, S, S, S, I, I, I, B, B, B, B, B, B>;
-using TStockOrderNoStatus = TShape<I, I, I, S, S, S, S, S, B, B>;
-using TFuturesOrder =
-    TEncode<S, S, S, S, S, S, S, S, S, S, S, S, S, B, B, B, C, C, C, C, C, C, I, I, I>;
-using TDecode = TShape<S, jintArray>;
-using TDecodeMarket = TShape<I, S, jintArray>;
+using OneText = Encode<S>;
+using ThreeTexts = Encode<S, S, S>;
+using ThreeTextsInt = Encode<S, S, S, I>;
+using FourTexts = Encode<S, S, S, S>;
+using FourTextsInt = Encode<S, S, S, S, I>;
+using FiveTexts = Encode<S, S, S, S, S>;
+using OpenAccount = Encode<S, S, S, S, S, S, B, B>;
+using StockOrder = Encode<S, S, S, S, S, I, I, I, B, B, B, B, B, B>;
+using StockChange = Encode<S, S, S, S, S, S, I, I, I, B, B, B, B, B, B>;
+using StockOrderNoStatus = Shape<I, I, I, S, S, S, S, S, B, B>;
+using FuturesOrder =
+    Encode<S, S, S, S, S, S, S, S, S, S, S, S, S, B, B, B, C, C, C, C, C, C, I, I, I>;
+using Decode = Shape<S, jintArray>;
+using DecodeMarket = Shape<I, S, jintArray>;
 
-template <typename TTypes>
-constexpr TExport Row(const char* name, int keptStrings = 0) {
-  return TExport{name, TTypes::kLetters, &TTypes::Call, keptStrings};
+template <typename Types>
+constexpr Export Row(const char* name, int keptStrings = 0) {
+  return Export{name, Types::kLetters, &Types::Call, keptStrings};
 }
 
-constexpr TExport kExports[kExportCount] = {
+constexpr Export kExports[kExportCount] = {
     // Login and account list.
-    Row<TThreeTexts>("AuthEncode"),
-    Row<TDecode>("AuthDecode"),
-    Row<TThreeTexts>("GetTotalAccountEncode"),
-    Row<TDecode>("GetTotalAccountDecode"),
+    Row<ThreeTexts>("AuthEncode"),
+    Row<Decode>("AuthDecode"),
+    Row<ThreeTexts>("GetTotalAccountEncode"),
+    Row<Decode>("GetTotalAccountDecode"),
     // Account maintenance.
-    Row<TOpenAccount>("OpenAccountEncode", 3),
-    Row<TDecode>("OpenAccountDecode"),
-    Row<TFourTexts>("ChangePasswordEncode"),
-    Row<TDecode>("ChangePasswordDecode"),
-    Row<TThreeTexts>("QueryBankRemainEncode"),
-    Row<TDecode>("QueryBankRemainDecode"),
+    Row<OpenAccount>("OpenAccountEncode", 3),
+    Row<Decode>("OpenAccountDecode"),
+    Row<FourTexts>("ChangePasswordEncode"),
+    Row<Decode>("ChangePasswordDecode"),
+    Row<ThreeTexts>("QueryBankRemainEncode"),
+    Row<Decode>("QueryBankRemainDecode"),
     // Certificates.
-    Row<TOneText>("RegisterCertEncode"),
-    Row<TDecode>("RegisterCertDecode"),
-    Row<TOneText>("GetCertEncode"),
-    Row<TOneText>("GetCertEncode2"),
-    Row<TDecode>("GetCertDecode"),
-    Row<TFiveTexts>("ApplyCertEncode"),
-    Row<TDecode>("ApplyCertDecode"),
-    Row<TFiveTexts>("RevokeCertEncode"),
-    Row<TDecode>("RevokeCertDecode"),
-    Row<TFiveTexts>("ReNewCertEncode"),
-    Row<TDecode>("ReNewCertDecode"),
-    Row<TOneText>("GetCertStatusEncode"),
-    Row<TDecode>("GetCertStatusDecode"),
-    Row<TOneText>("InstallCertOKEncode"),
-    Row<TDecode>("InstallCertOKDecode"),
-    Row<TOneText>("OpenCertEncode"),
-    Row<TDecode>("OpenCertDecode"),
+    Row<OneText>("RegisterCertEncode"),
+    Row<Decode>("RegisterCertDecode"),
+    Row<OneText>("GetCertEncode"),
+    Row<OneText>("GetCertEncode2"),
+    Row<Decode>("GetCertDecode"),
+    Row<FiveTexts>("ApplyCertEncode"),
+    Row<Decode>("ApplyCertDecode"),
+    Row<FiveTexts>("RevokeCertEncode"),
+    Row<Decode>("RevokeCertDecode"),
+    Row<FiveTexts>("ReNewCertEncode"),
+    Row<Decode>("ReNewCertDecode"),
+    Row<OneText>("GetCertStatusEncode"),
+    Row<Decode>("GetCertStatusDecode"),
+    Row<OneText>("InstallCertOKEncode"),
+    Row<Decode>("InstallCertOKDecode"),
+    Row<OneText>("OpenCertEncode"),
+    Row<Decode>("OpenCertDecode"),
     // Stock orders.
-    Row<TStockOrder>("SubmitOrderEncode"),
-    Row<TStockOrder>("SubmitOrderEncode1"),
-    Row<TStockOrderNoStatus>("SubmitOrderEncode2"),
-    Row<TStockChange>("CancelOrderEncode"),
-    Row<TStockChange>("CancelOrderEncode1"),
-    Row<TStockChange>("ChangeOrderEncode"),
-    Row<TStockChange>("ChangeOrderEncode1"),
-    Row<TDecode>("SubmitOrderDecode"),
-    Row<TDecode>("CancelChangeOrderDecode"),
+    Row<StockOrder>("SubmitOrderEncode"),
+    Row<StockOrder>("SubmitOrderEncode1"),
+    Row<StockOrderNoStatus>("SubmitOrderEncode2"),
+    Row<StockChange>("CancelOrderEncode"),
+    Row<StockChange>("CancelOrderEncode1"),
+    Row<StockChange>("ChangeOrderEncode"),
+    Row<StockChange>("ChangeOrderEncode1"),
+    Row<Decode>("SubmitOrderDecode"),
+    Row<Decode>("CancelChangeOrderDecode"),
     // Stock lists, positions, settlement.
-    Row<TFourTextsInt>("QueryOrderEncode"),
-    Row<TDecodeMarket>("QueryOrderDecode"),
-    Row<TFiveTexts>("QueryReplyEncode"),
-    Row<TDecode>("QueryReplyDecode"),
-    Row<TThreeTexts>("QueryInventoryEncode"),
-    Row<TDecode>("QueryInventoryDecode"),
-    Row<TDecode>("QueryInventoryDecodeJZG"),
-    Row<TFourTexts>("QueryCreditInfoEncode"),
-    Row<TDecode>("QueryCreditInfoDecode"),
-    Row<TFiveTexts>("PaymentEncode"),
-    Row<TDecode>("PaymentDecode"),
-    Row<TDecode>("PaymentDecodeJZG"),
+    Row<FourTextsInt>("QueryOrderEncode"),
+    Row<DecodeMarket>("QueryOrderDecode"),
+    Row<FiveTexts>("QueryReplyEncode"),
+    Row<Decode>("QueryReplyDecode"),
+    Row<ThreeTexts>("QueryInventoryEncode"),
+    Row<Decode>("QueryInventoryDecode"),
+    Row<Decode>("QueryInventoryDecodeJZG"),
+    Row<FourTexts>("QueryCreditInfoEncode"),
+    Row<Decode>("QueryCreditInfoDecode"),
+    Row<FiveTexts>("PaymentEncode"),
+    Row<Decode>("PaymentDecode"),
+    Row<Decode>("PaymentDecodeJZG"),
     // Futures and options.
-    Row<TFuturesOrder>("FutSubmitOrderEncode"),
-    Row<TFuturesOrder>("FutSubmitOrderEncode1"),
-    Row<TDecode>("FutSubmitOrderDecode"),
-    Row<TFourTextsInt>("FutQueryOrderEncode"),
-    Row<TDecode>("FutQueryOrderDecode"),
-    Row<TFiveTexts>("FutQueryReplyEncode"),
-    Row<TDecode>("FutQueryReplyDecode"),
-    Row<TThreeTexts>("FutQueryInventoryEncode"),
-    Row<TDecode>("FutQueryInventoryDecode"),
-    Row<TThreeTextsInt>("QueryFinanceEncode"),
-    Row<TDecode>("QueryFinanceDecode"),
+    Row<FuturesOrder>("FutSubmitOrderEncode"),
+    Row<FuturesOrder>("FutSubmitOrderEncode1"),
+    Row<Decode>("FutSubmitOrderDecode"),
+    Row<FourTextsInt>("FutQueryOrderEncode"),
+    Row<Decode>("FutQueryOrderDecode"),
+    Row<FiveTexts>("FutQueryReplyEncode"),
+    Row<Decode>("FutQueryReplyDecode"),
+    Row<ThreeTexts>("FutQueryInventoryEncode"),
+    Row<Decode>("FutQueryInventoryDecode"),
+    Row<ThreeTextsInt>("QueryFinanceEncode"),
+    Row<Decode>("QueryFinanceDecode"),
 };
 
-/// Where entry points are looked up: the shared library when the program can load it, else (a
-/// program that links the objects themselves) the program.
+// Where entry points are looked up: the shared library when the program can load it, else (a
+// program that links the objects themselves) the program.
 void* LibraryHandle() {
   static void* const s_pHandle = [] {
     void* handle = dlopen("libquorvane.so", RTLD_NOW);
@@ -176,27 +176,27 @@ std::string_view JavaTypeOf(char letter) {
 
 }  // namespace
 
-std::string TExport::SymbolName() const {
-  return std::string(kSymbolPrefix).append(m_szName);
+std::string Export::SymbolName() const {
+  return std::string(kSymbolPrefix).append(name);
 }
 
-std::string TExport::Descriptor() const {
+std::string Export::Descriptor() const {
   std::string text = "(";
-  for (char letter : m_szShape) text.append(JavaTypeOf(letter));
+  for (char letter : shape) text.append(JavaTypeOf(letter));
   return text.append(")Ljava/lang/String;");
 }
 
-void* TExport::EntryPoint() const {
+void* Export::EntryPoint() const {
   return dlsym(LibraryHandle(), SymbolName().c_str());
 }
 
-const TExport (&AllExports())[kExportCount] {
+const Export (&AllExports())[kExportCount] {
   return kExports;
 }
 
-const TExport* FindExport(std::string_view name) {
-  for (const TExport& row : kExports) {
-    if (row.m_szName == name) return &row;
+const Export* FindExport(std::string_view name) {
+  for (const Export& row : kExports) {
+    if (row.name == name) return &row;
   }
   return nullptr;
 }

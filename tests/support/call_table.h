@@ -9,37 +9,37 @@
 
 namespace gateway_tests {
 
-/// Calls an entry point through a pointer of its true type.
-using TCaller = jstring (*)(void* entryPoint, JNIEnv* env, const jvalue* arguments);
+// Calls an entry point through a pointer of its true type.
+using Caller = jstring (*)(void* entryPoint, JNIEnv* env, const jvalue* arguments);
 
-/// One native method of the host class.
-struct TExport {
-  /// Method name in Java, "AuthEncode".
-  std::string_view m_szName;
-  /// One letter for each Java argument: i int, S String, b byte, c char, s the status int[].
-  std::string_view m_szShape;
-  TCaller m_pCall;
-  /// Number of last strings that the export keeps on purpose (never releases).
-  int m_nKeptStrings;
+// One native method of the host class.
+struct Export {
+  // Method name in Java, "AuthEncode".
+  std::string_view name;
+  // One letter for each Java argument: i int, S String, b byte, c char, s the status int[].
+  std::string_view shape;
+  Caller call;
+  // Number of last strings that the export keeps on purpose (never releases).
+  int keptStrings;
 
-  bool IsDecoder() const { return m_szName.find("Decode") != std::string_view::npos; }
-  bool HasStatus() const { return m_szShape.back() == 's'; }
-  /// "Java_..._AuthEncode".
+  bool IsDecoder() const { return name.find("Decode") != std::string_view::npos; }
+  bool HasStatus() const { return shape.back() == 's'; }
+  // "Java_..._AuthEncode".
   std::string SymbolName() const;
-  /// The Java method descriptor, "(III...[I)Ljava/lang/String;".
+  // The Java method descriptor, "(III...[I)Ljava/lang/String;".
   std::string Descriptor() const;
-  /// Address of the entry point in the loaded library; null while the library lacks it.
+  // Address of the entry point in the loaded library; null while the library lacks it.
   void* EntryPoint() const;
 };
 
 inline constexpr std::string_view kSymbolPrefix = "Java_com_brindlex_kernel_quorvane_gatewayjni_";
 inline constexpr size_t kExportCount = 59;
 
-/// All 59 native methods; the one table that vector runners, fuzz targets and thread tests share.
-const TExport (&AllExports())[kExportCount];
+// All 59 native methods; the one table that vector runners, fuzz targets and thread tests share.
+const Export (&AllExports())[kExportCount];
 
-/// The row of that name, or null.
-const TExport* FindExport(std::string_view name);
+// The row of that name, or null.
+const Export* FindExport(std::string_view name);
 
 }  // namespace gateway_tests
 

@@ -23,8 +23,8 @@ template <size_t kSlot>
 
 template <size_t... kSlot>
 JNINativeInterface_ ForbidAll(std::index_sequence<kSlot...>) {
-  using TFunction = void (*)();
-  const TFunction slots[] = {&Forbidden<kSlot>...};
+  using Function = void (*)();
+  const Function slots[] = {&Forbidden<kSlot>...};
   JNINativeInterface_ table;
   static_assert(sizeof(slots) == sizeof(table));
   std::memcpy(static_cast<void*>(&table), slots, sizeof(table));

@@ -5,8 +5,8 @@
 
 namespace gateway_tests {
 
-/// A table of VM functions each of which ends the program with its name. A host puts its own in
-/// the places of the few that it serves.
+// A table of VM functions each of which ends the program with its name. A host puts its own in
+// the places of the few that it serves.
 JNINativeInterface_ ForbiddenCalls();
 
 }  // namespace gateway_tests

@@ -12,7 +12,7 @@
 namespace gateway_tests {
 namespace {
 
-/// Takes `prefix` (a key and the blank after it, or the whole line) off the front of the line.
+// Takes `prefix` (a key and the blank after it, or the whole line) off the front of the line.
 bool TakeKey(std::string_view& line, std::string_view key) {
   if (line.substr(0, key.size()) != key) return false;
   if (line.size() > key.size() && line[key.size()] != ' ') return false;
@@ -68,10 +68,10 @@ bool ReadNumber(std::string_view text, int64_t low, int64_t high, int64_t& out) 
   return read.ec == std::errc() && read.ptr == end && low <= out && out <= high;
 }
 
-/// Reads one file line by line.
+// Reads one file line by line.
 class CGoldenReader {
  public:
-  CGoldenReader(std::string file, TGoldenCases& out) : m_File(std::move(file)), m_Out(out) {}
+  CGoldenReader(std::string file, GoldenCases& out) : m_file(std::move(file)), m_out(out) {}
 
   void Read(std::istream& in) {
     std::string line;
@@ -84,25 +84,25 @@ class CGoldenReader {
       if (!ReadLine(line)) Error("not understood: " + line);
     }
     EndCase();
-    if (m_Titles.empty()) Error("no case in the file");
+    if (m_titles.empty()) Error("no case in the file");
   }
 
  private:
   bool ReadLine(std::string_view line) {
     if (TakeKey(line, "==")) return BeginCase(line);
     if (!m_bInCase) return false;
-    if (TakeKey(line, "op")) return Set(m_Case.m_Operation, line);
-    if (TakeKey(line, "clock")) return Set(m_Case.m_Clock, line);
+    if (TakeKey(line, "op")) return Set(m_case.operation, line);
+    if (TakeKey(line, "clock")) return Set(m_case.clock, line);
     if (TakeKey(line, "arg")) return ReadArgument(line);
     if (TakeKey(line, "status")) return ReadStatus(line);
     if (TakeKey(line, "result")) {
       if (m_bResult) return false;
       m_bResult = true;
-      return Unescape(line, m_Case.m_Result);
+      return Unescape(line, m_case.result);
     }
     if (TakeKey(line, "log")) {
-      if (!m_Case.m_LogLines.has_value()) m_Case.m_LogLines.emplace();
-      return Unescape(line, m_Case.m_LogLines->emplace_back());
+      if (!m_case.logLines.has_value()) m_case.logLines.emplace();
+      return Unescape(line, m_case.logLines->emplace_back());
     }
     return false;
   }
@@ -110,10 +110,10 @@ class CGoldenReader {
   bool BeginCase(std::string_view title) {
     EndCase();
     m_bInCase = true;
-    m_Case.m_File = m_File;
-    m_Case.m_nLine = m_nLine;
-    m_Case.m_Title = title;
-    if (!m_Titles.insert(m_Case.TestName()).second) Error("title used twice");
+    m_case.file = m_file;
+    m_case.line = m_nLine;
+    m_case.title = title;
+    if (!m_titles.insert(m_case.TestName()).second) Error("title used twice");
     return !title.empty();
   }
 
@@ -124,26 +124,26 @@ class CGoldenReader {
   }
 
   bool ReadArgument(std::string_view line) {
-    TArgument argument;
-    int64_t& number = argument.m_nNumber;
+    Argument argument;
+    int64_t& number = argument.number;
     bool good = true;
     if (TakeKey(line, "str")) {
-      argument.m_chLetter = 'S';
-      good = Unescape(line, argument.m_Text.emplace());
+      argument.letter = 'S';
+      good = Unescape(line, argument.text.emplace());
     } else if (line == "null") {
-      argument.m_chLetter = 'S';
+      argument.letter = 'S';
     } else if (TakeKey(line, "int")) {
       good = ReadNumber(line, INT32_MIN, INT32_MAX, number);
     } else if (TakeKey(line, "byte")) {
-      argument.m_chLetter = 'b';
+      argument.letter = 'b';
       good = ReadNumber(line, INT8_MIN, INT8_MAX, number);
     } else if (TakeKey(line, "char")) {
-      argument.m_chLetter = 'c';
+      argument.letter = 'c';
       good = ReadNumber(line, 0, UINT16_MAX, number);
     } else {
       return false;
     }
-    m_Case.m_Arguments.push_back(std::move(argument));
+    m_case.arguments.push_back(std::move(argument));
     return good;
   }
 
@@ -153,45 +153,43 @@ class CGoldenReader {
     if (line == "none") return true;
     int64_t number = 0;
     if (!ReadNumber(line, INT32_MIN, INT32_MAX, number)) return false;
-    m_Case.m_Status = static_cast<int32_t>(number);
+    m_case.status = static_cast<int32_t>(number);
     return true;
   }
 
   void EndCase() {
     if (m_bInCase) {
-      if (m_Case.m_Operation.empty()) CaseError("no op");
+      if (m_case.operation.empty()) CaseError("no op");
       if (!m_bStatus) CaseError("no status");
       if (!m_bResult) CaseError("no result");
       CheckShape();
-      m_Out.m_Cases.push_back(std::move(m_Case));
+      m_out.cases.push_back(std::move(m_case));
     }
-    m_Case = TGoldenCase();
+    m_case = GoldenCase();
     m_bInCase = m_bStatus = m_bResult = false;
   }
 
   void CheckShape() {
-    const TExport* const row = FindExport(m_Case.m_Operation);
-    if (row == nullptr) return CaseError("no operation is named " + m_Case.m_Operation);
+    const Export* const row = FindExport(m_case.operation);
+    if (row == nullptr) return CaseError("no operation is named " + m_case.operation);
     std::string shape;
-    for (const TArgument& argument : m_Case.m_Arguments) shape.push_back(argument.m_chLetter);
+    for (const Argument& argument : m_case.arguments) shape.push_back(argument.letter);
     if (row->HasStatus()) shape.push_back('s');
-    if (shape != row->m_szShape) {
-      CaseError("arguments " + shape + " where " + std::string(row->m_szShape) + " is declared");
+    if (shape != row->shape) {
+      CaseError("arguments " + shape + " where " + std::string(row->shape) + " is declared");
     }
-    if (row->HasStatus() != m_Case.m_Status.has_value()) CaseError("status does not fit");
+    if (row->HasStatus() != m_case.status.has_value()) CaseError("status does not fit");
   }
 
   void Error(const std::string& text) {
-    m_Out.m_Errors.push_back(m_File + ":" + std::to_string(m_nLine) + ": " + text);
+    m_out.errors.push_back(m_file + ":" + std::to_string(m_nLine) + ": " + text);
   }
-  void CaseError(const std::string& text) {
-    m_Out.m_Errors.push_back(m_Case.Where() + ": " + text);
-  }
+  void CaseError(const std::string& text) { m_out.errors.push_back(m_case.Where() + ": " + text); }
 
-  std::string m_File;
-  TGoldenCases& m_Out;
-  std::set<std::string> m_Titles;
-  TGoldenCase m_Case;
+  std::string m_file;
+  GoldenCases& m_out;
+  std::set<std::string> m_titles;
+  GoldenCase m_case;
   int m_nLine = 0;
   bool m_bInCase = false;
   bool m_bStatus = false;
@@ -200,13 +198,13 @@ class CGoldenReader {
 
 }  // namespace
 
-std::string TGoldenCase::Where() const {
-  return m_File + ":" + std::to_string(m_nLine) + ": " + m_Title;
+std::string GoldenCase::Where() const {
+  return file + ":" + std::to_string(line) + ": " + title;
 }
 
-std::string TGoldenCase::TestName() const {
+std::string GoldenCase::TestName() const {
   std::string name;
-  for (char c : m_Title) {
+  for (char c : title) {
     const bool word = (c >= '0' && c <= '9') || (c >= 'a' && c <= 'z') || (c >= 'A' && c <= 'Z');
     if (word) {
       name.push_back(c);
@@ -218,21 +216,21 @@ std::string TGoldenCase::TestName() const {
   return name;
 }
 
-int64_t TGoldenCase::PlatformRow() const {
-  const TExport* const row = FindExport(m_Operation);
-  const bool encoder = row != nullptr && row->m_szShape.substr(0, 3) == "iii";
-  return encoder && m_Arguments.size() > 1 ? m_Arguments[1].m_nNumber : 0;
+int64_t GoldenCase::PlatformRow() const {
+  const Export* const row = FindExport(operation);
+  const bool encoder = row != nullptr && row->shape.substr(0, 3) == "iii";
+  return encoder && arguments.size() > 1 ? arguments[1].number : 0;
 }
 
-TGoldenCases ReadGoldenCases(const std::string& directory) {
+GoldenCases ReadGoldenCases(const std::string& directory) {
   std::vector<std::filesystem::path> files;
   std::error_code error;
   for (const auto& entry : std::filesystem::directory_iterator(directory, error)) {
     if (entry.path().extension() == ".txt") files.push_back(entry.path());
   }
   std::sort(files.begin(), files.end());
-  TGoldenCases cases;
-  if (files.empty()) cases.m_Errors.push_back("no golden file in " + directory);
+  GoldenCases cases;
+  if (files.empty()) cases.errors.push_back("no golden file in " + directory);
   for (const auto& file : files) {
     std::ifstream in(file);
     CGoldenReader(file.filename().string(), cases).Read(in);
@@ -240,17 +238,17 @@ TGoldenCases ReadGoldenCases(const std::string& directory) {
   return cases;
 }
 
-bool SetClockOf(const TGoldenCase& golden) {
-  return SetClock(golden.m_Clock.empty() ? "2024-01-15 13:45:21" : golden.m_Clock);
+bool SetClockOf(const GoldenCase& golden) {
+  return SetClock(golden.clock.empty() ? "2024-01-15 13:45:21" : golden.clock);
 }
 
 std::string PlatformName(int64_t row) {
   CRecordingHost host;
-  const TOutcome outcome = host.Call(
+  const Outcome outcome = host.Call(
       *FindExport("AuthEncode"),
-      {TArgument::Int(0), TArgument::Int(row), TArgument::Int(0), TArgument::Text("S"),
-       TArgument::Text("1.2.3.4"), TArgument::Text(""), TArgument::Text("&"), TArgument::Text("")});
-  const std::string request = outcome.m_Result.value_or("");
+      {Argument::Int(0), Argument::Int(row), Argument::Int(0), Argument::Text("S"),
+       Argument::Text("1.2.3.4"), Argument::Text(""), Argument::Text("&"), Argument::Text("")});
+  const std::string request = outcome.result.value_or("");
   const size_t begin = request.find("|11=") + 4;
   return request.substr(begin, request.find('|', begin) - begin);
 }

@@ -10,44 +10,44 @@
 
 namespace gateway_tests {
 
-/// One golden case: a call with all that it must answer. The format is described in
-/// tests/vectors/README.md.
-struct TGoldenCase {
-  std::string m_File;
-  int m_nLine = 0;
-  std::string m_Title;
-  std::string m_Operation;
-  std::string m_Clock;
-  TArguments m_Arguments;
-  std::optional<int32_t> m_Status;
-  std::string m_Result;
-  /// Empty when the case says nothing about log lines.
-  std::optional<std::vector<std::string>> m_LogLines;
+// One golden case: a call with all that it must answer. The format is described in
+// tests/vectors/README.md.
+struct GoldenCase {
+  std::string file;
+  int line = 0;
+  std::string title;
+  std::string operation;
+  std::string clock;
+  Arguments arguments;
+  std::optional<int32_t> status;
+  std::string result;
+  // Empty when the case says nothing about log lines.
+  std::optional<std::vector<std::string>> logLines;
 
-  /// "login.txt:12: title".
+  // "login.txt:12: title".
   std::string Where() const;
-  /// The title as a test name: letters, digits and '_'.
+  // The title as a test name: letters, digits and '_'.
   std::string TestName() const;
-  /// The platform row that the case passes; 0 for a decoder.
+  // The platform row that the case passes; 0 for a decoder.
   int64_t PlatformRow() const;
 };
 
-/// All cases of a directory's *.txt files in order, and what is wrong with the files.
-struct TGoldenCases {
-  std::vector<TGoldenCase> m_Cases;
-  std::vector<std::string> m_Errors;
+// All cases of a directory's *.txt files in order, and what is wrong with the files.
+struct GoldenCases {
+  std::vector<GoldenCase> cases;
+  std::vector<std::string> errors;
 };
 
-TGoldenCases ReadGoldenCases(const std::string& directory);
+GoldenCases ReadGoldenCases(const std::string& directory);
 
-/// Stops the clock where the case has it, at a day of its own where it does not care; false when it
-/// names no such time.
-bool SetClockOf(const TGoldenCase& golden);
+// Stops the clock where the case has it, at a day of its own where it does not care; false when it
+// names no such time.
+bool SetClockOf(const GoldenCase& golden);
 
-/// The name that the library sends for a platform row, read from a header that it builds.
+// The name that the library sends for a platform row, read from a header that it builds.
 std::string PlatformName(int64_t row);
 
-/// `text` with each "{11}" replaced by the platform name.
+// `text` with each "{11}" replaced by the platform name.
 std::string FillPlatformName(std::string text, const std::string& platformName);
 
 }  // namespace gateway_tests

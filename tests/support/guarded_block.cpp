@@ -18,8 +18,8 @@ namespace {
 
 }  // namespace
 
-CGuardedBlock::CGuardedBlock(EPlacement placement, const void* bytes, size_t size) : m_nSize(size) {
-  if (placement == EPlacement::kHeap) {
+CGuardedBlock::CGuardedBlock(Placement placement, const void* bytes, size_t size) : m_nSize(size) {
+  if (placement == Placement::kHeap) {
     m_pData = static_cast<char*>(std::malloc(size));
     if (m_pData == nullptr && size != 0) GiveUp("malloc");
   } else {
@@ -32,7 +32,7 @@ CGuardedBlock::CGuardedBlock(EPlacement placement, const void* bytes, size_t siz
     m_pMapping = static_cast<char*>(mapping);
     char* const first = m_pMapping + page;
     if (mprotect(first, readable, PROT_READ | PROT_WRITE) != 0) GiveUp("mprotect");
-    m_pData = placement == EPlacement::kAfterUnreadable ? first : first + readable - size;
+    m_pData = placement == Placement::kAfterUnreadable ? first : first + readable - size;
   }
   if (size != 0) std::memcpy(m_pData, bytes, size);
 }

@@ -5,20 +5,20 @@
 
 namespace gateway_tests {
 
-/// Where a block of memory lies; every placement has exactly the asked size.
-enum class EPlacement {
-  /// A heap block: a sanitizer sees each byte past either end.
+// Where a block of memory lies; every placement has exactly the asked size.
+enum class Placement {
+  // A heap block: a sanitizer sees each byte past either end.
   kHeap,
-  /// The block's last byte is the last readable one: one byte too far crashes.
+  // The block's last byte is the last readable one: one byte too far crashes.
   kBeforeUnreadable,
-  /// The block's first byte is the first readable one: one byte before it crashes.
+  // The block's first byte is the first readable one: one byte before it crashes.
   kAfterUnreadable,
 };
 
-/// Memory of an exact size in a given place.
+// Memory of an exact size in a given place.
 class CGuardedBlock {
  public:
-  CGuardedBlock(EPlacement placement, const void* bytes, size_t size);
+  CGuardedBlock(Placement placement, const void* bytes, size_t size);
   CGuardedBlock(CGuardedBlock&& other) noexcept;
   CGuardedBlock(const CGuardedBlock&) = delete;
   CGuardedBlock& operator=(const CGuardedBlock&) = delete;

@@ -8,19 +8,19 @@
 
 namespace gateway_tests {
 
-/// Replies of any length that are made to take a reader long: a head, then the same again and
-/// again.
-struct THostileReply {
-  const char* m_szName;
-  const char* m_szHead;
-  const char* m_szRepeated;
+// Replies of any length that are made to take a reader long: a head, then the same again and
+// again.
+struct HostilePattern {
+  const char* name;
+  const char* head;
+  const char* repeated;
 };
 
-inline void PrintTo(const THostileReply& reply, std::ostream* out) {
-  *out << reply.m_szName;
+inline void PrintTo(const HostilePattern& reply, std::ostream* out) {
+  *out << reply.name;
 }
 
-inline constexpr THostileReply kHostileReplies[] = {
+inline constexpr HostilePattern kHostileReplies[] = {
     {"NoMarkers", "|68=0000", "x"},
     {"NoMarkersAtAll", "", "x"},
     {"OnlyBars", "|68=0000", "|"},
@@ -40,10 +40,10 @@ inline constexpr THostileReply kHostileReplies[] = {
     {"NoData", "|68=5001", "|00=1|68=5001|M2=none|01="},
 };
 
-/// The reply with as many repeats as fit `length` characters.
-inline std::string MakeReply(const THostileReply& hostile, size_t length) {
-  std::string reply = hostile.m_szHead;
-  const std::string_view repeated = hostile.m_szRepeated;
+// The reply with as many repeats as fit `length` characters.
+inline std::string MakeReply(const HostilePattern& hostile, size_t length) {
+  std::string reply = hostile.head;
+  const std::string_view repeated = hostile.repeated;
   reply.reserve(reply.size() + length);
   for (size_t size = repeated.size(); size <= length; size += repeated.size()) reply += repeated;
   return reply;

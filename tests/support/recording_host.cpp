@@ -8,39 +8,39 @@
 
 namespace gateway_tests {
 
-/// Java strings and arrays are handles to the host; here they point to these.
-struct CRecordingHost::TText {
-  int m_nNumber = 0;
-  std::optional<std::string> m_Text;
-  std::optional<CGuardedBlock> m_Characters;
-  bool m_bReleased = false;
+// Java strings and arrays are handles to the host; here they point to these.
+struct CRecordingHost::Text {
+  int number = 0;
+  std::optional<std::string> text;
+  std::optional<CGuardedBlock> characters;
+  bool released = false;
 
   jstring Handle() { return reinterpret_cast<jstring>(this); }
 };
 
-struct CRecordingHost::TStatus {
-  /// Not a value that any entry point writes.
+struct CRecordingHost::Status {
+  // Not a value that any entry point writes.
   static constexpr jint kUntouched = 0x5A5A;
-  jint m_nElement = kUntouched;
-  std::optional<CGuardedBlock> m_Elements;
+  jint element = kUntouched;
+  std::optional<CGuardedBlock> elements;
 
   jintArray Handle() { return reinterpret_cast<jintArray>(this); }
 };
 
-struct CRecordingHost::TEnvironment : JNIEnv {
-  CRecordingHost* m_pHost = nullptr;
+struct CRecordingHost::Environment : JNIEnv {
+  CRecordingHost* host = nullptr;
 };
 
-/// The five functions that exist.
-struct THostFunctions {
-  using TText = CRecordingHost::TText;
+// The five functions that exist.
+struct HostFunctions {
+  using Text = CRecordingHost::Text;
 
   static CRecordingHost& HostOf(JNIEnv* env) {
-    return *static_cast<CRecordingHost::TEnvironment*>(env)->m_pHost;
+    return *static_cast<CRecordingHost::Environment*>(env)->host;
   }
 
-  static TText* Find(CRecordingHost& host, jstring handle) {
-    for (const auto& text : host.m_Texts) {
+  static Text* Find(CRecordingHost& host, jstring handle) {
+    for (const auto& text : host.m_texts) {
       if (text->Handle() == handle) return text.get();
     }
     return nullptr;
@@ -48,68 +48,68 @@ struct THostFunctions {
 
   static const char* JNICALL GetStringUTFChars(JNIEnv* env, jstring string, jboolean* isCopy) {
     CRecordingHost& host = HostOf(env);
-    TText* text = Find(host, string);
-    host.Note("GetStringUTFChars", text == nullptr ? "?" : std::to_string(text->m_nNumber));
+    Text* text = Find(host, string);
+    host.Note("GetStringUTFChars", text == nullptr ? "?" : std::to_string(text->number));
     if (isCopy != nullptr) host.Violation("GetStringUTFChars: is-copy pointer given");
-    if (text == nullptr || !text->m_Text.has_value()) {
+    if (text == nullptr || !text->text.has_value()) {
       host.Violation("GetStringUTFChars: not a string of this call");
       return nullptr;
     }
-    if (text->m_Characters.has_value()) host.Violation("GetStringUTFChars: string held twice");
+    if (text->characters.has_value()) host.Violation("GetStringUTFChars: string held twice");
     if (host.MustFail("GetStringUTFChars")) return nullptr;
-    text->m_Characters.emplace(host.m_ePlacement, text->m_Text->c_str(), text->m_Text->size() + 1);
-    return text->m_Characters->Data();
+    text->characters.emplace(host.m_placement, text->text->c_str(), text->text->size() + 1);
+    return text->characters->Data();
   }
 
   static void JNICALL ReleaseStringUTFChars(JNIEnv* env, jstring string, const char* characters) {
     CRecordingHost& host = HostOf(env);
-    TText* text = Find(host, string);
-    host.Note("ReleaseStringUTFChars", text == nullptr ? "?" : std::to_string(text->m_nNumber));
-    if (text == nullptr || !text->m_Characters.has_value()) {
+    Text* text = Find(host, string);
+    host.Note("ReleaseStringUTFChars", text == nullptr ? "?" : std::to_string(text->number));
+    if (text == nullptr || !text->characters.has_value()) {
       host.Violation("ReleaseStringUTFChars: string is not held");
       return;
     }
-    const CGuardedBlock& block = *text->m_Characters;
+    const CGuardedBlock& block = *text->characters;
     if (characters != block.Data()) {
       host.Violation("ReleaseStringUTFChars: not the pointer handed out");
     }
-    if (std::memcmp(block.Data(), text->m_Text->c_str(), block.Size()) != 0) {
+    if (std::memcmp(block.Data(), text->text->c_str(), block.Size()) != 0) {
       host.Violation("ReleaseStringUTFChars: the characters were written to");
     }
-    text->m_Characters.reset();
-    text->m_bReleased = true;
+    text->characters.reset();
+    text->released = true;
   }
 
   static jint* JNICALL GetIntArrayElements(JNIEnv* env, jintArray array, jboolean* isCopy) {
     CRecordingHost& host = HostOf(env);
     host.Note("GetIntArrayElements", "");
-    CRecordingHost::TStatus* status = host.m_pStatus.get();
+    CRecordingHost::Status* status = host.m_pStatus.get();
     if (isCopy != nullptr) host.Violation("GetIntArrayElements: is-copy pointer given");
     if (status == nullptr || array != status->Handle()) {
       host.Violation("GetIntArrayElements: not the array of this call");
       return nullptr;
     }
-    if (status->m_Elements.has_value()) host.Violation("GetIntArrayElements: array held twice");
+    if (status->elements.has_value()) host.Violation("GetIntArrayElements: array held twice");
     if (host.MustFail("GetIntArrayElements")) return nullptr;
-    status->m_Elements.emplace(host.m_ePlacement, &status->m_nElement, sizeof(jint));
-    return reinterpret_cast<jint*>(status->m_Elements->Data());
+    status->elements.emplace(host.m_placement, &status->element, sizeof(jint));
+    return reinterpret_cast<jint*>(status->elements->Data());
   }
 
   static void JNICALL ReleaseIntArrayElements(JNIEnv* env, jintArray array, jint* elements,
                                               jint mode) {
     CRecordingHost& host = HostOf(env);
     host.Note("ReleaseIntArrayElements", mode == 0 ? "" : "mode " + std::to_string(mode));
-    CRecordingHost::TStatus* status = host.m_pStatus.get();
-    if (status == nullptr || array != status->Handle() || !status->m_Elements.has_value()) {
+    CRecordingHost::Status* status = host.m_pStatus.get();
+    if (status == nullptr || array != status->Handle() || !status->elements.has_value()) {
       host.Violation("ReleaseIntArrayElements: array is not held");
       return;
     }
-    const char* const data = status->m_Elements->Data();
+    const char* const data = status->elements->Data();
     if (reinterpret_cast<const char*>(elements) != data) {
       host.Violation("ReleaseIntArrayElements: not the pointer handed out");
     }
-    if (mode != JNI_ABORT) std::memcpy(&status->m_nElement, data, sizeof(jint));
-    if (mode != JNI_COMMIT) status->m_Elements.reset();
+    if (mode != JNI_ABORT) std::memcpy(&status->element, data, sizeof(jint));
+    if (mode != JNI_COMMIT) status->elements.reset();
   }
 
   static jstring JNICALL NewStringUTF(JNIEnv* env, const char* characters) {
@@ -122,8 +122,8 @@ struct THostFunctions {
     if (host.m_bExceptionPending) host.Violation("NewStringUTF: an exception is pending");
     if (host.m_pResult != nullptr) host.Violation("NewStringUTF: second result");
     if (host.MustFail("NewStringUTF")) return nullptr;
-    host.m_pResult = std::make_unique<TText>();
-    host.m_pResult->m_Text = characters;
+    host.m_pResult = std::make_unique<Text>();
+    host.m_pResult->text = characters;
     return host.m_pResult->Handle();
   }
 
@@ -141,65 +141,65 @@ struct THostFunctions {
   }
 };
 
-bool TOutcome::IsSound() const {
-  const bool statusGood = !m_Status.has_value() || *m_Status == 1 || *m_Status == -1;
-  return m_Violations.empty() && m_Result.has_value() && statusGood;
+bool Outcome::IsSound() const {
+  const bool statusGood = !status.has_value() || *status == 1 || *status == -1;
+  return violations.empty() && result.has_value() && statusGood;
 }
 
-CRecordingHost::CRecordingHost(EPlacement placement)
-    : m_ePlacement(placement), m_pEnvironment(std::make_unique<TEnvironment>()) {
-  m_pEnvironment->functions = THostFunctions::Table();
-  m_pEnvironment->m_pHost = this;
+CRecordingHost::CRecordingHost(Placement placement)
+    : m_placement(placement), m_pEnvironment(std::make_unique<Environment>()) {
+  m_pEnvironment->functions = HostFunctions::Table();
+  m_pEnvironment->host = this;
 }
 
 CRecordingHost::~CRecordingHost() = default;
 
-TOutcome CRecordingHost::Call(const TExport& row, const TArguments& arguments) {
+Outcome CRecordingHost::Call(const Export& row, const Arguments& arguments) {
   return CallAt(row.EntryPoint(), row, arguments);
 }
 
-TOutcome CRecordingHost::CallAt(void* entryPoint, const TExport& row, const TArguments& arguments) {
-  m_Outcome = TOutcome();
-  m_Texts.clear();
+Outcome CRecordingHost::CallAt(void* entryPoint, const Export& row, const Arguments& arguments) {
+  m_outcome = Outcome();
+  m_texts.clear();
   m_pResult.reset();
   m_bExceptionPending = false;
-  m_pStatus = row.HasStatus() && !m_bNullStatus ? std::make_unique<TStatus>() : nullptr;
+  m_pStatus = row.HasStatus() && !m_bNullStatus ? std::make_unique<Status>() : nullptr;
   if (entryPoint == nullptr) Violation("the library does not export " + row.SymbolName());
   const std::vector<jvalue> values = MakeValues(row, arguments);
-  if (m_Outcome.m_Violations.empty()) {
+  if (m_outcome.violations.empty()) {
     ListenToLog(this);
-    const jstring returned = row.m_pCall(entryPoint, m_pEnvironment.get(), values.data());
+    const jstring returned = row.call(entryPoint, m_pEnvironment.get(), values.data());
     ListenToLog(nullptr);
     Finish(row, returned);
   }
-  return std::move(m_Outcome);
+  return std::move(m_outcome);
 }
 
-std::vector<jvalue> CRecordingHost::MakeValues(const TExport& row, const TArguments& arguments) {
+std::vector<jvalue> CRecordingHost::MakeValues(const Export& row, const Arguments& arguments) {
   std::string shape;
-  for (const TArgument& argument : arguments) shape.push_back(argument.m_chLetter);
+  for (const Argument& argument : arguments) shape.push_back(argument.letter);
   if (row.HasStatus()) shape.push_back('s');
-  if (shape != row.m_szShape) Violation("the test passes the arguments " + shape);
+  if (shape != row.shape) Violation("the test passes the arguments " + shape);
 
   std::vector<jvalue> values(shape.size());
   for (size_t i = 0; i < arguments.size(); ++i) {
-    const TArgument& argument = arguments[i];
-    switch (argument.m_chLetter) {
+    const Argument& argument = arguments[i];
+    switch (argument.letter) {
       case 'i':
-        values[i].i = static_cast<jint>(argument.m_nNumber);
+        values[i].i = static_cast<jint>(argument.number);
         break;
       case 'b':
-        values[i].b = static_cast<jbyte>(argument.m_nNumber);
+        values[i].b = static_cast<jbyte>(argument.number);
         break;
       case 'c':
-        values[i].c = static_cast<jchar>(argument.m_nNumber);
+        values[i].c = static_cast<jchar>(argument.number);
         break;
       default: {
-        auto text = std::make_unique<TText>();
-        text->m_nNumber = static_cast<int>(m_Texts.size()) + 1;
-        text->m_Text = argument.m_Text;
-        values[i].l = argument.m_Text.has_value() ? text->Handle() : nullptr;
-        m_Texts.push_back(std::move(text));
+        auto text = std::make_unique<Text>();
+        text->number = static_cast<int>(m_texts.size()) + 1;
+        text->text = argument.text;
+        values[i].l = argument.text.has_value() ? text->Handle() : nullptr;
+        m_texts.push_back(std::move(text));
       }
     }
   }
@@ -207,20 +207,20 @@ std::vector<jvalue> CRecordingHost::MakeValues(const TExport& row, const TArgume
   return values;
 }
 
-void CRecordingHost::Finish(const TExport& row, jstring returned) {
+void CRecordingHost::Finish(const Export& row, jstring returned) {
   const jstring made = m_pResult != nullptr ? m_pResult->Handle() : nullptr;
   if (returned != made) Violation("the returned string is not the one made");
-  if (m_pResult != nullptr) m_Outcome.m_Result = m_pResult->m_Text;
+  if (m_pResult != nullptr) m_outcome.result = m_pResult->text;
   if (m_pStatus != nullptr) {
-    if (m_pStatus->m_Elements.has_value()) Violation("the status elements were never released");
-    m_Outcome.m_Status = m_pStatus->m_nElement;
+    if (m_pStatus->elements.has_value()) Violation("the status elements were never released");
+    m_outcome.status = m_pStatus->element;
   }
-  const size_t firstKept = m_Texts.size() - static_cast<size_t>(row.m_nKeptStrings);
-  for (size_t i = 0; i < m_Texts.size(); ++i) {
-    const TText& text = *m_Texts[i];
-    const std::string name = "string " + std::to_string(text.m_nNumber);
-    if (i < firstKept && text.m_Characters.has_value()) Violation(name + " was never released");
-    if (i >= firstKept && text.m_bReleased && !m_bExceptionPending) {
+  const size_t firstKept = m_texts.size() - static_cast<size_t>(row.keptStrings);
+  for (size_t i = 0; i < m_texts.size(); ++i) {
+    const Text& text = *m_texts[i];
+    const std::string name = "string " + std::to_string(text.number);
+    if (i < firstKept && text.characters.has_value()) Violation(name + " was never released");
+    if (i >= firstKept && text.released && !m_bExceptionPending) {
       Violation(name + " was released, but this export keeps it");
     }
   }
@@ -233,7 +233,7 @@ void CRecordingHost::OnLog(int priority, const char* tag, const char* text) {
     Violation("null log line");
     return;
   }
-  if (m_bKeepRecord) m_Outcome.m_LogLines.emplace_back(text);
+  if (m_bKeepRecord) m_outcome.logLines.emplace_back(text);
   Note("log", text);
 }
 
@@ -242,21 +242,21 @@ void CRecordingHost::Note(std::string_view what, std::string_view detail) {
   std::string event(what);
   // A log line keeps its blank also when empty, to differ from no text at all.
   if (!detail.empty() || what == "log") event.append(" ").append(detail);
-  m_Outcome.m_Events.push_back(std::move(event));
+  m_outcome.events.push_back(std::move(event));
 }
 
 void CRecordingHost::Violation(std::string text) {
-  m_Outcome.m_Violations.push_back(std::move(text));
+  m_outcome.violations.push_back(std::move(text));
 }
 
 bool CRecordingHost::MustFail(const char* function) {
-  ++m_Outcome.m_nFallibleCalls;
+  ++m_outcome.fallibleCalls;
   // A machine that threw serves no further request; what came before must still be released.
   if (m_bExceptionPending) {
     Violation(std::string(function) + ": an exception is pending");
     return true;
   }
-  if (m_Outcome.m_nFallibleCalls != m_nFailing) return false;
+  if (m_outcome.fallibleCalls != m_nFailing) return false;
   m_bExceptionPending = true;
   return true;
 }

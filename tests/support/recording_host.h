@@ -16,88 +16,88 @@
 
 namespace gateway_tests {
 
-/// One Java argument: a text (or null) for 'S', a number for 'i', 'b' and 'c'.
-struct TArgument {
-  char m_chLetter = 'i';
-  int64_t m_nNumber = 0;
-  std::optional<std::string> m_Text;
+// One Java argument: a text (or null) for 'S', a number for 'i', 'b' and 'c'.
+struct Argument {
+  char letter = 'i';
+  int64_t number = 0;
+  std::optional<std::string> text;
 
-  static TArgument Int(int64_t value) { return {'i', value, std::nullopt}; }
-  static TArgument Byte(int64_t value) { return {'b', value, std::nullopt}; }
-  static TArgument Char(int64_t value) { return {'c', value, std::nullopt}; }
-  static TArgument Text(std::string_view text) { return {'S', 0, std::string(text)}; }
-  static TArgument Null() { return {'S', 0, std::nullopt}; }
+  static Argument Int(int64_t value) { return {'i', value, std::nullopt}; }
+  static Argument Byte(int64_t value) { return {'b', value, std::nullopt}; }
+  static Argument Char(int64_t value) { return {'c', value, std::nullopt}; }
+  static Argument Text(std::string_view text) { return {'S', 0, std::string(text)}; }
+  static Argument Null() { return {'S', 0, std::nullopt}; }
 };
-using TArguments = std::vector<TArgument>;
+using Arguments = std::vector<Argument>;
 
-/// What a call did.
-struct TOutcome {
-  /// The returned string; empty when a null reference came back.
-  std::optional<std::string> m_Result;
-  /// status[0] afterwards; empty when the export takes no status array or a null one was passed.
-  std::optional<int32_t> m_Status;
-  /// VM calls and log lines in their order, as "GetStringUTFChars 1", "log text",
-  /// "ReleaseIntArrayElements", "NewStringUTF text". Strings are numbered from 1 by their place
-  /// among the call's string arguments.
-  std::vector<std::string> m_Events;
-  /// The log lines alone.
-  std::vector<std::string> m_LogLines;
-  /// Everything that no entry point may do; empty for a good call.
-  std::vector<std::string> m_Violations;
-  /// Number of VM calls that can fail (characters, elements, new string).
-  int m_nFallibleCalls = 0;
+// What a call did.
+struct Outcome {
+  // The returned string; empty when a null reference came back.
+  std::optional<std::string> result;
+  // status[0] afterwards; empty when the export takes no status array or a null one was passed.
+  std::optional<int32_t> status;
+  // VM calls and log lines in their order, as "GetStringUTFChars 1", "log text",
+  // "ReleaseIntArrayElements", "NewStringUTF text". Strings are numbered from 1 by their place
+  // among the call's string arguments.
+  std::vector<std::string> events;
+  // The log lines alone.
+  std::vector<std::string> logLines;
+  // Everything that no entry point may do; empty for a good call.
+  std::vector<std::string> violations;
+  // Number of VM calls that can fail (characters, elements, new string).
+  int fallibleCalls = 0;
 
-  /// True when all of that holds for any good call: a result, no violation, a status of 1 or -1.
+  // True when all of that holds for any good call: a result, no violation, a status of 1 or -1.
   bool IsSound() const;
 };
 
-/// A virtual machine that serves one entry point at a time and writes down what it does. Only the
-/// five VM functions that entry points need exist; any other ends the program with its name.
-/// One host serves one thread.
-class CRecordingHost : private ILogListener {
+// A virtual machine that serves one entry point at a time and writes down what it does. Only the
+// five VM functions that entry points need exist; any other ends the program with its name.
+// One host serves one thread.
+class CRecordingHost : private CLogListener {
  public:
-  /// `placement` says where the characters and elements that the host hands out lie.
-  explicit CRecordingHost(EPlacement placement = EPlacement::kHeap);
+  // `placement` says where the characters and elements that the host hands out lie.
+  explicit CRecordingHost(Placement placement = Placement::kHeap);
   ~CRecordingHost() override;
   CRecordingHost(const CRecordingHost&) = delete;
   CRecordingHost& operator=(const CRecordingHost&) = delete;
 
-  /// The nth VM call (from 1) that can fail fails in each following call; 0 for none.
+  // The nth VM call (from 1) that can fail fails in each following call; 0 for none.
   void FailCall(int nth) { m_nFailing = nth; }
-  /// Passes null instead of a status array.
+  // Passes null instead of a status array.
   void PassNullStatus(bool null) { m_bNullStatus = null; }
-  /// Without a record no event and no log line is kept (for timing); violations still are.
+  // Without a record no event and no log line is kept (for timing); violations still are.
   void KeepRecord(bool keep) { m_bKeepRecord = keep; }
 
-  /// Calls `row` with `arguments`, which must fit its shape without the status array.
-  TOutcome Call(const TExport& row, const TArguments& arguments);
+  // Calls `row` with `arguments`, which must fit its shape without the status array.
+  Outcome Call(const Export& row, const Arguments& arguments);
 
-  /// Calls another function of the row's shape in place of the library's.
-  TOutcome CallAt(void* entryPoint, const TExport& row, const TArguments& arguments);
+  // Calls another function of the row's shape in place of the library's.
+  Outcome CallAt(void* entryPoint, const Export& row, const Arguments& arguments);
 
  private:
-  struct TEnvironment;
-  struct TText;
-  struct TStatus;
-  friend struct THostFunctions;
+  struct Environment;
+  struct Text;
+  struct Status;
+  friend struct HostFunctions;
 
   void OnLog(int priority, const char* tag, const char* text) override;
   void Note(std::string_view what, std::string_view detail);
   void Violation(std::string text);
   bool MustFail(const char* function);
-  std::vector<jvalue> MakeValues(const TExport& row, const TArguments& arguments);
-  void Finish(const TExport& row, jstring returned);
+  std::vector<jvalue> MakeValues(const Export& row, const Arguments& arguments);
+  void Finish(const Export& row, jstring returned);
 
-  EPlacement m_ePlacement;
+  Placement m_placement;
   int m_nFailing = 0;
   bool m_bNullStatus = false;
   bool m_bKeepRecord = true;
   bool m_bExceptionPending = false;
-  std::unique_ptr<TEnvironment> m_pEnvironment;
-  std::vector<std::unique_ptr<TText>> m_Texts;
-  std::unique_ptr<TStatus> m_pStatus;
-  std::unique_ptr<TText> m_pResult;
-  TOutcome m_Outcome;
+  std::unique_ptr<Environment> m_pEnvironment;
+  std::vector<std::unique_ptr<Text>> m_texts;
+  std::unique_ptr<Status> m_pStatus;
+  std::unique_ptr<Text> m_pResult;
+  Outcome m_outcome;
 };
 
 }  // namespace gateway_tests

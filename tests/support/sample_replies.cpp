@@ -6,10 +6,10 @@
 namespace gateway_tests {
 namespace {
 
-/// Numbers that look like chance and are the same every time.
+// Numbers that look like chance and are the same every time.
 class CDice {
  public:
-  /// 0 to sides - 1.
+  // 0 to sides - 1.
   int Roll(int sides) {
     m_nState = m_nState * 6364136223846793005U + 1442695040888963407U;
     return static_cast<int>((m_nState >> 33) % static_cast<uint64_t>(sides));
@@ -32,13 +32,13 @@ class CRecordText {
     return *this;
   }
   CRecordText& Add(const char* tag, int value) { return Add(tag, std::to_string(value)); }
-  /// With leading zeros.
+  // With leading zeros.
   CRecordText& Add(const char* tag, int value, int width) {
     char text[16];
     snprintf(text, sizeof text, "%0*d", width, value);
     return Add(tag, text);
   }
-  /// A price with hundredths.
+  // A price with hundredths.
   CRecordText& AddPrice(const char* tag, int hundredths) {
     char text[24];
     snprintf(text, sizeof text, "%d.%02d", hundredths / 100, hundredths % 100);
@@ -129,7 +129,7 @@ void AddPayment(CRecordText& record, bool brokerage) {
   record.Add("97", dice.Roll(2000000));
 }
 
-/// The fields of a contract: one leg, or two (`pair`), which have fields of their own.
+// The fields of a contract: one leg, or two (`pair`), which have fields of their own.
 void AddContract(CRecordText& record, bool option, bool pair) {
   CDice& dice = record.Dice();
   const char* const commodity = option ? "TXO" : "TXF";
@@ -174,12 +174,12 @@ void AddPosition(CRecordText& record, int) {
   record.Add("R8", 1 + dice.Roll(20)).Add("50", 100 * dice.Roll(900)).Add("28", 1);
 }
 
-struct TList {
-  std::string_view m_szDecoder;
-  void (*m_pAdd)(CRecordText& record, int number);
+struct List {
+  std::string_view decoder;
+  void (*add)(CRecordText& record, int number);
 };
 
-constexpr TList kLists[] = {
+constexpr List kLists[] = {
     {"AuthDecode", AddAccount},
     {"GetTotalAccountDecode", AddAccount},
     {"QueryOrderDecode", AddStockOrder},
@@ -193,9 +193,9 @@ constexpr TList kLists[] = {
     {"FutQueryInventoryDecode", AddPosition},
 };
 
-struct TAnswer {
-  std::string_view m_szDecoder;
-  std::string_view m_szReply;
+struct Answer {
+  std::string_view decoder;
+  std::string_view reply;
 };
 
 constexpr std::string_view kDone = "F=7|KIND=S|00=1|68=0000|M2=|01=";
@@ -207,7 +207,7 @@ constexpr std::string_view kCertificate =
     "EwdVbmtub3duMRAwDgYDVQQDEwdVbmtub3duMB4XDTI0MDExNTA1NDUyMVoXDTI1MDExNDA1NDUyMVowbDEQMA4GA1UE|"
     "01=";
 
-constexpr TAnswer kAnswers[] = {
+constexpr Answer kAnswers[] = {
     {"OpenAccountDecode", kDone},
     {"ChangePasswordDecode", kDone},
     {"QueryBankRemainDecode", "F=7|KIND=S|00=1|68=0000|PN=1234567|01="},
@@ -232,14 +232,14 @@ constexpr TAnswer kAnswers[] = {
 }  // namespace
 
 std::string SampleList(std::string_view decoder, size_t records) {
-  for (const TList& list : kLists) {
-    if (list.m_szDecoder != decoder) continue;
+  for (const List& list : kLists) {
+    if (list.decoder != decoder) continue;
     CDice dice;
     std::string reply = "F=7|KIND=S|65=0013452107";
     CRecordText record(reply, dice);
     for (size_t number = 1; number <= records; ++number) {
       record.Add("00", "1").Add("67", static_cast<int>(number), 6).Add("68", "0000");
-      list.m_pAdd(record, static_cast<int>(number));
+      list.add(record, static_cast<int>(number));
       record.Add("01", "");
     }
     record.Add("00", "1").Add("67", "900001").Add("68", "0000").Add("01", "");
@@ -250,8 +250,8 @@ std::string SampleList(std::string_view decoder, size_t records) {
 }
 
 std::string SampleAnswer(std::string_view decoder) {
-  for (const TAnswer& answer : kAnswers) {
-    if (answer.m_szDecoder == decoder) return std::string(answer.m_szReply);
+  for (const Answer& answer : kAnswers) {
+    if (answer.decoder == decoder) return std::string(answer.reply);
   }
   return {};
 }

@@ -7,7 +7,7 @@
 
 namespace gateway_tests {
 
-/// The decoder whose replies list records, by the name of its export.
+// The decoder whose replies list records, by the name of its export.
 inline constexpr std::string_view kListDecoders[] = {
     "AuthDecode",          "GetTotalAccountDecode",   "QueryOrderDecode",
     "QueryReplyDecode",    "QueryInventoryDecode",    "QueryInventoryDecodeJZG",
@@ -15,14 +15,14 @@ inline constexpr std::string_view kListDecoders[] = {
     "FutQueryReplyDecode", "FutQueryInventoryDecode",
 };
 
-/// A reply with `records` records of everyday fields, each different from the last, then the end
-/// mark. The same at every call. Empty when `decoder` is none of kListDecoders.
+// A reply with `records` records of everyday fields, each different from the last, then the end
+// mark. The same at every call. Empty when `decoder` is none of kListDecoders.
 std::string SampleList(std::string_view decoder, size_t records);
 
-/// A reply to one of the decoders that list nothing; empty when there is no such decoder.
+// A reply to one of the decoders that list nothing; empty when there is no such decoder.
 std::string SampleAnswer(std::string_view decoder);
 
-/// A reply of one kind or the other, a list with `records` records.
+// A reply of one kind or the other, a list with `records` records.
 std::string SampleReply(std::string_view decoder, size_t records);
 
 }  // namespace gateway_tests

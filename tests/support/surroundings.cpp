@@ -8,7 +8,7 @@ namespace {
 
 constexpr std::time_t kClockNotSet = -1;
 thread_local std::time_t t_tClock = kClockNotSet;
-thread_local ILogListener* t_pListener = nullptr;
+thread_local CLogListener* t_pListener = nullptr;
 
 }  // namespace
 
@@ -31,7 +31,7 @@ bool SetClock(std::string_view localTime) {
   return true;
 }
 
-void ListenToLog(ILogListener* listener) {
+void ListenToLog(CLogListener* listener) {
   t_pListener = listener;
 }
 

@@ -10,24 +10,24 @@
 
 namespace gateway_tests {
 
-/// Sets the time zone of the market. To be called first in main, before any thread exists.
+// Sets the time zone of the market. To be called first in main, before any thread exists.
 void EnterMarketTimeZone();
 
-/// Stops the clock of the calling thread at `when`. Threads that never do so have the real time.
+// Stops the clock of the calling thread at `when`. Threads that never do so have the real time.
 void SetClock(std::time_t when);
 
-/// Stops the clock at a local time "2024-01-15 13:45:21"; false when the text is no such time.
+// Stops the clock at a local time "2024-01-15 13:45:21"; false when the text is no such time.
 bool SetClock(std::string_view localTime);
 
-/// Receives each line that the calling thread logs. `text` may be null.
-class ILogListener {
+// Receives each line that the calling thread logs. `text` may be null.
+class CLogListener {
  public:
-  virtual ~ILogListener() = default;
+  virtual ~CLogListener() = default;
   virtual void OnLog(int priority, const char* tag, const char* text) = 0;
 };
 
-/// Names the listener of the calling thread (null for none: lines are dropped).
-void ListenToLog(ILogListener* listener);
+// Names the listener of the calling thread (null for none: lines are dropped).
+void ListenToLog(CLogListener* listener);
 
 }  // namespace gateway_tests
 

@@ -46,19 +46,19 @@ double Now() {
 
 class CDecoder {
  public:
-  explicit CDecoder(const TExport& row) : m_Row(row), m_pEntryPoint(row.EntryPoint()) {}
+  explicit CDecoder(const Export& row) : m_row(row), m_pEntryPoint(row.EntryPoint()) {}
 
   void Call(const std::string& reply) const {
     jint status = 0;
     jvalue values[3] = {};
     jvalue* at = values;
-    if (m_Row.m_szShape.front() == 'i') (at++)->i = 0;
+    if (m_row.shape.front() == 'i') (at++)->i = 0;
     (at++)->l = BareText(reply.c_str());
     at->l = BareStatus(&status);
-    m_Row.m_pCall(m_pEntryPoint, BareHost(), values);
+    m_row.call(m_pEntryPoint, BareHost(), values);
   }
 
-  /// Seconds of one call.
+  // Seconds of one call.
   double Seconds(const std::string& reply) const {
     Call(reply);  // memory is at hand from now on
     const size_t repeats = 1 + (64 << 10) / reply.size();
@@ -72,26 +72,26 @@ class CDecoder {
   }
 
  private:
-  const TExport& m_Row;
+  const Export& m_row;
   void* m_pEntryPoint;
 };
 
-struct TGrowth {
-  double m_dSlope = 0;
-  double m_dLongest = 0;  // seconds of the longest reply
+struct Growth {
+  double slope = 0;
+  double longest = 0;  // seconds of the longest reply
 };
 
-/// `make(length)` makes a reply of about that length.
-template <class TMake>
-TGrowth MeasureOnce(const CDecoder& decoder, const TMake& make) {
+// `make(length)` makes a reply of about that length.
+template <class Make>
+Growth MeasureOnce(const CDecoder& decoder, const Make& make) {
   std::vector<double> lengths;
   std::vector<double> times;
-  TGrowth growth;
+  Growth growth;
   for (size_t length = kShortest; length <= kLongest; length *= kStep) {
     const std::string reply = make(length);
-    growth.m_dLongest = decoder.Seconds(reply);
+    growth.longest = decoder.Seconds(reply);
     lengths.push_back(std::log(static_cast<double>(reply.size())));
-    times.push_back(std::log(growth.m_dLongest));
+    times.push_back(std::log(growth.longest));
   }
   std::vector<double> slopes;
   for (size_t i = 0; i < times.size(); ++i) {
@@ -99,20 +99,20 @@ TGrowth MeasureOnce(const CDecoder& decoder, const TMake& make) {
       slopes.push_back((times[i] - times[j]) / (lengths[i] - lengths[j]));
     }
   }
-  growth.m_dSlope = Median(slopes);
+  growth.slope = Median(slopes);
   return growth;
 }
 
-template <class TMake>
-TGrowth Measure(const CDecoder& decoder, const TMake& make) {
-  TGrowth growth = MeasureOnce(decoder, make);
-  for (int more = 1; more < kAttempts && growth.m_dSlope > kBound; ++more) {
+template <class Make>
+Growth Measure(const CDecoder& decoder, const Make& make) {
+  Growth growth = MeasureOnce(decoder, make);
+  for (int more = 1; more < kAttempts && growth.slope > kBound; ++more) {
     growth = MeasureOnce(decoder, make);
   }
   return growth;
 }
 
-/// What a gateway sends, at any length: records, or fields that an answer does not ask for.
+// What a gateway sends, at any length: records, or fields that an answer does not ask for.
 std::string OrdinaryReply(std::string_view decoder, size_t length) {
   constexpr size_t kSome = 8;
   const std::string few = SampleList(decoder, kSome);
@@ -122,26 +122,25 @@ std::string OrdinaryReply(std::string_view decoder, size_t length) {
   return reply;
 }
 
-/// Prints the decoder's row; false when a slope is above the bound.
-bool PrintDecoder(const TExport& row) {
+// Prints the decoder's row; false when a slope is above the bound.
+bool PrintDecoder(const Export& row) {
   const CDecoder decoder(row);
-  const TGrowth ordinary =
-      Measure(decoder, [&](size_t length) { return OrdinaryReply(row.m_szName, length); });
-  TGrowth steepest;
+  const Growth ordinary =
+      Measure(decoder, [&](size_t length) { return OrdinaryReply(row.name, length); });
+  Growth steepest;
   const char* name = "";
-  for (const THostileReply& hostile : kHostileReplies) {
-    const TGrowth growth =
+  for (const HostilePattern& hostile : kHostileReplies) {
+    const Growth growth =
         Measure(decoder, [&](size_t length) { return MakeReply(hostile, length); });
-    if (growth.m_dSlope > steepest.m_dSlope) {
+    if (growth.slope > steepest.slope) {
       steepest = growth;
-      name = hostile.m_szName;
+      name = hostile.name;
     }
   }
-  std::printf("| %.*s | %.2f | %.1f | %.2f | %s |\n", static_cast<int>(row.m_szName.size()),
-              row.m_szName.data(), ordinary.m_dSlope, 1e3 * ordinary.m_dLongest, steepest.m_dSlope,
-              name);
+  std::printf("| %.*s | %.2f | %.1f | %.2f | %s |\n", static_cast<int>(row.name.size()),
+              row.name.data(), ordinary.slope, 1e3 * ordinary.longest, steepest.slope, name);
   std::fflush(stdout);
-  return ordinary.m_dSlope <= kBound && steepest.m_dSlope <= kBound;
+  return ordinary.slope <= kBound && steepest.slope <= kBound;
 }
 
 }  // namespace
@@ -157,7 +156,7 @@ int main() {
   std::puts("|---|---|---|---|---|");
   int decoders = 0;
   bool good = true;
-  for (const TExport& row : AllExports()) {
+  for (const Export& row : AllExports()) {
     if (!row.IsDecoder()) continue;
     ++decoders;
     good = PrintDecoder(row) && good;

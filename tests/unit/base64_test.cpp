@@ -13,14 +13,14 @@
 
 namespace {
 
-/// Bytes that reach every value, those above 127 too.
+// Bytes that reach every value, those above 127 too.
 std::string Bytes(size_t count) {
   std::string bytes;
   for (size_t i = 0; i < count; ++i) bytes.push_back(static_cast<char>(i * 167 + 91));
   return bytes;
 }
 
-/// Plain Base64, bit by bit: another road to the same text.
+// Plain Base64, bit by bit: another road to the same text.
 std::string PlainBase64(const std::string& bytes) {
   const std::string letters = "ABCDEFGHIJKLMNOPQRSTUVWXYZabcdefghijklmnopqrstuvwxyz0123456789+/";
   std::string text;
@@ -36,7 +36,7 @@ std::string PlainBase64(const std::string& bytes) {
   return text;
 }
 
-/// The text of `bytes`, which lie in a block of their very size.
+// The text of `bytes`, which lie in a block of their very size.
 std::string Encoded(const std::string& bytes) {
   const auto block = std::make_unique<char[]>(bytes.size());
   bytes.copy(block.get(), bytes.size());
@@ -91,19 +91,19 @@ TEST(Base64Encode, EveryLengthGivesPlainBase64OnceTheLineEndsAreOut) {
   }
 }
 
-struct TDecoding {
-  const char* m_szTitle;
-  const char* m_szText;
-  std::string m_Bytes;
-  int m_nError = 0;
+struct Decoding {
+  const char* title;
+  const char* text;
+  std::string bytes;
+  int error = 0;
 };
-void PrintTo(const TDecoding& decoding, std::ostream* out) {
-  *out << decoding.m_szTitle;
+void PrintTo(const Decoding& decoding, std::ostream* out) {
+  *out << decoding.title;
 }
 
 using namespace std::string_literals;
 
-const TDecoding kDecodings[] = {
+const Decoding kDecodings[] = {
     {"Nothing", "", ""},
     {"OneGroup", "YWJj", "abc"},
     {"AllBitsOfBytesAbove127", "//79", "\xff\xfe\xfd"},
@@ -127,23 +127,23 @@ const TDecoding kDecodings[] = {
     {"PadBehindAForeignCharacterIsForeign", "YW\n==", "a", 1},
 };
 
-class Base64Decode : public testing::TestWithParam<TDecoding> {};
+class Base64Decode : public testing::TestWithParam<Decoding> {};
 
 TEST_P(Base64Decode, Case) {
-  const std::string text = GetParam().m_szText;
+  const std::string text = GetParam().text;
   const auto block = std::make_unique<char[]>(text.size());
   text.copy(block.get(), text.size());
   CBase64Utils utils;
   int length = static_cast<int>(text.size());
   char* const bytes = utils.Decode(block.get(), &length);
   ASSERT_NE(bytes, nullptr);
-  EXPECT_EQ(std::string(bytes, static_cast<size_t>(length)), GetParam().m_Bytes);
-  EXPECT_EQ(utils.m_nError, GetParam().m_nError);
+  EXPECT_EQ(std::string(bytes, static_cast<size_t>(length)), GetParam().bytes);
+  EXPECT_EQ(utils.m_nError, GetParam().error);
   free(bytes);
 }
 
-std::string NameOf(const testing::TestParamInfo<TDecoding>& info) {
-  return info.param.m_szTitle;
+std::string NameOf(const testing::TestParamInfo<Decoding>& info) {
+  return info.param.title;
 }
 
 INSTANTIATE_TEST_SUITE_P(Texts, Base64Decode, testing::ValuesIn(kDecodings), NameOf);

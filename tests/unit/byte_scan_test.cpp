@@ -66,7 +66,7 @@ std::vector<size_t> BarsPlainly(const char* text, size_t size) {
 TEST(ByteScan, ScannerHandsOutABarAtEveryPlaceOfTextsOfEverySize) {
   for (size_t size = 0; size <= 3 * kBarBlock + 1; ++size) {
     const std::string plain(size, 'a');
-    for (EPlacement placement : {EPlacement::kBeforeUnreadable, EPlacement::kAfterUnreadable}) {
+    for (Placement placement : {Placement::kBeforeUnreadable, Placement::kAfterUnreadable}) {
       const CGuardedBlock text(placement, plain.data(), size);
       EXPECT_EQ(BarsOf(text.Data(), size), std::vector<size_t>{});
       for (size_t bar = 0; bar < size; ++bar) {

@@ -112,7 +112,7 @@ TEST(Decimal, ShortTextsAreReadAsTheCLibraryReadsThem) {
 
 TEST(Decimal, ReadingTouchesNothingOutsideTheSlice) {
   const std::string digits = "1234567890";
-  for (const EPlacement placement : {EPlacement::kBeforeUnreadable, EPlacement::kAfterUnreadable}) {
+  for (const Placement placement : {Placement::kBeforeUnreadable, Placement::kAfterUnreadable}) {
     for (size_t size = 1; size <= digits.size(); ++size) {
       const CGuardedBlock block(placement, digits.data(), size);
       EXPECT_EQ(ReadInt32({block.Data(), size}), std::stoi(digits.substr(0, size)));
@@ -158,7 +158,7 @@ TEST(Decimal, ReadingStopsAtTheEndOfTheSlice) {
   EXPECT_EQ(ReadInt64(std::string_view()), 0);
   for (const char* text : {"12", "-", " ", "99999999999999999999"}) {
     const size_t size = std::string_view(text).size();
-    const CGuardedBlock block(EPlacement::kBeforeUnreadable, text, size);
+    const CGuardedBlock block(Placement::kBeforeUnreadable, text, size);
     EXPECT_EQ(ReadInt64({block.Data(), size}), strtoll(text, nullptr, 10)) << text;
   }
 }

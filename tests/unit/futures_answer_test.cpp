@@ -17,7 +17,7 @@ class FuturesAnswer : public CSessionTest {
   int m_nStatus = 0;
 };
 
-struct TAnswer {
+struct Answer {
   const char* name;
   std::string reply, result;
   int status;
@@ -25,7 +25,7 @@ struct TAnswer {
 
 TEST_F(FuturesAnswer, EveryKind) {
   const std::string good = "F=1|39= |19=S|46=A0001|44=1130115";
-  const TAnswer rows[] = {
+  const Answer rows[] = {
       {"empty reply", "", "委託單傳送中!!", 1},
       {"gateway down", "[GATEWAY]error", "[GATEWAY]主機連線失敗", -1},
       {"broker down", good + "|[BROKER]timeout", "[BROKER]主機連線失敗", -1},
@@ -56,12 +56,12 @@ TEST_F(FuturesAnswer, EveryKind) {
       {"19 of 127", "|39= |19=S" + std::string(126, 'x'), "@@@1@@!", 1},
       {"19 of 128 is dropped", "|39= |19=S" + std::string(127, 'x') + "|K1=no", "no", -1},
   };
-  for (const TAnswer& row : rows) {
+  for (const Answer& row : rows) {
     EXPECT_EQ(Decode(row.reply), row.result) << row.name;
     EXPECT_EQ(m_nStatus, row.status) << row.name;
   }
   EXPECT_STREQ(m_gateway.SubmitOrderDecode(nullptr, &m_nStatus), "委託單傳送中!!");
-  EXPECT_EQ(m_log.Take(), TLines{});
+  EXPECT_EQ(m_log.Take(), Lines{});
 }
 
 }  // namespace

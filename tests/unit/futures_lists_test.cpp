@@ -17,20 +17,20 @@ std::string Record(const std::string& fields) {
 
 class FuturesList : public CSessionTest {
  protected:
-  using TDecode = char* (CGatewayFut::*)(const char*, int*);
+  using Decode = char* (CGatewayFut::*)(const char*, int*);
 
-  std::string Decode(TDecode decode, const std::string& reply) {
+  std::string Read(Decode decode, const std::string& reply) {
     m_nStatus = 0;
     return (m_gateway.*decode)(CTextAtPageEnd(reply), &m_nStatus);
   }
   std::string Fills(const std::string& reply) {
-    return Decode(&CGatewayFut::QueryReplyDecode, reply);
+    return Read(&CGatewayFut::QueryReplyDecode, reply);
   }
   std::string Positions(const std::string& reply) {
-    return Decode(&CGatewayFut::QueryInventoryDecode, reply);
+    return Read(&CGatewayFut::QueryInventoryDecode, reply);
   }
   std::string Margin(const std::string& reply) {
-    return Decode(&CGatewayFut::QueryFinanceDecode, reply);
+    return Read(&CGatewayFut::QueryFinanceDecode, reply);
   }
   std::string Fill(const std::string& fields) { return Fills(Record(fields)); }
 
@@ -169,7 +169,7 @@ TEST_F(FuturesList, FillsDoNotCarryOver) {
             "2!A&@57|58@TAIMEX&X&&|&|&0|0@5&1@0&0@@@&@ @&!B&@@TAIMEX&F&&&&0@0&0@0&0@@@&@ @&!");
 }
 
-struct TListRow {
+struct ListRow {
   const char* name;
   std::string reply;
   std::string fills, positions;
@@ -178,7 +178,7 @@ struct TListRow {
 
 TEST_F(FuturesList, RepliesThatListNothing) {
   const std::string noPositions = "<5>!0!<6>!0!";
-  const TListRow rows[] = {
+  const ListRow rows[] = {
       {"empty reply", "", kNoReply, kNoReply, -1},
       {"no data", "|68=5001|M2=x", "0!", noPositions, 1},
       {"no data in its first record", "|00=1|68=5001|01=", "0!", noPositions, 1},
@@ -200,7 +200,7 @@ TEST_F(FuturesList, RepliesThatListNothing) {
        noPositions, 1},
       {"record cut short", "|68=0000|00=1|68=0000|36=A", "0!", noPositions, 1},
   };
-  for (const TListRow& row : rows) {
+  for (const ListRow& row : rows) {
     EXPECT_EQ(Fills(row.reply), row.fills) << row.name;
     EXPECT_EQ(m_nStatus, row.status) << row.name;
     EXPECT_EQ(Positions(row.reply), row.positions) << row.name;
@@ -209,7 +209,7 @@ TEST_F(FuturesList, RepliesThatListNothing) {
   EXPECT_EQ(std::string(m_gateway.QueryReplyDecode(nullptr, &m_nStatus)), kNoReply);
   EXPECT_EQ(std::string(m_gateway.QueryInventoryDecode(nullptr, &m_nStatus)), kNoReply);
   EXPECT_EQ(std::string(m_gateway.QueryFinanceDecode(nullptr, &m_nStatus)), kNoReply);
-  EXPECT_EQ(m_log.Take(), TLines{});
+  EXPECT_EQ(m_log.Take(), Lines{});
 }
 
 TEST_F(FuturesList, ListsEndAtAnEmptyRecordOrTheEndMarkAndPassOverOtherCodes) {

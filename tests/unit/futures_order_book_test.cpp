@@ -19,7 +19,7 @@ class FuturesOrderBook : public CSessionTest {
     return m_gateway.QueryOrderDecode(CTextAtPageEnd(reply), &m_nStatus);
   }
 
-  /// The only record's fields between '@'; the number of fields is checked.
+  // The only record's fields between '@'; the number of fields is checked.
   std::vector<std::string> Fields(const std::string& record, size_t count = 16) {
     std::string list = Decode(Record(record) + kEnd);
     EXPECT_EQ(list.substr(0, 2), "1!") << list;
@@ -36,7 +36,7 @@ class FuturesOrderBook : public CSessionTest {
     return fields;
   }
 
-  /// The records' fields at `place`, one for each record.
+  // The records' fields at `place`, one for each record.
   std::string Column(const std::string& reply, size_t place) {
     const std::string list = Decode(reply);
     std::string column;
@@ -96,7 +96,7 @@ TEST_F(FuturesOrderBook, RecordWithoutAnyFieldOfItsOwn) {
 TEST_F(FuturesOrderBook, OrderNumbersAreLoggedEmptyOnesToo) {
   Decode(Record("|46=A01") + "|00=1|68=0009|46=skipped|01=" + Record("") + Record("|46=A03") +
          kEnd);
-  EXPECT_EQ(m_log.Take(), (TLines{"A01", "", "A03"}));
+  EXPECT_EQ(m_log.Take(), (Lines{"A01", "", "A03"}));
 }
 
 TEST_F(FuturesOrderBook, EndMarkInTheFirstRecordIsAnEmptyList) {
@@ -179,27 +179,27 @@ TEST_F(FuturesOrderBook, UnknownCallPutFailsTheWholeListAfterItsNumberWasLogged)
                      Record("|46=C") + kEnd),
               "[CLIENT]委託種類錯誤");
     EXPECT_EQ(m_nStatus, -1);
-    EXPECT_EQ(m_log.Take(), (TLines{"A", "B"}));
+    EXPECT_EQ(m_log.Take(), (Lines{"A", "B"}));
   }
   // Seven characters are read, eight are dropped and leave a futures order.
   EXPECT_EQ(Decode(Record("|V8=CCCCCCC")), "[CLIENT]委託種類錯誤");
   EXPECT_EQ(Fields("|V8=CCCCCCCC|32=B|27=1")[kContract], "TIMEX&F&&&&0");
 }
 
-struct TLegRow {
+struct LegRow {
   const char* w3;
   int buying;  // 0: a bare '@'
   bool options;
 };
 
 TEST_F(FuturesOrderBook, LegCodesOfEveryCell) {
-  const TLegRow rows[] = {
+  const LegRow rows[] = {
       {"", 51, false},  {" ", 51, false}, {"0", 53, false},        {"1", 55, false},
       {"2", 57, false}, {"3", 0, false},  {"00", 0, false},        {"  ", 0, false},
       {"", 51, true},   {" ", 51, true},  {"0", 53, true},         {"1", 55, true},
       {"2", 0, true},   {"9", 0, true},   {"12345678", 51, false}, {"1234567", 0, false},
   };
-  for (const TLegRow& row : rows) {
+  for (const LegRow& row : rows) {
     const auto legs = [&](const std::string& side1, const std::string& side2) {
       std::string fields = "|W3=" + std::string(row.w3) + "|32=" + side1 + "|EL=" + side2;
       fields += row.options ? "|V8=P|27=1" : "|V8=|27=1";

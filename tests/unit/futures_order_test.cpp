@@ -12,34 +12,34 @@ namespace {
 const std::string kParameterError = "[CLIENT]傳入的參數錯誤";
 const std::string kAnyPrice = "17500.0000";
 
-struct TOrder {
-  const char* m_szReference = "";
-  const char* m_szDate = "";
-  const char* m_szCommodity1 = "TXO";
-  const char* m_szCommodity2 = "TXO";
-  const char* m_szMonth1 = "202401";
-  const char* m_szMonth2 = "202402";
-  const char* m_szStrike1 = "17500";
-  const char* m_szStrike2 = "17600";
-  const char* m_szCallPut1 = "C";
-  const char* m_szCallPut2 = "P";
-  int m_nN6 = 0;
-  int m_nKind = 1;
-  int m_nPriceType = 2;
-  char m_chFunction = 'I';
-  char m_chW3 = '0';
-  char m_chTimeInForce = 'R';
-  char m_chSide1 = 'B';
-  char m_chSide2 = 'S';
-  int m_nQuantity = 3;
-  int m_nPrice = 175000000;
+struct Order {
+  const char* reference = "";
+  const char* date = "";
+  const char* commodity1 = "TXO";
+  const char* commodity2 = "TXO";
+  const char* month1 = "202401";
+  const char* month2 = "202402";
+  const char* strike1 = "17500";
+  const char* strike2 = "17600";
+  const char* callPut1 = "C";
+  const char* callPut2 = "P";
+  int n6 = 0;
+  int kind = 1;
+  int priceType = 2;
+  char function = 'I';
+  char w3 = '0';
+  char timeInForce = 'R';
+  char side1 = 'B';
+  char side2 = 'S';
+  int quantity = 3;
+  int price = 175000000;
 };
 
-TOrder OfKind(int kind, char function = 'I') {
-  TOrder order;
-  order.m_nKind = kind;
-  order.m_chFunction = function;
-  order.m_szReference = "A0001&B0002&C";
+Order OfKind(int kind, char function = 'I') {
+  Order order;
+  order.kind = kind;
+  order.function = function;
+  order.reference = "A0001&B0002&C";
   return order;
 }
 
@@ -53,33 +53,31 @@ class FuturesOrder : public CSessionTest {
     m_gateway.setLocalIP("10.0.0.1");
   }
 
-  /// The body or, when the order is refused, the message; the payload goes to m_payload.
-  std::string Record(const TOrder& o, bool inPlaces = false, const std::string& key = "KEY") {
+  // The body or, when the order is refused, the message; the payload goes to m_payload.
+  std::string Record(const Order& o, bool inPlaces = false, const std::string& key = "KEY") {
     const CRoomAtPageEnd body(CGatewayPub::kBufferSize, '\0');
     const CRoomAtPageEnd signature(CGatewayPub::kBufferSize, '\0');
     key.copy(signature, key.size());
     const auto method =
         inPlaces ? &CGatewayFut::EncodeSubmitOrderRecord1 : &CGatewayFut::EncodeSubmitOrderRecord;
     m_nReturned = (m_gateway.*method)(
-        o.m_szReference, o.m_szDate, o.m_szCommodity1, o.m_szCommodity2, o.m_szMonth1, o.m_szMonth2,
-        o.m_szStrike1, o.m_szStrike2, o.m_szCallPut1, o.m_szCallPut2, static_cast<char>(o.m_nN6),
-        static_cast<char>(o.m_nKind), static_cast<char>(o.m_nPriceType), o.m_chFunction, o.m_chW3,
-        o.m_chTimeInForce, 'x', o.m_chSide1, o.m_chSide2, o.m_nQuantity, 99, o.m_nPrice, body,
-        signature);
+        o.reference, o.date, o.commodity1, o.commodity2, o.month1, o.month2, o.strike1, o.strike2,
+        o.callPut1, o.callPut2, static_cast<char>(o.n6), static_cast<char>(o.kind),
+        static_cast<char>(o.priceType), o.function, o.w3, o.timeInForce, 'x', o.side1, o.side2,
+        o.quantity, 99, o.price, body, signature);
     m_payload = std::string(signature);
     return std::string(body);
   }
 
-  std::string Request(const TOrder& o, bool signedHead = false) {
+  std::string Request(const Order& o, bool signedHead = false) {
     const auto method =
         signedHead ? &CGatewayFut::SubmitOrderEncode1 : &CGatewayFut::SubmitOrderEncode;
     m_nStatus = 0;
     return (m_gateway.*method)(
-        m_branch.c_str(), m_identity.c_str(), "pw", o.m_szReference, o.m_szDate, o.m_szCommodity1,
-        o.m_szCommodity2, o.m_szMonth1, o.m_szMonth2, o.m_szStrike1, o.m_szStrike2, o.m_szCallPut1,
-        o.m_szCallPut2, static_cast<char>(o.m_nN6), static_cast<char>(o.m_nKind),
-        static_cast<char>(o.m_nPriceType), o.m_chFunction, o.m_chW3, o.m_chTimeInForce, 'x',
-        o.m_chSide1, o.m_chSide2, o.m_nQuantity, 99, o.m_nPrice, &m_nStatus);
+        m_branch.c_str(), m_identity.c_str(), "pw", o.reference, o.date, o.commodity1, o.commodity2,
+        o.month1, o.month2, o.strike1, o.strike2, o.callPut1, o.callPut2, static_cast<char>(o.n6),
+        static_cast<char>(o.kind), static_cast<char>(o.priceType), o.function, o.w3, o.timeInForce,
+        'x', o.side1, o.side2, o.quantity, 99, o.price, &m_nStatus);
   }
 
   CGatewayFut m_gateway;
@@ -111,7 +109,7 @@ TEST_F(FuturesOrder, ObjectStartsWithoutPositionsAndLogsAsItsBaseAlone) {
   gateway->AppendFutData("futures", 7, false);
   gateway->AppendOptData("options", 7, false);
   gateway->~CGatewayFut();
-  EXPECT_EQ(m_log.Take(), TLines{"~CGatewayPub"});
+  EXPECT_EQ(m_log.Take(), Lines{"~CGatewayPub"});
 }
 
 TEST_F(FuturesOrder, BodiesOfNewOrders) {
@@ -174,26 +172,26 @@ TEST_F(FuturesOrder, PayloadOfEveryCase) {
 }
 
 TEST_F(FuturesOrder, EveryKindNamesWhatItNeeds) {
-  using TText = const char* TOrder::*;
+  using Text = const char* Order::*;
   const struct {
     const char* name;
-    TText text;
+    Text text;
     bool neededBy[5];
   } rows[] = {
-      {"commodity 1", &TOrder::m_szCommodity1, {false, true, true, true, true}},
-      {"month 1", &TOrder::m_szMonth1, {false, true, true, true, true}},
-      {"strike 1", &TOrder::m_szStrike1, {false, false, true, true, false}},
-      {"call/put 1", &TOrder::m_szCallPut1, {false, false, true, true, false}},
-      {"commodity 2", &TOrder::m_szCommodity2, {false, false, false, true, true}},
-      {"month 2", &TOrder::m_szMonth2, {false, false, false, true, true}},
-      {"strike 2", &TOrder::m_szStrike2, {false, false, false, true, false}},
-      {"call/put 2", &TOrder::m_szCallPut2, {false, false, false, true, false}},
+      {"commodity 1", &Order::commodity1, {false, true, true, true, true}},
+      {"month 1", &Order::month1, {false, true, true, true, true}},
+      {"strike 1", &Order::strike1, {false, false, true, true, false}},
+      {"call/put 1", &Order::callPut1, {false, false, true, true, false}},
+      {"commodity 2", &Order::commodity2, {false, false, false, true, true}},
+      {"month 2", &Order::month2, {false, false, false, true, true}},
+      {"strike 2", &Order::strike2, {false, false, false, true, false}},
+      {"call/put 2", &Order::callPut2, {false, false, false, true, false}},
   };
   for (const auto& row : rows) {
     for (int kind = 1; kind <= 4; ++kind) {
       for (const char* missing : {"", static_cast<const char*>(nullptr)}) {
         for (const char function : {'I', 'D'}) {
-          TOrder order = OfKind(kind, function);
+          Order order = OfKind(kind, function);
           order.*row.text = missing;
           const std::string body = Record(order);
           EXPECT_EQ(m_nReturned, row.neededBy[kind] ? 0 : 1) << row.name << ", kind " << kind;
@@ -206,14 +204,14 @@ TEST_F(FuturesOrder, EveryKindNamesWhatItNeeds) {
 }
 
 TEST_F(FuturesOrder, KindOneWithEmptyStrikeAndCallPutPassesAndKindTwoDoesNot) {
-  TOrder order = OfKind(1);
-  order.m_szStrike1 = order.m_szCallPut1 = "";
+  Order order = OfKind(1);
+  order.strike1 = order.callPut1 = "";
   EXPECT_EQ(ValueOf(Record(order), "V6"), "");
   EXPECT_EQ(m_payload, "!!KEY_R_B_TXO_202401___3_17500.0000");
   Record(order, true);
   EXPECT_EQ(m_payload, "|PL=S!!KEY,R,0,2,B,TXO,202401,,,,,,,,3,17500.0000,");
   order = OfKind(2);
-  order.m_szCallPut1 = "";
+  order.callPut1 = "";
   EXPECT_EQ(Record(order), kParameterError);
 }
 
@@ -222,19 +220,19 @@ TEST_F(FuturesOrder, PieceThatANulEndsNeedsRoomForItsBeginningAlone) {
   const std::string huge(CGatewayPub::kBufferSize, 'h');
   for (const int kind : {2, 4}) {
     for (const char timeInForce : {'R', '\0'}) {
-      TOrder order = OfKind(kind);
-      order.m_szCommodity1 = order.m_szStrike1 = huge.c_str();
-      order.m_chSide1 = '\0';
-      order.m_chTimeInForce = timeInForce;
+      Order order = OfKind(kind);
+      order.commodity1 = order.strike1 = huge.c_str();
+      order.side1 = '\0';
+      order.timeInForce = timeInForce;
       const std::string body = Record(order);
       EXPECT_EQ(m_nReturned, 1) << kind;
       EXPECT_NE(body.find("|32=|O4="), std::string::npos) << kind;
       EXPECT_EQ(m_payload, timeInForce == 'R' ? "!!KEY_R_" : "!!KEY_");
     }
   }
-  TOrder order = OfKind(4);
-  order.m_szCommodity2 = huge.c_str();
-  order.m_chSide2 = '\0';
+  Order order = OfKind(4);
+  order.commodity2 = huge.c_str();
+  order.side2 = '\0';
   const std::string body = Record(order);
   EXPECT_EQ(m_nReturned, 1);
   EXPECT_NE(body.find("|EL=|W3="), std::string::npos);
@@ -249,8 +247,8 @@ TEST_F(FuturesOrder, KindsBesidesTheFourAreRefused) {
 
 TEST_F(FuturesOrder, PriceTypesOneAndThreeAreAtTheMarketAndAllAreSentUnsigned) {
   for (int type = -128; type <= 127; ++type) {
-    TOrder order = OfKind(1);
-    order.m_nPriceType = type;
+    Order order = OfKind(1);
+    order.priceType = type;
     const std::string body = Record(order, true);
     const bool market = type == 1 || type == 3;
     EXPECT_EQ(ValueOf(body, "31"), market ? "00000000.000000" : kAnyPrice) << type;
@@ -274,19 +272,19 @@ TEST_F(FuturesOrder, PricesAndQuantitiesAtTheirEnds) {
                 {10000, "1.0000"},
                 {INT_MAX, "214748.3647"}};
   for (const auto& row : prices) {
-    TOrder order = OfKind(1);
-    order.m_nPrice = row.price;
+    Order order = OfKind(1);
+    order.price = row.price;
     EXPECT_EQ(ValueOf(Record(order), "31"), row.text);
     EXPECT_EQ(m_payload, std::string("!!KEY_R_B_TXO_202401_17500_C_3_") + row.text);
   }
   for (const int quantity : {INT_MIN, -1, 0, 1, 99, 100, INT_MAX}) {
     const std::string printed = std::to_string(quantity);
-    TOrder order = OfKind(3);
-    order.m_nQuantity = quantity;
+    Order order = OfKind(3);
+    order.quantity = quantity;
     const std::string body = Record(order);
     EXPECT_EQ(ValueOf(body, "30"), printed);
     EXPECT_EQ(ValueOf(body, "EM"), printed);
-    order.m_chFunction = 'C';
+    order.function = 'C';
     EXPECT_EQ(ValueOf(Record(order), "37"), printed);
     EXPECT_EQ(m_payload, "!!KEY_A0001_" + printed);
   }
@@ -294,8 +292,8 @@ TEST_F(FuturesOrder, PricesAndQuantitiesAtTheirEnds) {
 
 TEST_F(FuturesOrder, TimeInForceSetsOneFlagAtMost) {
   for (int letter = 0; letter <= 255; ++letter) {
-    TOrder order = OfKind(1);
-    order.m_chTimeInForce = static_cast<char>(letter);
+    Order order = OfKind(1);
+    order.timeInForce = static_cast<char>(letter);
     const std::string body = Record(order);
     EXPECT_EQ(ValueOf(body, "O4"), letter == 'F' ? "1" : "0") << letter;
     EXPECT_EQ(ValueOf(body, "V5"), letter == 'I' ? "1" : "0") << letter;
@@ -328,26 +326,26 @@ TEST_F(FuturesOrder, CombinationCodes) {
       {"months equal in 16", 'B', 'S', "TXO", "TXO", sixteen + "1", sixteen + "2", "C", "C", "1"},
   };
   for (const auto& row : rows) {
-    TOrder order = OfKind(3);
-    order.m_chSide1 = row.side1;
-    order.m_chSide2 = row.side2;
-    order.m_szCommodity1 = row.commodity1.c_str();
-    order.m_szCommodity2 = row.commodity2.c_str();
-    order.m_szMonth1 = row.month1.c_str();
-    order.m_szMonth2 = row.month2.c_str();
-    order.m_szCallPut1 = row.callPut1.c_str();
-    order.m_szCallPut2 = row.callPut2.c_str();
+    Order order = OfKind(3);
+    order.side1 = row.side1;
+    order.side2 = row.side2;
+    order.commodity1 = row.commodity1.c_str();
+    order.commodity2 = row.commodity2.c_str();
+    order.month1 = row.month1.c_str();
+    order.month2 = row.month2.c_str();
+    order.callPut1 = row.callPut1.c_str();
+    order.callPut2 = row.callPut2.c_str();
     EXPECT_EQ(ValueOf(Record(order), "V6"), row.code) << row.name;
-    order.m_nKind = 4;
+    order.kind = 4;
     EXPECT_EQ(ValueOf(Record(order), "V6"), "7") << row.name;
-    order.m_nKind = 2;
+    order.kind = 2;
     EXPECT_EQ(ValueOf(Record(order), "V6"), "") << row.name;
   }
 }
 
 TEST_F(FuturesOrder, NulCharacterEndsItsOwnPieceAlone) {
-  TOrder order = OfKind(3);
-  order.m_chSide1 = '\0';
+  Order order = OfKind(3);
+  order.side1 = '\0';
   EXPECT_EQ(Record(order),
             "|27=2|28=0|29=202401|30=3|31=17500.0000|M8=|32=|O4=0|V5=0|V6=5|V8=C"
             "|EL=S|V9=TXO|W0=202402|W1=P|W2=17600|EM=3|W3=0");
@@ -356,24 +354,24 @@ TEST_F(FuturesOrder, NulCharacterEndsItsOwnPieceAlone) {
   EXPECT_EQ(m_payload, "|PL=S!!KEY,R,0,2,");
 
   order = OfKind(4);
-  order.m_chSide2 = '\0';
+  order.side2 = '\0';
   EXPECT_EQ(Record(order),
             "|27=2|28=0|29=202401|30=3|31=17500.0000|M8=|32=B|33=TXO|34=17500|O4=0|V5=0|V6=7|V8=C"
             "|EL=|W3=0");
   EXPECT_EQ(m_payload, "!!KEY_R_B_TXO_202401_17500_C_");
 
   order = OfKind(1);
-  order.m_chW3 = '\0';
+  order.w3 = '\0';
   EXPECT_EQ(ValueOf(Record(order, true), "W3"), "");
   EXPECT_EQ(m_payload, "|PL=S!!KEY,R,");
   Record(order);
   EXPECT_EQ(m_payload, "!!KEY_R_B_TXO_202401_17500_C_3_17500.0000");
 
   order = OfKind(1, 'A');
-  order.m_chTimeInForce = '\0';
+  order.timeInForce = '\0';
   Record(order, true);
   EXPECT_EQ(m_payload, "|PL=S!!KEY,");
-  order.m_chFunction = 'I';
+  order.function = 'I';
   Record(order);
   EXPECT_EQ(m_payload, "!!KEY_");
 }
@@ -399,8 +397,8 @@ TEST_F(FuturesOrder, ReferenceValuesOfOneTo47Characters) {
       {tooLong, "", ""},
   };
   for (const auto& row : rows) {
-    TOrder order = OfKind(1, 'D');
-    order.m_szReference = row.reference.c_str();
+    Order order = OfKind(1, 'D');
+    order.reference = row.reference.c_str();
     const std::string body = Record(order);
     EXPECT_EQ(ValueOf(body, "36"), row.first);
     EXPECT_EQ(ValueOf(body, "46"), row.second);
@@ -442,28 +440,28 @@ const std::string kBody =
     "|27=2|28=0|29=202401|30=3|31=17500.0000|M8=|32=B|33=TXO|34=17500|O4=0|V5=0|V6=|V8=C|W3=0";
 
 TEST_F(FuturesOrder, RequestIsHeaderBodyN6AndPayload) {
-  TOrder order = OfKind(2);
-  order.m_szDate = "1130116";
-  order.m_nN6 = -1;
+  Order order = OfKind(2);
+  order.date = "1130116";
+  order.n6 = -1;
   EXPECT_EQ(Request(order), kHead + "|44=20240116" + kBody +
                                 "|N6=255!!F008_1234567_A123456789_I_R_B_TXO_202401_17500_C_3_"
                                 "17500.0000");
   EXPECT_EQ(m_nStatus, 1);
   EXPECT_STREQ(m_gateway.m_szSignature,
                "!!F008_1234567_A123456789_I_R_B_TXO_202401_17500_C_3_17500.0000");
-  EXPECT_EQ(m_log.Take(), TLines{kHead + "|44=20240116"});
+  EXPECT_EQ(m_log.Take(), Lines{kHead + "|44=20240116"});
   EXPECT_EQ(Request(order, true),
             kHead + kBody +
                 "|N6=255|PL=S!!SN0001,10.0.0.1,20240115,F008-1234567,A123456789,I,R,0,2,B,TXO,"
                 "202401,17500,C,,,,,,3,17500.0000,");
   EXPECT_EQ(m_nStatus, 1);
-  EXPECT_EQ(m_log.Take(), TLines{kHead});
+  EXPECT_EQ(m_log.Take(), Lines{kHead});
 }
 
 TEST_F(FuturesOrder, N6IsSentUnsigned) {
   for (int n6 = -128; n6 <= 127; ++n6) {
-    TOrder order = OfKind(1);
-    order.m_nN6 = n6;
+    Order order = OfKind(1);
+    order.n6 = n6;
     const std::string request = Request(order, true);
     EXPECT_EQ(ValueOf(request, "N6"), std::to_string(n6 & 0xff));
   }
@@ -491,17 +489,17 @@ TEST_F(FuturesOrder, RefusedHeaderIsItsMessageAlone) {
 
 TEST_F(FuturesOrder, RequestOfTheBuffersSizeIsWholeAndALongerOneAParameterError) {
   for (const bool signedHead : {false, true}) {
-    TOrder order = OfKind(1);
+    Order order = OfKind(1);
     const std::string bare = Request(order, signedHead);
     // The commodity stands in the request twice.
     const size_t room = (CGatewayPub::kBufferSize - 1 - bare.size()) / 2;
     std::string commodity = "TXO" + std::string(room, 'X');
-    order.m_szCommodity1 = commodity.c_str();
+    order.commodity1 = commodity.c_str();
     const std::string longest = Request(order, signedHead);
     EXPECT_EQ(longest.size(), bare.size() + 2 * room);
     EXPECT_EQ(m_nStatus, 1);
     commodity += "X";
-    order.m_szCommodity1 = commodity.c_str();
+    order.commodity1 = commodity.c_str();
     EXPECT_EQ(Request(order, signedHead), kParameterError);
     EXPECT_EQ(m_nStatus, -1);
     for (const size_t size : {4096U, 65536U}) {

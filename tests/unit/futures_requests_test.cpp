@@ -63,7 +63,7 @@ TEST_F(FuturesRequest, OrderBookRequestWithoutADateFailsBehindItsHeader) {
   m_log.Take();
   EXPECT_EQ(Orders(""), "[CLIENT]日期輸入錯誤");
   EXPECT_EQ(m_nStatus, -1);
-  EXPECT_EQ(m_log.Take(), (TLines{"1234567", "", kHead}));
+  EXPECT_EQ(m_log.Take(), (Lines{"1234567", "", kHead}));
   EXPECT_EQ(Orders(nullptr), "[CLIENT]日期輸入錯誤");
   m_identity = "1234567";
   EXPECT_EQ(Orders(""), "[CLIENT] 身分證字號及帳號有誤！");
@@ -97,7 +97,7 @@ TEST_F(FuturesRequest, FillRequestNamesAllAndHasBothDates) {
       text = kept;
     }
   }
-  EXPECT_EQ(m_log.Take(), TLines{}) << "no header was begun";
+  EXPECT_EQ(m_log.Take(), Lines{}) << "no header was begun";
 }
 
 TEST_F(FuturesRequest, PositionRequestIsNotEscaped) {

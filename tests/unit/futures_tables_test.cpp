@@ -8,7 +8,7 @@
 namespace gateway_tests {
 namespace {
 
-struct TStateRow {
+struct StateRow {
   const char* name;
   OrderState state;
   const char* text;
@@ -16,7 +16,7 @@ struct TStateRow {
 
 constexpr char kSentOn[] = "委託已傳送，等待接收回報！";
 
-constexpr TStateRow kStates[] = {
+constexpr StateRow kStates[] = {
     {"failed, whatever else", {5, 5, 5, 'F', "E", "0", kSentOn, 3}, "委託失敗"},
     {"failed is one letter", {1, 0, 0, 'R', "EE", "1", "", 0}, "委託成功"},
     {"sent on", {5, 5, 0, 'R', "", "", kSentOn, 0}, "正在處理"},
@@ -46,7 +46,7 @@ constexpr TStateRow kStates[] = {
 };
 
 TEST(FuturesOrderState, EveryRow) {
-  for (const TStateRow& row : kStates) EXPECT_EQ(OrderStateText(row.state), row.text) << row.name;
+  for (const StateRow& row : kStates) EXPECT_EQ(OrderStateText(row.state), row.text) << row.name;
 }
 
 TEST(FuturesLegPairs, TableHasFourRowsAndTwoSides) {

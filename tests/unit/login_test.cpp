@@ -62,7 +62,7 @@ class Login : public CSessionTest {
   }
 
   int m_status = 0;
-  TLines m_lines;
+  Lines m_lines;
 };
 
 std::string Record(const std::string& fields) {
@@ -83,7 +83,7 @@ TEST_F(Login, RequestIsTheHeaderAndTheFunction) {
               kHead + "15=1|IDNO=A123456789|ACNO=1234567|PWD=pw|" + operation.function);
     EXPECT_EQ(Encode(operation, "&"), kHead + operation.function);
     EXPECT_EQ(m_status, 1);
-    EXPECT_EQ(m_lines, (TLines{"", ""}));
+    EXPECT_EQ(m_lines, (Lines{"", ""}));
   }
 }
 
@@ -116,10 +116,10 @@ TEST_F(Login, FailedTransportIsToldBeforeAnythingIsRead) {
     const std::string length = std::string(operation.name) + ": Len:";
     EXPECT_EQ(Decode(operation, ""), "[BROKER]主機連線失敗");
     EXPECT_EQ(m_status, -1);
-    EXPECT_EQ(m_lines, (TLines{length + "0", ""}));
+    EXPECT_EQ(m_lines, (Lines{length + "0", ""}));
     EXPECT_EQ(Decode(operation, "|68=0000|M2=[GATEWAY]error|"), "[GATEWAY]主機連線失敗");
     EXPECT_EQ(m_status, -1);
-    EXPECT_EQ(m_lines, (TLines{length + "27", "|68=0000|M2=[GATEWAY]error|"}));
+    EXPECT_EQ(m_lines, (Lines{length + "27", "|68=0000|M2=[GATEWAY]error|"}));
     EXPECT_EQ(Decode(operation, "[BROKER]timeout"), "[BROKER]主機連線失敗");
     EXPECT_EQ(m_status, -1);
   }
@@ -132,7 +132,7 @@ TEST_F(Login, NullReplyIsAnEmptyOne) {
     EXPECT_STREQ(std::invoke(operation.decode, gateway, nullptr, &m_status),
                  "[BROKER]主機連線失敗");
     EXPECT_EQ(m_status, -1);
-    EXPECT_EQ(m_log.Take(), (TLines{std::string(operation.name) + ": Len:0", ""}));
+    EXPECT_EQ(m_log.Take(), (Lines{std::string(operation.name) + ": Len:0", ""}));
   }
 }
 
@@ -166,9 +166,9 @@ TEST_F(Login, RefusalIsPassedOn) {
 
 TEST_F(Login, LoginAloneLogsTheCode) {
   EXPECT_EQ(Decode(kOperations[0], "|68=0012|M2=x|"), "x");
-  EXPECT_EQ(m_lines, (TLines{"AuthDecode: Len:14", "|68=0012|M2=x|", "[strResult]0012"}));
+  EXPECT_EQ(m_lines, (Lines{"AuthDecode: Len:14", "|68=0012|M2=x|", "[strResult]0012"}));
   EXPECT_EQ(Decode(kOperations[1], "|68=0012|M2=x|"), "x");
-  EXPECT_EQ(m_lines, (TLines{"GetTotalAccountDecode: Len:14", "|68=0012|M2=x|"}));
+  EXPECT_EQ(m_lines, (Lines{"GetTotalAccountDecode: Len:14", "|68=0012|M2=x|"}));
   Decode(kOperations[0], "|68=00000000000000000000|");
   EXPECT_EQ(m_lines.back(), "[strResult]");
   Decode(kOperations[0], "|68=0000|");
@@ -265,10 +265,10 @@ TEST_F(Login, NoticeCountsAsOneMoreRecordOfALogin) {
   const std::string reply = "|68=0000|M3=維護公告|" + kOne.substr(1) + kTwo;
   EXPECT_EQ(Decode(kOperations[0], reply), "3!<a>@@@@!<b>@@@@!<M>@維護公告!");
   EXPECT_EQ(m_status, 1);
-  EXPECT_EQ(m_lines, (TLines{"AuthDecode: Len:" + std::to_string(reply.size()), reply,
-                             "[strResult]0000", "[strResult2]維護公告", "[status]1"}));
+  EXPECT_EQ(m_lines, (Lines{"AuthDecode: Len:" + std::to_string(reply.size()), reply,
+                            "[strResult]0000", "[strResult2]維護公告", "[status]1"}));
   EXPECT_EQ(Decode(kOperations[1], reply), "2!<a>@@@@!<b>@@@@!");
-  EXPECT_EQ(m_lines, (TLines{"GetTotalAccountDecode: Len:" + std::to_string(reply.size()), reply}));
+  EXPECT_EQ(m_lines, (Lines{"GetTotalAccountDecode: Len:" + std::to_string(reply.size()), reply}));
 }
 
 TEST_F(Login, NoticeIsShownOnlyBehindAnAccount) {

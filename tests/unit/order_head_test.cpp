@@ -65,7 +65,7 @@ class OrderHead : public CSessionTest {
 
   CGatewayPub m_gateway;
   std::string m_text, m_key;
-  TLines m_lines;
+  Lines m_lines;
 };
 
 TEST_F(OrderHead, VariantsHaveTheirFieldsInOrder) {
@@ -73,7 +73,7 @@ TEST_F(OrderHead, VariantsHaveTheirFieldsInOrder) {
     EXPECT_EQ(Write(variant, "A123456789&1234567"), 1);
     EXPECT_EQ(m_text,
               kHeads[variant] + "|15=0|IDNO=A123456789|ACNO=1234567|PWD=pw" + kTails[variant]);
-    EXPECT_EQ(m_lines, TLines{m_text}) << variant;
+    EXPECT_EQ(m_lines, Lines{m_text}) << variant;
   }
 }
 
@@ -110,11 +110,11 @@ TEST_F(OrderHead, IdentityBlockIsChosenByTheLengthsOfItsParts) {
         if (block == "fails") {
           EXPECT_EQ(result, 0) << label;
           EXPECT_EQ(m_text, kLengths) << label;
-          EXPECT_EQ(m_lines, TLines{}) << label;
+          EXPECT_EQ(m_lines, Lines{}) << label;
         } else {
           EXPECT_EQ(result, 1) << label;
           EXPECT_EQ(m_text, kHeads[variant] + block + kTails[variant]) << label;
-          EXPECT_EQ(m_lines, TLines{m_text}) << label;
+          EXPECT_EQ(m_lines, Lines{m_text}) << label;
         }
       }
     }
@@ -175,7 +175,7 @@ TEST_F(OrderHead, UnusableIdentityFails) {
     for (int variant : {0, 1, 2}) {
       EXPECT_EQ(Write(variant, identity), 0) << identity;
       EXPECT_EQ(m_text, kLengths) << identity;
-      EXPECT_EQ(m_lines, TLines{}) << identity;
+      EXPECT_EQ(m_lines, Lines{}) << identity;
     }
   }
   OrderArguments null;
@@ -196,7 +196,7 @@ TEST_F(OrderHead, WithoutAnAddressTheVariantsThatSendItFail) {
     m_gateway.m_nSeqNo = 123;
     EXPECT_EQ(Write(variant, "X&X"), 0);
     EXPECT_EQ(m_text, kNoAddress);
-    EXPECT_EQ(m_lines, TLines{});
+    EXPECT_EQ(m_lines, Lines{});
     EXPECT_EQ(m_gateway.m_nSeqNo, 23);
   }
   m_gateway.m_nSeqNo = 7;
@@ -323,12 +323,12 @@ TEST_F(OrderHead, HeaderThatFillsTheBufferIsWholeAndOneCharacterMoreFails) {
     arguments.password = longest.c_str();
     EXPECT_EQ(Write(variant, arguments), 1);
     EXPECT_EQ(m_text.size(), CGatewayPub::kBufferSize - 1);
-    EXPECT_EQ(m_lines, TLines{m_text});
+    EXPECT_EQ(m_lines, Lines{m_text});
     const std::string over = longest + "p";
     arguments.password = over.c_str();
     EXPECT_EQ(Write(variant, arguments), 0);
     EXPECT_EQ(m_text, kTooLong);
-    EXPECT_EQ(m_lines, TLines{});
+    EXPECT_EQ(m_lines, Lines{});
   }
 }
 

@@ -49,13 +49,13 @@ class QueryHead : public CSessionTest {
 
   CGatewayPub m_gateway;
   std::string m_text;
-  TLines m_lines;
+  Lines m_lines;
 };
 
 TEST_F(QueryHead, HasItsFieldsInOrder) {
   EXPECT_EQ(Write("1234567&"), 1);
   EXPECT_EQ(m_text, kHead + "15=0|ACNO=1234567|PWD=pw|");
-  EXPECT_EQ(m_lines, (TLines{"1234567", "", m_text}));
+  EXPECT_EQ(m_lines, (Lines{"1234567", "", m_text}));
 }
 
 TEST_F(QueryHead, GoesOnBehindWhatTheBufferHolds) {
@@ -192,7 +192,7 @@ TEST_F(QueryHead, IdentityBlockIsChosenByTheLengthsOfItsParts) {
       const std::string second(length2 < 40 ? length2 : 0, 'b');
       const std::string block = ExpectedBlock(first.size(), second.size());
       const int result = Write(std::string(length1, 'a') + "&" + std::string(length2, 'b'));
-      TLines lines = {first, second};
+      Lines lines = {first, second};
       if (block == "fails") {
         EXPECT_EQ(result, 0) << label;
         EXPECT_EQ(m_text, kLengths) << label;
@@ -247,33 +247,33 @@ TEST_F(QueryHead, IdentityWithoutAnAmpersandFails) {
   for (const char* identity : {"12345", "A123456789", " ", "1"}) {
     EXPECT_EQ(Write(identity), 0);
     EXPECT_EQ(m_text, kUnsplit) << identity;
-    EXPECT_EQ(m_lines, TLines{}) << identity;
+    EXPECT_EQ(m_lines, Lines{}) << identity;
   }
 }
 
 TEST_F(QueryHead, SecondPartOf9CharactersIsNoIdNumber) {
   EXPECT_EQ(Write("X&A12345678"), 0);
   EXPECT_EQ(m_text, kLengths);
-  EXPECT_EQ(m_lines, (TLines{"X", "A12345678"}));
+  EXPECT_EQ(m_lines, (Lines{"X", "A12345678"}));
 }
 
 TEST_F(QueryHead, LoneAmpersandGivesAHeaderThatIsNotLogged) {
   EXPECT_EQ(Write("&"), 1);
   EXPECT_EQ(m_text, kHead);
-  EXPECT_EQ(m_lines, (TLines{"", ""}));
+  EXPECT_EQ(m_lines, (Lines{"", ""}));
 }
 
 TEST_F(QueryHead, EmptyFirstPartEndsTheHeaderWhateverTheSecond) {
   EXPECT_EQ(Write("&A123456789"), 1);
   EXPECT_EQ(m_text, kHead);
-  EXPECT_EQ(m_lines, (TLines{"", "A123456789"}));
+  EXPECT_EQ(m_lines, (Lines{"", "A123456789"}));
 }
 
 TEST_F(QueryHead, EmptyOrNullIdentityIsNotSplit) {
   for (const char* identity : {"", static_cast<const char*>(nullptr)}) {
     EXPECT_EQ(Write(identity), 1);
     EXPECT_EQ(m_text, kHead);
-    EXPECT_EQ(m_lines, (TLines{"", ""}));
+    EXPECT_EQ(m_lines, (Lines{"", ""}));
   }
 }
 
@@ -290,7 +290,7 @@ TEST_F(QueryHead, WithoutAnAddressItFailsBehindTheIdentityLines) {
   m_gateway.setLocalIP("");
   EXPECT_EQ(Write("A123456789&1234567"), 0);
   EXPECT_EQ(m_text, kNoAddress);
-  EXPECT_EQ(m_lines, (TLines{"A123456789", "1234567"}));
+  EXPECT_EQ(m_lines, (Lines{"A123456789", "1234567"}));
 }
 
 TEST_F(QueryHead, SplitIsJudgedBeforeTheAddressAndTheLengthsAfterIt) {

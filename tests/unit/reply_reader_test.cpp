@@ -66,7 +66,7 @@ std::string TagOfFullTable(int row) {
 // the table lists it.
 TagKey KeyOf(const std::string& field) {
   const std::string reply = "|" + field;
-  const CGuardedBlock block(EPlacement::kBeforeUnreadable, reply.data(), reply.size());
+  const CGuardedBlock block(Placement::kBeforeUnreadable, reply.data(), reply.size());
   const CTagReader tags(block.Data(), block.Data() + reply.size());
   const TagKey key = tags.KeyBehind(block.Data());
   const TagKey shortKey = tags.ShortKeyBehind(block.Data());

@@ -156,7 +156,7 @@ TEST_F(ReplyTokens, GetSubStringWalksAReplyToItsEnd) {
     m_gateway.GetSubString(reply.c_str(), position, record, sizeof record);
     records.emplace_back(record);
   }
-  EXPECT_EQ(records, (TLines{"|00=a", "|00=b", "", "|00=c", ""}));
+  EXPECT_EQ(records, (Lines{"|00=a", "|00=b", "", "|00=c", ""}));
   EXPECT_EQ(static_cast<size_t>(position), reply.size());
 }
 
@@ -246,13 +246,13 @@ TEST_F(ReplyTokens, GetFieldStringWithoutABufferMovesOnlyPastASeparator) {
 TEST_F(ReplyTokens, GetFieldStringWalksATextToItsEnd) {
   char text[] = "a&&c";
   char* cursor = text;
-  TLines fields;
+  Lines fields;
   for (int field = 0; field < 4; ++field) {
     char out[8] = "";
     m_gateway.GetFieldString(&cursor, "&", out, sizeof out);
     fields.emplace_back(out);
   }
-  EXPECT_EQ(fields, (TLines{"a", "", "c", ""}));
+  EXPECT_EQ(fields, (Lines{"a", "", "c", ""}));
 }
 
 const std::string kGatewayDown = "[GATEWAY]主機連線失敗";
@@ -301,7 +301,7 @@ TEST_F(ReplyTokens, CheckErrorTellsAFailedTransport) {
     EXPECT_EQ(message.Bytes(), bytes) << label;
     EXPECT_EQ(status, row.message == nullptr ? 77 : -1) << label;
   }
-  EXPECT_EQ(m_log.Take(), TLines{});
+  EXPECT_EQ(m_log.Take(), Lines{});
 }
 
 TEST_F(ReplyTokens, CheckErrorTakesAnyMessageBuffer) {

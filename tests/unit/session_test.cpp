@@ -53,9 +53,9 @@ TEST_F(SessionObject, StartsZeroedAndLogsNothing) {
   EXPECT_EQ(gateway->m_nSeqNo, 0);
   EXPECT_EQ(std::string(gateway->m_szSerialNo, 20), std::string(20, '\0'));
   EXPECT_EQ(std::string(gateway->m_szLocalIP, 64), std::string(64, '\0'));
-  EXPECT_EQ(m_log.Take(), TLines{});
+  EXPECT_EQ(m_log.Take(), Lines{});
   gateway->~CGatewayPub();
-  EXPECT_EQ(m_log.Take(), TLines{"~CGatewayPub"});
+  EXPECT_EQ(m_log.Take(), Lines{"~CGatewayPub"});
 }
 
 TEST_F(SessionObject, BothLogFunctionsWriteTheSameLine) {
@@ -64,14 +64,14 @@ TEST_F(SessionObject, BothLogFunctionsWriteTheSameLine) {
   debuglog("free");
   debuglog("");
   gateway.debuglog("");
-  EXPECT_EQ(m_log.Take(), (TLines{"member", "free", "", ""}));
+  EXPECT_EQ(m_log.Take(), (Lines{"member", "free", "", ""}));
 }
 
 TEST_F(SessionObject, NullTextIsLoggedAsAnEmptyLine) {
   CGatewayPub gateway;
   gateway.debuglog(nullptr);
   debuglog(nullptr);
-  EXPECT_EQ(m_log.Take(), (TLines{"", ""}));
+  EXPECT_EQ(m_log.Take(), (Lines{"", ""}));
 }
 
 struct FieldCase {

@@ -16,15 +16,15 @@ const std::string kKindError = "[CLIENT] 委託種類錯誤";
 const std::string kDateError = "[CLIENT] 日期輸入錯誤";
 const std::string kSent = "委託已傳送，等待接收回報！";
 
-using TFields = std::map<std::string, std::string>;
+using Fields = std::map<std::string, std::string>;
 
-std::string Record(const TFields& fields) {
+std::string Record(const Fields& fields) {
   std::string record = "|00=";
   for (const auto& [tag, value] : fields) record += "|" + tag + "=" + value;
   return record + "|01=";
 }
 
-TFields With(TFields fields, const std::string& tag, const std::string& value) {
+Fields With(Fields fields, const std::string& tag, const std::string& value) {
   fields[tag] = value;
   return fields;
 }
@@ -63,7 +63,7 @@ class StockLists : public CSessionTest {
   }
 
   // One field of the only record, by position.
-  static std::string BookField(const TFields& fields, size_t position, int market = 0) {
+  static std::string BookField(const Fields& fields, size_t position, int market = 0) {
     const Answer answer = ReadBook(Record(fields) + kEnd, market);
     EXPECT_EQ(answer.status, 1) << answer.text;
     EXPECT_EQ(answer.text.substr(0, 2), "1!");
@@ -73,12 +73,12 @@ class StockLists : public CSessionTest {
   }
 };
 
-const TFields kOrder = {{"67", "1"}, {"68", "0000"},   {"46", "G0002"},    {"36", "W0001"},
-                        {"27", "0"}, {"28", "0"},      {"32", "B"},        {"29", "2330"},
-                        {"70", "5"}, {"41", "1"},      {"37", "1"},        {"47", "3"},
-                        {"39", " "}, {"K1", ""},       {"N6", "1"},        {"31", "10.05"},
-                        {"M8", "0"}, {"22", "134521"}, {"21", "20240115"}, {"44", "1130116"},
-                        {"JV", "Y"}};
+const Fields kOrder = {{"67", "1"}, {"68", "0000"},   {"46", "G0002"},    {"36", "W0001"},
+                       {"27", "0"}, {"28", "0"},      {"32", "B"},        {"29", "2330"},
+                       {"70", "5"}, {"41", "1"},      {"37", "1"},        {"47", "3"},
+                       {"39", " "}, {"K1", ""},       {"N6", "1"},        {"31", "10.05"},
+                       {"M8", "0"}, {"22", "134521"}, {"21", "20240115"}, {"44", "1130116"},
+                       {"JV", "Y"}};
 
 TEST_F(StockLists, OrderHasItsFourteenFields) {
   EXPECT_EQ(ReadBook(Record(kOrder) + kEnd),
@@ -94,9 +94,9 @@ TEST_F(StockLists, OrderOfMissingFieldsCarriesNothingOver) {
                     1}));
 }
 
-const TFields kFill = {{"67", "1"},    {"68", "0000"},  {"36", "W0001"},    {"27", "0"},
-                       {"28", "0"},    {"32", "S"},     {"29", "2330"},     {"47", "3000"},
-                       {"48", "10.5"}, {"49", "31500"}, {"50", "20240115"}, {"51", "134521123"}};
+const Fields kFill = {{"67", "1"},    {"68", "0000"},  {"36", "W0001"},    {"27", "0"},
+                      {"28", "0"},    {"32", "S"},     {"29", "2330"},     {"47", "3000"},
+                      {"48", "10.5"}, {"49", "31500"}, {"50", "20240115"}, {"51", "134521123"}};
 
 TEST_F(StockLists, FillHasItsEightFields) {
   EXPECT_EQ(ReadFills(Record(kFill) + kEnd),
@@ -190,10 +190,10 @@ TEST_F(StockLists, OneOrderWithoutACodeFailsTheWholeList) {
 TEST_F(StockLists, BookLogsTheReplyAndFillsDoNot) {
   m_log.Take();
   ReadBook(kEnd);
-  EXPECT_EQ(m_log.Take(), (TLines{"QueryOrderDecode: Len:" + std::to_string(kEnd.size()), kEnd,
-                                  "~CGatewayStk", "~CGatewayPub"}));
+  EXPECT_EQ(m_log.Take(), (Lines{"QueryOrderDecode: Len:" + std::to_string(kEnd.size()), kEnd,
+                                 "~CGatewayStk", "~CGatewayPub"}));
   ReadFills(kEnd);
-  EXPECT_EQ(m_log.Take(), (TLines{"~CGatewayStk", "~CGatewayPub"}));
+  EXPECT_EQ(m_log.Take(), (Lines{"~CGatewayStk", "~CGatewayPub"}));
 }
 
 // Order-type codes: buy and other side, 0 where the cell is open. Trade types -1 to 4 and beyond.
@@ -227,7 +227,7 @@ TEST_F(StockLists, EveryOrderTypeHasItsCode) {
         const int live = buys ? buy : other;
         const bool inBookAlone = kind == 6 || kind == 7;
         const int book = inBookAlone ? kind + 24 : live;
-        const auto fields = [&](const TFields& base) {
+        const auto fields = [&](const Fields& base) {
           return With(With(With(base, "27", std::to_string(kind)), "28", std::to_string(tradeType)),
                       "32", side);
         };
@@ -290,7 +290,7 @@ TEST_F(StockLists, StateOfAnOrder) {
       {"WAIT that did not fail", "5", "5", "0", "0", "WAIT ", "1", 8, "已成交"},
   };
   for (const StateCase& row : rows) {
-    TFields fields = kOrder;
+    Fields fields = kOrder;
     fields["70"] = row.ordered;
     fields["47"] = row.filled;
     fields["41"] = row.tag41;
@@ -325,9 +325,9 @@ TEST_F(StockLists, FailedOrder) {
       {"WAIT without its blank", "WAIT", 8, "委託失敗&WAIT", "2"},
       {"no text on market 8", "", 8, "", ""},
   };
-  TFields small = {{"68", "0000"}, {"39", "E"}};
+  Fields small = {{"68", "0000"}, {"39", "E"}};
   for (const FailureCase& row : rows) {
-    const TFields fields = With(small, "K1", row.text);
+    const Fields fields = With(small, "K1", row.text);
     EXPECT_EQ(BookField(fields, 5, row.market), row.state) << row.label;
     EXPECT_EQ(BookField(fields, 13, row.market), row.flag) << row.label;
     EXPECT_EQ(BookField(With(fields, "JV", "Y"), 13, row.market), "1") << row.label;
@@ -337,7 +337,7 @@ TEST_F(StockLists, FailedOrder) {
 
 TEST_F(StockLists, ChangeFlagOfAnOrderThatDidNotFail) {
   for (const auto& [flag, shown] :
-       TFields{{"Y", "1"}, {"N", "2"}, {"", ""}, {"y", ""}, {"YY", ""}}) {
+       Fields{{"Y", "1"}, {"N", "2"}, {"", ""}, {"y", ""}, {"YY", ""}}) {
     for (const char* remark : {"", "委託成功", "全部取消", "!"}) {
       EXPECT_EQ(BookField(With(With(kOrder, "JV", flag), "K1", remark), 13), shown)
           << flag << remark;
@@ -377,7 +377,7 @@ TEST_F(StockLists, PriceOfAnOrder) {
 
 TEST_F(StockLists, ValueTooLongForItsBufferReadsAsEmpty) {
   const std::string fits(49, 'v'), tooLong(50, 'v');
-  TFields fields = {{"68", "0000"}};
+  Fields fields = {{"68", "0000"}};
   for (const auto& [tag, position] : std::map<std::string, size_t>{
            {"46", 0}, {"36", 1}, {"29", 3}, {"21", 10}, {"44", 11}, {"N6", 12}}) {
     EXPECT_EQ(BookField(With(fields, tag, fits), position), fits) << tag;
@@ -454,9 +454,9 @@ TEST_F(StockListRequests, HeaderFailureComesFirst) {
 TEST_F(StockListRequests, HeaderIsLoggedBeforeItIsEscaped) {
   m_log.Take();
   AskBook("20240115", 0);
-  EXPECT_EQ(m_log.Take(), (TLines{"1234567", "", kHead}));
+  EXPECT_EQ(m_log.Take(), (Lines{"1234567", "", kHead}));
   AskFills("1130101", "1130115");
-  EXPECT_EQ(m_log.Take(), (TLines{"1234567", "", kHead}));
+  EXPECT_EQ(m_log.Take(), (Lines{"1234567", "", kHead}));
 }
 
 TEST_F(StockListRequests, RequestThatDoesNotFitWithItsEscapesIsRefused) {

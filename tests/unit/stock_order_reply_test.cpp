@@ -34,7 +34,7 @@ class StockOrderReplies : public CSessionTest {
     int status = 77;
     m_log.Take();
     const char* const text = std::invoke(method, gateway, CTextAtPageEnd(reply), &status);
-    EXPECT_EQ(m_log.Take(), TLines{});
+    EXPECT_EQ(m_log.Take(), Lines{});
     return {text, status};
   }
 

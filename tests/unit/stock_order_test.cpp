@@ -480,7 +480,7 @@ TEST_F(StockOrders, HeaderIsLoggedAndNothingElse) {
   m_log.Take();
   for (Form form : kForms) {
     Send(form, Order());
-    EXPECT_EQ(m_log.Take(), TLines{HeadOf(form)});
+    EXPECT_EQ(m_log.Take(), Lines{HeadOf(form)});
   }
 }
 
@@ -525,7 +525,7 @@ TEST_F(BriefOrder, IsNeverCut) {
 TEST_F(StockOrders, ObjectLogsBothNamesWhenItGoes) {
   m_log.Take();
   { const CGatewayStk gateway; }
-  EXPECT_EQ(m_log.Take(), (TLines{"~CGatewayStk", "~CGatewayPub"}));
+  EXPECT_EQ(m_log.Take(), (Lines{"~CGatewayStk", "~CGatewayPub"}));
 }
 
 }  // namespace

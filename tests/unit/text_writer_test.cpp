@@ -218,7 +218,7 @@ TEST(TextWriter, PiecesTogetherAreAsPiecesOneByOne) {
 TEST(TextWriter, PaddedTextsOfEveryLengthAreCopied) {
   const std::string letters = "abcdefghijklmnopqrstuvwxyz0123456789ABCDEFGHIJ";
   for (size_t length = 0; length <= 40; ++length) {
-    const CGuardedBlock source(EPlacement::kBeforeUnreadable, letters.data(),
+    const CGuardedBlock source(Placement::kBeforeUnreadable, letters.data(),
                                std::max(length, PaddedText::kReadable));
     for (size_t size : {length + 3, length + PaddedText::kReadable + 4}) {
       Line line(size);
@@ -239,7 +239,7 @@ TEST(TextWriter, BytesArePrintedAsNumbers) {
 // Neither end of either side is passed.
 TEST(TextWriter, CopiesTouchNothingElse) {
   const std::string letters = "abcdefghijklmnopqrstuvwxyz0123456789ABCDEFGHIJ";
-  for (const EPlacement placement : {EPlacement::kBeforeUnreadable, EPlacement::kAfterUnreadable}) {
+  for (const Placement placement : {Placement::kBeforeUnreadable, Placement::kAfterUnreadable}) {
     for (size_t size = 1; size <= 40; ++size) {
       const CGuardedBlock from(placement, letters.data(), size);
       const CGuardedBlock to(placement, std::string(size, '#').data(), size);
@@ -265,7 +265,7 @@ TEST(TextWriter, TextsOfEveryLengthAreCopied) {
   for (size_t i = 0; i < 100; ++i) letters += static_cast<char>('!' + i % 90);
   for (size_t length = 0; length <= 100; ++length) {
     const std::string text = letters.substr(0, length);
-    const CGuardedBlock source(EPlacement::kBeforeUnreadable, text.data(), length);
+    const CGuardedBlock source(Placement::kBeforeUnreadable, text.data(), length);
     Line line(length + 3);
     line.writer.Append(WIRE("<%s>"), std::string_view(source.Data(), length));
     EXPECT_EQ(line.writer.Text(), "<" + text + ">");

@@ -16,7 +16,7 @@ thread_local bool t_bActive = false;
 thread_local std::time_t t_tClock = 0;
 thread_local std::vector<std::string> t_LogLines;
 
-/// A Java String[] of modified UTF-8 texts; null when the machine ran out of memory.
+// A Java String[] of modified UTF-8 texts; null when the machine ran out of memory.
 jobjectArray MakeArray(JNIEnv* env, const std::vector<std::string>& texts) {
   jclass string = env->FindClass("java/lang/String");
   if (string == nullptr) return nullptr;
@@ -75,7 +75,7 @@ JNIEXPORT jobjectArray JNICALL
 Java_com_brindlex_kernel_quorvane_Surroundings_nativeMethods(JNIEnv* env, jclass) {
   std::vector<std::string> methods;
   for (const auto& row : gateway_tests::AllExports()) {
-    methods.push_back(std::string(row.m_szName) + row.Descriptor());
+    methods.push_back(std::string(row.name) + row.Descriptor());
   }
   return MakeArray(env, methods);
 }
