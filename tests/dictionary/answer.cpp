@@ -1,7 +1,8 @@
 // dictionary_answers: answers calls of the native methods, one a line of standard input:
 //
-//   AuthEncode<tab>0<tab>0<tab>7<tab>SN0001...     arguments in Java order, without the status array
-//   1<tab>F=7|KIND=S...<tab>first log line<tab>... status ("none" without one), result, log lines
+//   AuthEncode<tab>0<tab>0<tab>7<tab>SN0001...     arguments in Java order, without the status
+//   array 1<tab>F=7|KIND=S...<tab>first log line<tab>... status ("none" without one), result, log
+//   lines
 //
 // `\t`, `\n`, `\r` and `\\` stand for the characters. The clock stands at 2024-01-15 13:45:21.
 
@@ -33,7 +34,7 @@ std::string Escape(std::string_view text) {
   return escaped;
 }
 
-/// The fields of a line, unescaped.
+// The fields of a line, unescaped.
 std::vector<std::string> Fields(std::string_view line) {
   std::vector<std::string> fields(1);
   for (size_t i = 0; i < line.size(); ++i) {
@@ -48,24 +49,24 @@ std::vector<std::string> Fields(std::string_view line) {
   return fields;
 }
 
-/// One line's answer; empty when the line is no call.
+// One line's answer; empty when the line is no call.
 std::string Answer(const std::vector<std::string>& fields) {
-  const TExport* row = FindExport(fields.front());
+  const Export* row = FindExport(fields.front());
   const size_t status = row != nullptr && row->HasStatus() ? 1 : 0;
-  if (row == nullptr || fields.size() != row->m_szShape.size() - status + 1) return {};
-  TArguments arguments;
+  if (row == nullptr || fields.size() != row->shape.size() - status + 1) return {};
+  Arguments arguments;
   for (size_t i = 1; i < fields.size(); ++i) {
-    const char letter = row->m_szShape[i - 1];
+    const char letter = row->shape[i - 1];
     const bool text = letter == 'S';
-    arguments.push_back(text ? TArgument::Text(fields[i])
-                             : TArgument{letter, std::atoll(fields[i].c_str()), std::nullopt});
+    arguments.push_back(text ? Argument::Text(fields[i])
+                             : Argument{letter, std::atoll(fields[i].c_str()), std::nullopt});
   }
   CRecordingHost host;
-  const TOutcome outcome = host.Call(*row, arguments);
-  if (!outcome.m_Violations.empty()) return {};
-  std::string line = outcome.m_Status.has_value() ? std::to_string(*outcome.m_Status) : "none";
-  line += "\t" + Escape(outcome.m_Result.value_or(""));
-  for (const std::string& text : outcome.m_LogLines) line += "\t" + Escape(text);
+  const Outcome outcome = host.Call(*row, arguments);
+  if (!outcome.violations.empty()) return {};
+  std::string line = outcome.status.has_value() ? std::to_string(*outcome.status) : "none";
+  line += "\t" + Escape(outcome.result.value_or(""));
+  for (const std::string& text : outcome.logLines) line += "\t" + Escape(text);
   return line;
 }
 
