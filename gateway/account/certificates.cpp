@@ -11,9 +11,11 @@
 
 namespace {
 
-enum Field { kCode, kText };
+enum Field { kResultCode, kMessage };
 
-constexpr CTagTable kTags({{"68"}, {"M2"}});
+// The message is the certificate, or says why there is none.
+constexpr TagRow kRows[] = {{kResultCode, "68", 20}, {kMessage, "M2", kUnbounded}};
+constexpr CTagTable kTags(kRows);
 
 // The step lines of one request, which those who read the log go by; null where it has none.
 struct CertSteps {
@@ -190,13 +192,12 @@ char* CGatewayPub::DecodeCert(const char* label, const char* reply, int* status)
   LogReply(label, text);
   *status = 1;
   if (TransportFailed(text, status)) return m_szBuffer;
-  const size_t bound = text.size() + 20;
   CRecord record(kTags);
-  CRecordWalker walker(text, bound);
+  CRecordWalker walker(text, kUnbounded);
   walker.Next(record);
-  const std::string_view code = record.Text(kCode, 20);
-  const std::string_view answer = record.Text(kText, bound);
-  const bool accepted = code == "0000";
+  const std::string_view code = record.Text(kResultCode);
+  const std::string_view answer = record.Text(kMessage);
+  const bool accepted = code == kDoneCode;
   const size_t length = answer.size() + (accepted ? 0 : strlen("[CERT] ") + code.size());
   char* const room = RenewResult(length, status);
   if (room == nullptr) return nullptr;

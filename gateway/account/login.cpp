@@ -1,37 +1,49 @@
 // Login, and the list of the user's accounts. Both replies carry the same account records:
 //
 //   reply    |68=code|M2=refusal|M3=notice  record*
-//   record   |00=...|67=sequence|68=code|07=type|M5=..|16=..|17=branch part|18=account
-//   part|69=name|01= result   count ! ( <07>@M5@account@16@69! )*  [ <M>@notice! ]      the notice:
-//   login alone
+//   record   |00=..|67=sequence|68=code|07=..|M5=..|16=..|17=account, head|18=account, tail
+//            |69=..|01=
+//   result   count ! ( <07>@M5@account@16@69! )*  [ <M>@notice! ]     the notice: login alone
 //
 // A refusal's message is shown as the gateway sent it, without a source or code.
 #include "gateway/core/gateway_pub.h"
+#include "gateway/core/list_frame.h"
 #include "gateway/core/log.h"
 #include "gateway/core/messages.h"
 
 namespace {
 
+// Of the whole reply.
+constexpr ReplyField kReplyCode = {"68", 20};
+constexpr ReplyField kRefusal = {"M2", CGatewayPub::kBufferSize};
+constexpr ReplyField kNotice = {"M3", 300};
+
+// Of a record. Of the fields that are named by their tags no more is known than where the result
+// shows them.
+enum Field {
+  kAccountField07 = kOwnFields,
+  kAccountFieldM5,
+  kAccountField16,
+  kAccountHead,
+  kAccountTail,
+  kAccountField69
+};
+
+constexpr TagRow kRows[] = {{kSequence, "67", 20},
+                            {kResultCode, "68", 20},
+                            {kMessage, "M2", kNotRead},
+                            {kAccountField07, "07", 10},
+                            {kAccountFieldM5, "M5", 20},
+                            {kAccountField16, "16", 20},
+                            {kAccountHead, "17", 10, Blanks::kSkipped},
+                            {kAccountTail, "18", 10, Blanks::kSkipped},
+                            {kAccountField69, "69", 20}};
+
 // The end mark is above 900000 here, and a record without content ends the list too.
-constexpr ListShape kShape = {200, 20, 20, 0, true, 900001};
-
-constexpr size_t kNoticeSize = 300;
-
-enum Field { kType = kOwnFields, kM5, kField16, kAccountHead, kAccountTail, kName };
-
-constexpr CTagTable kTags({{"67"},
-                           {"68"},
-                           {"M2"},
-                           {"07"},
-                           {"M5"},
-                           {"16"},
-                           {"17", Blanks::kSkipped},
-                           {"18", Blanks::kSkipped},
-                           {"69"}});
-static_assert(OpensListTable(kTags), "the list frame reads its rows");
+constexpr CListTable kTags(kRows, {200, true, 900001});
 
 void LogText(const char* label, std::string_view text) {
-  char scratch[kNoticeSize + 20];
+  char scratch[kNotice.bound + 20];
   CTextWriter line(scratch, sizeof scratch);
   line.Append(WIRE("%s%s"), label, text);
   debuglog(line.Text());
@@ -58,14 +70,14 @@ void AppendAccount(CResultText& list, std::string_view head, std::string_view ta
 }
 
 void AppendAccountLine(CResultText& list, const CRecord& record) {
-  list.Append(WIRE("<%s>@%s@"), record.Text(kType, 10), record.Text(kM5, 20));
-  AppendAccount(list, record.Text(kAccountHead, 10), record.Text(kAccountTail, 10));
-  list.Append(WIRE("@%s@%s!"), record.Text(kField16, 20), record.Text(kName, 20));
+  list.Append(WIRE("<%s>@%s@"), record.Text(kAccountField07), record.Text(kAccountFieldM5));
+  AppendAccount(list, record.Text(kAccountHead), record.Text(kAccountTail));
+  list.Append(WIRE("@%s@%s!"), record.Text(kAccountField16), record.Text(kAccountField69));
 }
 
 int AppendAccountLines(CResultText& list, std::string_view reply) {
   int count = 0;
-  for (CReplyList accounts(reply, kTags, kShape); accounts.NextData(); ++count) {
+  for (CReplyList accounts(reply, kTags); accounts.NextData(); ++count) {
     AppendAccountLine(list, accounts.Record());
   }
   return count;
@@ -74,7 +86,7 @@ int AppendAccountLines(CResultText& list, std::string_view reply) {
 // The notice counts as one more record. It is asked for only behind a list of accounts: a login
 // without accounts shows none.
 int AppendNotice(CResultText& list, std::string_view reply) {
-  const std::string_view notice = Bounded(FindField(reply, "M3", Blanks::kTaken), kNoticeSize);
+  const std::string_view notice = ReadField(reply, kNotice);
   LogText("[strResult2]", notice);
   if (notice.empty()) return 0;
   list.Append(WIRE("<M>@%s!"), notice);
@@ -120,11 +132,9 @@ char* CGatewayPub::GetTotalAccountDecode(const char* reply, int* status) {
 char* CGatewayPub::ListAccounts(std::string_view reply, bool login, int* status) {
   *status = 1;
   if (TransportFailed(reply, status)) return m_szBuffer;
-  const std::string_view code = Bounded(FindField(reply, "68", Blanks::kTaken), 20);
+  const std::string_view code = ReadField(reply, kReplyCode);
   if (login) LogText("[strResult]", code);
-  if (code != "0000") {
-    return Fail(Bounded(FindField(reply, "M2", Blanks::kTaken), kBufferSize), status);
-  }
+  if (code != kDoneCode) return Fail(ReadField(reply, kRefusal), status);
   CResultText list({m_pData, m_nDataSize, m_nDataLen}, reply.size());
   int count = AppendAccountLines(list, reply);
   if (count == 0) return Answer("0!");

@@ -11,12 +11,17 @@
 
 namespace {
 
+// The answer to opening an account and to changing the password.
+constexpr ReplyField kReplyCode = {"68", 20};
+constexpr ReplyField kRefusal = {"M2", 200};
+
 // Room for the balance record: a longer one reads as empty.
-constexpr size_t kBalanceRecordSize = 200;
+constexpr size_t kRecord = 200;
 
-enum BalanceField { kBalance };
+enum Field { kBankBalance };
 
-constexpr CTagTable kBalanceTags({{"PN"}});
+constexpr TagRow kRows[] = {{kBankBalance, "PN", kRecord}};
+constexpr CTagTable kTags(kRows);
 
 // A code that the host passes as one byte, sent as an unsigned number.
 int UnsignedCode(char code) {
@@ -80,9 +85,9 @@ char* CGatewayPub::ChangePasswordDecode(const char* reply, int* status) {
 char* CGatewayPub::Acknowledge(std::string_view reply, int* status) {
   *status = 1;
   if (TransportFailed(reply, status)) return m_szBuffer;
-  const std::string_view code = Bounded(FindField(reply, "68", Blanks::kTaken), 20);
-  if (code == "0000") return Answer("");
-  return Refuse(Bounded(FindField(reply, "M2", Blanks::kTaken), 200), code, status);
+  const std::string_view code = ReadField(reply, kReplyCode);
+  if (code == kDoneCode) return Answer("");
+  return Refuse(ReadField(reply, kRefusal), code, status);
 }
 
 // The result code is not looked at: a refused query shows an empty balance.
@@ -91,10 +96,10 @@ char* CGatewayPub::QueryBankRemainDecode(const char* reply, int* status) {
   LogReply("QueryBankRemainDecode", text);
   *status = 1;
   if (TransportFailed(text, status)) return m_szBuffer;
-  CRecord record(kBalanceTags);
-  CRecordWalker walker(text, kBalanceRecordSize);
+  CRecord record(kTags);
+  CRecordWalker walker(text, kRecord);
   walker.Next(record);
   CTextWriter answer = StartRequest();
-  answer.Append(WIRE("1!@@@@%s@!"), record.Text(kBalance, 200));
+  answer.Append(WIRE("1!@@@@%s@!"), record.Text(kBankBalance));
   return answer.Text();
 }

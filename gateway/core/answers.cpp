@@ -1,5 +1,6 @@
 // How an operation ends, and what every decoder does before it reads its own fields.
 #include "gateway/core/gateway_pub.h"
+#include "gateway/core/list_frame.h"
 #include "gateway/core/messages.h"
 #include "gateway/core/protocol.h"
 

@@ -7,11 +7,12 @@
 #include <cstdint>
 #include <string_view>
 
-#include "gateway/core/list_frame.h"
 #include "gateway/core/reply_reader.h"
 #include "gateway/core/request_head.h"
 #include "gateway/core/result_text.h"
 #include "gateway/core/text_writer.h"
+
+class CReplyList;
 
 // One object lives for one call: constructed, filled with the session data, one `...Encode` or
 // `...Decode`, destroyed. Every text that a method returns lies in the object and dies with it; a

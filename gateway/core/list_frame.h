@@ -11,54 +11,68 @@
 
 #include "gateway/core/reply_reader.h"
 
-// The rows that every list's tag table begins with: {"67"}, {"68"}, {"M2"}. A list numbers its own
-// tags from kOwnFields on.
-enum ListField { kListSequence, kListCode, kListMessage, kOwnFields };
+// The rows that every list's tag table begins with; a list numbers its own fields from kOwnFields
+// on.
+enum ListField { kSequence, kResultCode, kMessage, kOwnFields };
 
-constexpr bool OpensListTable(const CTagTable& tags) {
-  return tags.Find(MakeTagKey("67")) == kListSequence && tags.Find(MakeTagKey("68")) == kListCode &&
-         tags.Find(MakeTagKey("M2")) == kListMessage;
-}
-
-// What a list lays down for its frame: sizes of buffers in bytes, and where it ends.
+// What a list lays down for its frame.
 struct ListShape {
-  size_t record;    // of one record; a longer one reads as empty
-  size_t sequence;  // of tag 67
-  size_t code;      // of tag 68
-  size_t message;   // of tag M2, read where the reply is refused
+  size_t record;  // size of the record buffer: a longer record reads as empty
   bool endsAtEmptyRecord = false;
   int endMark = 900000;  // the lowest sequence that is no record's
+};
+
+// The tag table of a list: one that does not begin with the rows of the frame does not build.
+class CListTable : public CTagTable {
+ public:
+  template <size_t kRows>
+  constexpr CListTable(const TagRow (&rows)[kRows], const ListShape& shape)
+      : CTagTable(rows), m_shape(shape) {
+    if (!OpensList(*this)) RowsDoNotOpenAList();
+  }
+
+  static constexpr bool OpensList(const CTagTable& tags) {
+    return tags.Find(MakeTagKey("67")) == kSequence && tags.Find(MakeTagKey("68")) == kResultCode &&
+           tags.Find(MakeTagKey("M2")) == kMessage;
+  }
+
+  const ListShape& Shape() const { return m_shape; }
+
+ private:
+  static void RowsDoNotOpenAList();  // never defined, as the one of CTagTable
+
+  ListShape m_shape;
 };
 
 enum class ListVerdict { kData, kNoData, kRefused };
 
 // Walks the records of one list reply:
 //
-//   CReplyList list(reply, kTags, kShape);   // holds the first record
-//   if (list.Verdict() ...)                  // where the first record speaks for the reply
+//   CReplyList list(reply, kTags);   // holds the first record
+//   if (list.Verdict() ...)          // where the first record speaks for the reply
 //   while (list.NextData()) ...Record()...
 class CReplyList {
  public:
-  // `tags` satisfies OpensListTable; the reply, `tags` and `shape` outlive the list.
-  CReplyList(std::string_view reply, const CTagTable& tags, const ListShape& shape)
-      : m_walker(reply, shape.record), m_record(tags), m_shape(shape) {
+  // The reply and `tags` outlive the list.
+  CReplyList(std::string_view reply, const CListTable& tags)
+      : m_walker(reply, tags.Shape().record), m_record(tags), m_shape(tags.Shape()) {
     m_bFound = m_walker.Next(m_record);
   }
 
   // The first record's judgement, code and message; ask before the walk. Without a first record
   // the reply counts as refused, with no code.
   ListVerdict Verdict() const {
-    if (Code() == "0000") return ListVerdict::kData;
-    return Code() == "5001" ? ListVerdict::kNoData : ListVerdict::kRefused;
+    if (Code() == kDoneCode) return ListVerdict::kData;
+    return Code() == kNoDataCode ? ListVerdict::kNoData : ListVerdict::kRefused;
   }
-  std::string_view Code() const { return m_record.Text(kListCode, m_shape.code); }
-  std::string_view Message() const { return m_record.Text(kListMessage, m_shape.message); }
+  std::string_view Code() const { return m_record.Text(kResultCode); }
+  std::string_view Message() const { return m_record.Text(kMessage); }
 
   // Goes on to the next record, at the start to the first. False at the end of the list, for good.
   bool Next() {
     if (m_bStarted && m_bFound) m_bFound = m_walker.Next(m_record);
     m_bStarted = true;
-    if (m_record.Number(kListSequence, m_shape.sequence) >= m_shape.endMark) m_bFound = false;
+    if (m_record.Number(kSequence) >= m_shape.endMark) m_bFound = false;
     if (m_shape.endsAtEmptyRecord && m_record.Empty()) m_bFound = false;
     return m_bFound;
   }
@@ -66,7 +80,7 @@ class CReplyList {
   // As Next, passing over the records that carry no data.
   bool NextData() {
     while (Next()) {
-      if (Code() == "0000") return true;
+      if (Code() == kDoneCode) return true;
     }
     return false;
   }

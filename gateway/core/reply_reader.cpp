@@ -57,8 +57,8 @@ std::string_view FindField(std::string_view text, std::string_view tag, Blanks b
   return {};
 }
 
-int32_t CRecord::Number(int row, size_t bound) const {
-  return ReadInt32(Text(row, bound));
+int32_t CRecord::Number(int field) const {
+  return ReadInt32(Text(field));
 }
 
 bool CRecordWalker::Next(CRecord& record) {
@@ -76,8 +76,8 @@ bool CRecordWalker::Next(CRecord& record) {
     if (key == kClosing) closing = start;
   }
   const CTagTable& tags = record.m_tags;
-  const uint32_t skips = tags.Skips();
-  uint32_t present = 0;
+  const uint64_t skips = tags.Skips();
+  uint64_t present = 0;
   while (opening != nullptr && Mostly(bar != end)) {
     const char* const start = bar;
     bar = bars.Next();
@@ -97,7 +97,7 @@ bool CRecordWalker::Next(CRecord& record) {
       if ((present >> row & 1) != 0 || IsSkippable(value, !ClosesRecord(bar, keys))) continue;
     }
     record.m_values[static_cast<uint8_t>(row)] = value;
-    present |= 1U << row;
+    present |= uint64_t{1} << row;
   }
   const bool whole = opening != nullptr && closing != nullptr;
   record.m_bEmpty = !whole || static_cast<size_t>(closing - opening) >= m_nBound;

@@ -11,6 +11,10 @@
 
 #include "gateway/core/byte_scan.h"
 
+// Result codes, in tag 68: done, and done with nothing to show. Any other is a refusal.
+inline constexpr std::string_view kDoneCode = "0000";
+inline constexpr std::string_view kNoDataCode = "5001";
+
 // What the reply itself says of the transport.
 enum class Transport { kOk, kGatewayDown, kBrokerDown };
 
@@ -29,11 +33,39 @@ inline std::string_view Bounded(std::string_view value, size_t bound) {
   return value.size() < bound ? value : std::string_view();
 }
 
-// One row of a decoder's tag table: a tag of two or three characters, and how its field is read.
-struct TagRow {
+// The bounds of a value that nothing bounds, and of one that a record has and its decoder leaves.
+inline constexpr uint32_t kUnbounded = UINT32_MAX;
+inline constexpr uint32_t kNotRead = 0;
+
+// A field that a decoder reads from the whole reply: its tag and the bound of its value.
+struct ReplyField {
   const char* tag;
+  uint32_t bound;
   Blanks blanks = Blanks::kTaken;
 };
+
+// The field's value, empty when it is absent or does not fit.
+inline std::string_view ReadField(std::string_view reply, const ReplyField& field) {
+  return Bounded(FindField(reply, field.tag, field.blanks), field.bound);
+}
+
+// One row of a decoder's tag table: a field of its records by its number in the decoder's enum, its
+// tag of two or three characters, and the bound of its value.
+struct TagRow {
+  int field;
+  const char* tag;
+  uint32_t bound;
+  Blanks blanks = Blanks::kTaken;
+};
+
+// Whether every row stands in the place that its field's number names.
+template <size_t kRows>
+constexpr bool AreInFieldOrder(const TagRow (&rows)[kRows]) {
+  for (size_t i = 0; i < kRows; ++i) {
+    if (rows[i].field != static_cast<int>(i)) return false;
+  }
+  return true;
+}
 
 // A tag and its '=' as a number, first character lowest, so that a field is told by one comparison.
 using TagKey = uint32_t;
@@ -94,53 +126,67 @@ constexpr size_t TagSize(TagKey key) {
   return key >> 24 == 0 ? 3 : 4;
 }
 
-// The tags that one decoder reads from its records, numbered by their place in the table: declare
-// an enum of meanings in the same order. At most kMaxTags.
+// The fields that one decoder reads from its records. Declare an enum of the fields and a row for
+// each, in the same order: another order does not build, nor does a tag that stands twice.
 class CTagTable {
  public:
-  static constexpr size_t kMaxTags = 32;
+  static constexpr size_t kMaxTags = 64;
   static constexpr int kNone = -1;
 
-  template <size_t N>
-  constexpr explicit CTagTable(const TagRow (&rows)[N]) {
-    static_assert(N <= kMaxTags, "a table holds at most kMaxTags tags");
-    while (!Place(rows, N)) m_nFactor = m_nFactor * 747796405 + 2;  // odd, and far from the last
+  template <size_t kRows>
+  constexpr explicit CTagTable(const TagRow (&rows)[kRows]) {
+    static_assert(kRows <= kMaxTags, "a record's fields are told by the bits of one number");
+    if (!AreInFieldOrder(rows)) RowsAreNotInFieldOrder();
+    for (size_t row = 0; row < kRows; ++row) {
+      m_keys[row] = MakeTagKey(rows[row].tag);
+      m_bounds[row] = rows[row].bound;
+      if (rows[row].blanks == Blanks::kSkipped) m_nSkips |= uint64_t{1} << row;
+    }
+    while (!HaveOwnPlaces(kRows)) m_nFactor = m_nFactor * 747796405 + 2;  // odd, far from the last
+    for (uint8_t& row : m_rows) row = kMaxTags;
+    m_keys[kMaxTags] = kVacant;
+    for (size_t row = 0; row < kRows; ++row) {
+      m_rows[PlaceOf(m_keys[row])] = static_cast<uint8_t>(row);
+    }
   }
 
   // The row of the tag with this key, or kNone.
   ALWAYS_INLINE constexpr int Find(TagKey key) const {
-    const size_t place = PlaceOf(key);
-    return m_keys[place] == key ? m_rows[place] : kNone;
+    const int row = m_rows[PlaceOf(key)];
+    return m_keys[row] == key ? row : kNone;
   }
 
+  uint32_t BoundOf(int row) const { return m_bounds[row]; }
+
   // The rows that skip blanks, bit per row.
-  uint32_t Skips() const { return m_nSkips; }
+  uint64_t Skips() const { return m_nSkips; }
 
  private:
-  static constexpr size_t kPlaces = 128;
+  static constexpr size_t kPlaces = 256;
+  static constexpr TagKey kVacant = 0xffffffff;  // no field has this key
 
-  constexpr size_t PlaceOf(TagKey key) const { return key * m_nFactor >> 25; }
+  // Never defined: a constant table cannot call it.
+  static void RowsAreNotInFieldOrder();
 
-  // Whether every tag found a place of its own with the present factor.
-  constexpr bool Place(const TagRow* rows, size_t count) {
-    for (TagKey& key : m_keys) key = kVacant;
+  constexpr size_t PlaceOf(TagKey key) const { return key * m_nFactor >> 24; }
+
+  // Whether the present factor gives each of the first `count` keys a place of its own.
+  constexpr bool HaveOwnPlaces(size_t count) const {
+    uint64_t taken[kPlaces / 64] = {};
     for (size_t row = 0; row < count; ++row) {
-      const TagKey key = MakeTagKey(rows[row].tag);
-      const size_t place = PlaceOf(key);
-      if (m_keys[place] != kVacant) return false;
-      m_keys[place] = key;
-      m_rows[place] = static_cast<uint8_t>(row);
-      if (rows[row].blanks == Blanks::kSkipped) m_nSkips |= 1U << row;
+      const size_t place = PlaceOf(m_keys[row]);
+      const uint64_t bit = uint64_t{1} << place % 64;
+      if ((taken[place / 64] & bit) != 0) return false;
+      taken[place / 64] |= bit;
     }
     return true;
   }
 
-  static constexpr TagKey kVacant = 0xffffffff;  // no field has this key
-
-  TagKey m_keys[kPlaces] = {};
-  uint8_t m_rows[kPlaces] = {};
+  uint8_t m_rows[kPlaces] = {};      // by place; kMaxTags where no tag has it
+  TagKey m_keys[kMaxTags + 1] = {};  // by row; the last is nobody's
+  uint32_t m_bounds[kMaxTags] = {};
+  uint64_t m_nSkips = 0;
   uint32_t m_nFactor = 0x9e3779b1;
-  uint32_t m_nSkips = 0;
 };
 
 // One record's fields, indexed once. A tag that stands several times counts where it stands first.
@@ -152,23 +198,23 @@ class CRecord {
   bool Empty() const { return m_bEmpty; }
 
   // Whether the field is there and not empty, even if its value is too long to be read.
-  bool Has(int row) const { return (m_nPresent >> row & 1) != 0 && !m_values[row].empty(); }
+  bool Has(int field) const { return (m_nPresent >> field & 1) != 0 && !m_values[field].empty(); }
 
-  // The value as a buffer of `bound` bytes holds it; empty when absent or dropped.
-  std::string_view Text(int row, size_t bound) const {
-    if ((m_nPresent >> row & 1) == 0) return {};
-    return Bounded(m_values[row], bound);
+  // The value as its row bounds it; empty when absent or dropped.
+  std::string_view Text(int field) const {
+    if ((m_nPresent >> field & 1) == 0) return {};
+    return Bounded(m_values[field], m_tags.BoundOf(field));
   }
 
   // The value's decimal number, 0 when absent or dropped.
-  int32_t Number(int row, size_t bound) const;
+  int32_t Number(int field) const;
 
  private:
   friend class CRecordWalker;
 
   const CTagTable& m_tags;
   bool m_bEmpty = true;
-  uint32_t m_nPresent = 0;  // bit per row; values of other rows are not valid
+  uint64_t m_nPresent = 0;  // bit per row; values of other rows are not valid
   std::string_view m_values[CTagTable::kMaxTags];
 };
 

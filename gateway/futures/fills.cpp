@@ -13,23 +13,20 @@
 
 namespace {
 
-// Where no smaller buffer is named for a field, the record is its bound.
-constexpr size_t kAny = kFuturesRecordSize;
-constexpr size_t kShort = 16;
-
 constexpr int kPriceDecimals = 4;
 
+// Of the fields that are named by their tags no more is known than where the result shows them.
 enum Field {
-  kReference = kOwnFields,
-  kNumber,
+  kOrderNumber = kOwnFields,
+  kGatewayNumber,
   kPrice,
-  kQuantity,
-  kReduced,
-  kFilled,
-  kField22,
-  kField50,
-  kField51,
-  kCommodity,
+  kOrderedQuantity,
+  kReduced37,
+  kFilledQuantity,
+  kEntryTime,
+  kDate50,
+  kTime51,
+  kCommodity1,
   kCommodity2,
   kMonth1,
   kMonth2,
@@ -39,43 +36,63 @@ enum Field {
   kStrike2,
   kSide1,
   kSide2,
-  kField48,
-  kW3,
-  kMT,
-  kDate
+  kPrice48,
+  kFlagW3,
+  kFlagMT,
+  kOrderDate
 };
 
-constexpr CTagTable kTags({{"67"}, {"68"}, {"M2"}, {"36"}, {"46"}, {"31"}, {"70"}, {"37"}, {"47"},
-                           {"22"}, {"50"}, {"51"}, {"33"}, {"V9"}, {"29"}, {"W0"}, {"V8"}, {"W1"},
-                           {"34"}, {"W2"}, {"32"}, {"EL"}, {"48"}, {"W3"}, {"MT"}, {"44"}});
-static_assert(OpensListTable(kTags));
-
-constexpr ListShape kShape = {kFuturesRecordSize, kAny, kReplyCodeSize, kRefusalSize, true};
+constexpr TagRow kRows[] = {{kSequence, "67", kRecord},
+                            {kResultCode, "68", 8},
+                            {kMessage, "M2", kNotRead},
+                            {kOrderNumber, "36", 16},
+                            {kGatewayNumber, "46", 16},
+                            {kPrice, "31", kRecord},
+                            {kOrderedQuantity, "70", kRecord},
+                            {kReduced37, "37", kRecord},
+                            {kFilledQuantity, "47", kRecord},
+                            {kEntryTime, "22", 16},
+                            {kDate50, "50", 16},
+                            {kTime51, "51", kRecord},
+                            {kCommodity1, "33", kRecord},
+                            {kCommodity2, "V9", kRecord},
+                            {kMonth1, "29", kRecord},
+                            {kMonth2, "W0", kRecord},
+                            {kCallPut1, "V8", kRecord},
+                            {kCallPut2, "W1", kRecord},
+                            {kStrike1, "34", kRecord},
+                            {kStrike2, "W2", kRecord},
+                            {kSide1, "32", kRecord},
+                            {kSide2, "EL", kRecord},
+                            {kPrice48, "48", kRecord},
+                            {kFlagW3, "W3", kRecord},
+                            {kFlagMT, "MT", 8},
+                            {kOrderDate, "44", 16}};
+constexpr CListTable kTags(kRows, kFuturesList);
 
 int32_t Price(const CRecord& record, int field) {
-  return ScalePrice(record.Text(field, kAny), kPriceDecimals);
+  return ScalePrice(record.Text(field), kPriceDecimals);
 }
 
 // A leg whose side is neither buying nor selling has no code; an unusual W3 is taken as none.
 void AppendLegCodes(CResultText& list, const CRecord& record) {
-  const LegPair* const known = FindLegPair(record.Text(kW3, kAny));
+  const LegPair* const known = FindLegPair(record.Text(kFlagW3));
   const LegPair& pair = known == nullptr ? kUsualLegPair : *known;
-  const int first = SideOffset(record.Text(kSide1, kAny));
+  const int first = SideOffset(record.Text(kSide1));
   if (first != kNoSide) list.Append(WIRE("%d"), pair.buying + first);
   if (!record.Has(kCommodity2)) return;
-  const int second = SideOffset(record.Text(kSide2, kAny));
+  const int second = SideOffset(record.Text(kSide2));
   if (second != kNoSide) list.Append(WIRE("|%d"), pair.buying + second);
 }
 
 // The product word differs from that of the order book and the positions. Pairs show one commodity.
 void AppendContract(CResultText& list, const CRecord& record) {
-  const std::string_view commodity = record.Text(kCommodity, kAny);
-  const std::string_view month = record.Text(kMonth1, kAny);
-  const std::string_view callPut = record.Text(kCallPut1, kAny);
+  const std::string_view commodity = record.Text(kCommodity1);
+  const std::string_view month = record.Text(kMonth1);
+  const std::string_view callPut = record.Text(kCallPut1);
   if (record.Has(kCommodity2)) {
-    list.Append(WIRE("TAIMEX&X&%s&%s|%s&%s|%s&%ld|%ld"), commodity, month,
-                record.Text(kMonth2, kAny), callPut, record.Text(kCallPut2, kAny),
-                Price(record, kStrike1), Price(record, kStrike2));
+    list.Append(WIRE("TAIMEX&X&%s&%s|%s&%s|%s&%ld|%ld"), commodity, month, record.Text(kMonth2),
+                callPut, record.Text(kCallPut2), Price(record, kStrike1), Price(record, kStrike2));
   } else {
     list.Append(WIRE("TAIMEX&%s&%s&%s&%s&%ld"), IsBlank(callPut) ? "F" : "O", commodity, month,
                 callPut, Price(record, kStrike1));
@@ -83,18 +100,17 @@ void AppendContract(CResultText& list, const CRecord& record) {
 }
 
 void AppendFill(CResultText& list, const CRecord& record) {
-  const int32_t quantity = record.Number(kQuantity, kAny);
-  const int32_t remaining =
-      quantity == 0 ? 0 : WrapSubtract(quantity, record.Number(kReduced, kAny));
-  const std::string_view mt = record.Text(kMT, 8);
-  list.Append(WIRE("%s&%s@"), record.Text(kReference, kShort), record.Text(kNumber, kShort));
+  const int32_t quantity = record.Number(kOrderedQuantity);
+  const int32_t remaining = quantity == 0 ? 0 : WrapSubtract(quantity, record.Number(kReduced37));
+  const std::string_view mt = record.Text(kFlagMT);
+  list.Append(WIRE("%s&%s@"), record.Text(kOrderNumber), record.Text(kGatewayNumber));
   AppendLegCodes(list, record);
   list.AppendChar('@');
   AppendContract(list, record);
-  list.Append(WIRE("@%d&%d@%ld&%ld@@@%s&%s@%c@%s&%s!"), remaining, record.Number(kFilled, kAny),
-              Price(record, kPrice), Price(record, kField48), record.Text(kField22, kShort),
-              FirstSix(record.Text(kField51, kAny)), mt.empty() ? ' ' : mt.front(),
-              record.Text(kDate, kShort), record.Text(kField50, kShort));
+  list.Append(WIRE("@%d&%d@%ld&%ld@@@%s&%s@%c@%s&%s!"), remaining, record.Number(kFilledQuantity),
+              Price(record, kPrice), Price(record, kPrice48), record.Text(kEntryTime),
+              FirstSix(record.Text(kTime51)), mt.empty() ? ' ' : mt.front(),
+              record.Text(kOrderDate), record.Text(kDate50));
 }
 
 }  // namespace
@@ -119,7 +135,7 @@ char* CGatewayFut::QueryReplyDecode(const char* reply, int* status) {
   const std::string_view text = AsText(reply);
   if (char* const answer = AnswerWithoutRecords(text, "0!", status)) return answer;
 
-  CReplyList fills(text, kTags, kShape);
+  CReplyList fills(text, kTags);
   CResultText list({m_pData, m_nDataSize, m_nDataLen}, text.size());
   int count = 0;
   for (; fills.NextData(); ++count) AppendFill(list, fills.Record());

@@ -37,7 +37,7 @@ char* CGatewayFut::GetResultCode(const char* reply, char* out, int size) {
     CopyIfFits(kNoReplyToJudge, out, size);
     return out;
   }
-  char scratch[kReplyCodeSize + kRefusalSize + 2];
+  char scratch[kReplyCode.bound + kRefusal.bound + 2];
   CTextWriter result(scratch, sizeof scratch);
   WriteReplyCode(ReplyCode(text), text, result);
   CopyIfFits({result.Text(), result.Length()}, out, size);
@@ -48,8 +48,8 @@ char* CGatewayFut::AnswerWithoutRecords(std::string_view reply, std::string_view
                                         int* status) {
   if (reply.empty()) return Fail(kNoReply, status);
   const std::string_view code = ReplyCode(reply);
-  if (code == kDone) return nullptr;
-  if (code == kNoData) return Answer(noData);
+  if (code == kDoneCode) return nullptr;
+  if (code == kNoDataCode) return Answer(noData);
   *status = -1;
   CTextWriter answer(m_szBuffer, sizeof m_szBuffer);
   WriteReplyCode(code, reply, answer);

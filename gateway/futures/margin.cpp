@@ -11,23 +11,28 @@
 
 namespace {
 
-constexpr size_t kAny = SIZE_MAX;  // no bound is named for the record nor for its amounts
-constexpr size_t kPNSize = 512;
+// Of the amounts no more is known than where the result shows them, two of them twice.
+enum Field {
+  kAmountLO,
+  kAmountPN,
+  kAmountRA,
+  kAmountQY,
+  kAmountQX,
+  kAmountU5,
+  kAmountU9,
+  kAmountRF,
+  kAmountF0,
+  kAmountF1,
+  kAmountF2,
+  kAmountF3
+};
 
-enum Field { kLO, kPN, kRA, kQY, kQX, kU5, kU9, kRF, kF0, kF1, kF2, kF3 };
-
-constexpr CTagTable kTags({{"LO"},
-                           {"PN"},
-                           {"RA"},
-                           {"QY"},
-                           {"QX"},
-                           {"U5"},
-                           {"U9"},
-                           {"RF"},
-                           {"F0"},
-                           {"F1"},
-                           {"F2"},
-                           {"F3"}});
+constexpr TagRow kRows[] = {
+    {kAmountLO, "LO", kUnbounded}, {kAmountPN, "PN", 512},        {kAmountRA, "RA", kUnbounded},
+    {kAmountQY, "QY", kUnbounded}, {kAmountQX, "QX", kUnbounded}, {kAmountU5, "U5", kUnbounded},
+    {kAmountU9, "U9", kUnbounded}, {kAmountRF, "RF", kUnbounded}, {kAmountF0, "F0", kUnbounded},
+    {kAmountF1, "F1", kUnbounded}, {kAmountF2, "F2", kUnbounded}, {kAmountF3, "F3", kUnbounded}};
+constexpr CTagTable kTags(kRows);
 
 // A place of the record: an amount with its implied decimals, or none.
 struct Place {
@@ -38,20 +43,20 @@ struct Place {
 constexpr Place kNothing;
 
 constexpr Place kLayout[] = {
-    kNothing, {kLO, 2}, kNothing, {kPN},    {kRA},     // 1 to 5
-    {kLO},    {kQY},    kNothing, {kQX},    kNothing,  // 6 to 10
-    {kU5},    kNothing, kNothing, kNothing, kNothing,  // 11 to 15
-    {kU9},    {kU5},    kNothing, kNothing, kNothing,  // 16 to 20
-    kNothing, {kRF},    kNothing, kNothing, kNothing,  // 21 to 25
-    kNothing, {kF0},    {kF1},    {kF2},    {kF3},     // 26 to 30
+    kNothing,    {kAmountLO, 2}, kNothing,    {kAmountPN}, {kAmountRA},  // 1 to 5
+    {kAmountLO}, {kAmountQY},    kNothing,    {kAmountQX}, kNothing,     // 6 to 10
+    {kAmountU5}, kNothing,       kNothing,    kNothing,    kNothing,     // 11 to 15
+    {kAmountU9}, {kAmountU5},    kNothing,    kNothing,    kNothing,     // 16 to 20
+    kNothing,    {kAmountRF},    kNothing,    kNothing,    kNothing,     // 21 to 25
+    kNothing,    {kAmountF0},    {kAmountF1}, {kAmountF2}, {kAmountF3},  // 26 to 30
 };
 static_assert(sizeof kLayout / sizeof *kLayout == 30);
 
 // PN may hold two amounts joined by '&', which the user interface reads itself.
 void AppendPlace(CTextWriter& result, const CRecord& record, const Place& place) {
   if (place.field >= 0) {
-    const std::string_view amount = record.Text(place.field, place.field == kPN ? kPNSize : kAny);
-    if (place.field == kPN && amount.find('&') != std::string_view::npos) {
+    const std::string_view amount = record.Text(place.field);
+    if (place.field == kAmountPN && amount.find('&') != std::string_view::npos) {
       result.AppendText(amount);
     } else {
       result.Append(WIRE("%ld"), ScaleAmount(amount, place.decimals));
@@ -82,7 +87,7 @@ char* CGatewayFut::QueryFinanceDecode(const char* reply, int* status) {
   const std::string_view text = AsText(reply);
   if (text.empty()) return Fail(kNoReply, status);
   CRecord record(kTags);
-  CRecordWalker walker(text, kAny);
+  CRecordWalker walker(text, kUnbounded);
   walker.Next(record);
   CTextWriter result(m_szBuffer, sizeof m_szBuffer);
   result.AppendText("1!TWD@");

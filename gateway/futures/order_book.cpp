@@ -19,27 +19,24 @@
 
 namespace {
 
-// Where no smaller buffer is named for a field, the record is its bound.
-constexpr size_t kAny = kFuturesRecordSize;
-
 constexpr int kPriceDecimals = 4;
 
 enum Field {
-  kO4 = kOwnFields,
-  kV5,
-  kQuantity,
-  kCancelled,
-  kReduced,
-  kFilled,
-  kFailure,
-  kFailureText,
-  kN6,
-  kCallPut,
-  kW3,
+  kFillOrKill = kOwnFields,
+  kImmediateOrCancel,
+  kOrderedQuantity,
+  kCancelled41,
+  kReduced37,
+  kFilledQuantity,
+  kOrderState,
+  kGatewayText,
+  kHandlingFlag,
+  kCallPut1,
+  kFlagW3,
   kSide2,
   kSide1,
-  kNumber,
-  kReference,
+  kGatewayNumber,
+  kOrderNumber,
   kCommodity1,
   kCommodity2,
   kMonth1,
@@ -49,26 +46,52 @@ enum Field {
   kStrike2,
   kPriceType,
   kPrice,
-  kTime,
-  kDate,
+  kEntryTime,
+  kEntryDate,
   kOrderDate,
-  kJV,
-  kMT
+  kChangeable,
+  kFlagMT
 };
 
-constexpr ListShape kShape = {kFuturesRecordSize, 16, 128, 512};
-
-constexpr CTagTable kTags({{"67"}, {"68"}, {"M2"}, {"O4"}, {"V5"}, {"70"}, {"41"}, {"37"},
-                           {"47"}, {"39"}, {"K1"}, {"N6"}, {"V8"}, {"W3"}, {"EL"}, {"32"},
-                           {"46"}, {"36"}, {"33"}, {"V9"}, {"29"}, {"W0"}, {"W1"}, {"34"},
-                           {"W2"}, {"27"}, {"31"}, {"22"}, {"21"}, {"44"}, {"JV"}, {"MT"}});
-static_assert(OpensListTable(kTags));
+constexpr TagRow kRows[] = {{kSequence, "67", 16},
+                            {kResultCode, "68", 128},
+                            {kMessage, "M2", 512},
+                            {kFillOrKill, "O4", kRecord},
+                            {kImmediateOrCancel, "V5", kRecord},
+                            {kOrderedQuantity, "70", kRecord},
+                            {kCancelled41, "41", kRecord},
+                            {kReduced37, "37", kRecord},
+                            {kFilledQuantity, "47", kRecord},
+                            {kOrderState, "39", kRecord},
+                            {kGatewayText, "K1", 512},
+                            {kHandlingFlag, "N6", kRecord},
+                            {kCallPut1, "V8", 8},
+                            {kFlagW3, "W3", 8},
+                            {kSide2, "EL", kRecord},
+                            {kSide1, "32", kRecord},
+                            {kGatewayNumber, "46", kRecord},
+                            {kOrderNumber, "36", kRecord},
+                            {kCommodity1, "33", kRecord},
+                            {kCommodity2, "V9", kRecord},
+                            {kMonth1, "29", kRecord},
+                            {kMonth2, "W0", kRecord},
+                            {kCallPut2, "W1", kRecord},
+                            {kStrike1, "34", kRecord},
+                            {kStrike2, "W2", kRecord},
+                            {kPriceType, "27", kRecord},
+                            {kPrice, "31", kRecord},
+                            {kEntryTime, "22", kRecord},
+                            {kEntryDate, "21", kRecord},
+                            {kOrderDate, "44", kRecord},
+                            {kChangeable, "JV", kRecord},
+                            {kFlagMT, "MT", kRecord}};
+constexpr CListTable kTags(kRows, {kRecord});
 
 // A number that stands until a record brings another.
 class CStanding {
  public:
   void Update(const CRecord& record, int field) {
-    if (record.Has(field)) m_nValue = record.Number(field, kAny);
+    if (record.Has(field)) m_nValue = record.Number(field);
   }
   int32_t Value() const { return m_nValue; }
 
@@ -78,7 +101,7 @@ class CStanding {
 
 // What goes from one record to the next.
 struct Standing {
-  CStanding o4, v5;
+  CStanding fillOrKill, immediateOrCancel;
   CStanding quantity, cancelled, reduced, filled;
   char timeInForce = '\0';
   const char* product = "";
@@ -86,28 +109,28 @@ struct Standing {
 
 // A pair that means nothing leaves the letter as it was.
 void UpdateTimeInForce(const CRecord& record, Standing& standing) {
-  standing.o4.Update(record, kO4);
-  standing.v5.Update(record, kV5);
-  const int32_t o4 = standing.o4.Value();
-  const int32_t v5 = standing.v5.Value();
-  if (o4 == 0 && v5 == 0) standing.timeInForce = 'R';
-  if (o4 == 0 && v5 == 1) standing.timeInForce = 'I';
-  if (o4 == 1 && v5 == 0) standing.timeInForce = 'F';
+  standing.fillOrKill.Update(record, kFillOrKill);
+  standing.immediateOrCancel.Update(record, kImmediateOrCancel);
+  const int32_t kill = standing.fillOrKill.Value();
+  const int32_t cancel = standing.immediateOrCancel.Value();
+  if (kill == 0 && cancel == 0) standing.timeInForce = 'R';
+  if (kill == 0 && cancel == 1) standing.timeInForce = 'I';
+  if (kill == 1 && cancel == 0) standing.timeInForce = 'F';
 }
 
 void UpdateQuantities(const CRecord& record, Standing& standing) {
-  standing.quantity.Update(record, kQuantity);
-  standing.cancelled.Update(record, kCancelled);
-  standing.reduced.Update(record, kReduced);
-  standing.filled.Update(record, kFilled);
+  standing.quantity.Update(record, kOrderedQuantity);
+  standing.cancelled.Update(record, kCancelled41);
+  standing.reduced.Update(record, kReduced37);
+  standing.filled.Update(record, kFilledQuantity);
 }
 
 // "@51" for one leg, "@51|52" for two; two legs with an unknown side have no code at all, and an
 // unusual W3 a bare '@', with the product letter of the record before.
 void AppendLegCodes(CResultText& list, const CRecord& record, bool option, Standing& standing) {
-  const std::string_view w3 = record.Text(kW3, 8);
-  const std::string_view side1 = record.Text(kSide1, kAny);
-  const std::string_view side2 = record.Text(kSide2, kAny);
+  const std::string_view w3 = record.Text(kFlagW3);
+  const std::string_view side1 = record.Text(kSide1);
+  const std::string_view side2 = record.Text(kSide2);
   const LegPair* const pair = IsBlank(w3) ? &kUsualLegPair : FindLegPair(w3);
   if (pair == nullptr || (option && !pair->forOptions)) {
     list.AppendChar('@');
@@ -138,36 +161,36 @@ bool StrikesInTenths(std::string_view commodity) {
 }
 
 void AppendStrikes(CResultText& list, const CRecord& record) {
-  const int32_t strike1 = ScalePrice(record.Text(kStrike1, kAny), kPriceDecimals);
-  const std::string_view second = record.Text(kStrike2, kAny);
+  const int32_t strike1 = ScalePrice(record.Text(kStrike1), kPriceDecimals);
+  const std::string_view second = record.Text(kStrike2);
   if (IsBlank(second)) {
     list.Append(WIRE("%d"), strike1);
     return;
   }
-  const int unit = StrikesInTenths(record.Text(kCommodity1, kAny)) ? 10 : 1;
+  const int unit = StrikesInTenths(record.Text(kCommodity1)) ? 10 : 1;
   list.Append(WIRE("%ld|%ld"), strike1 / unit, ScalePrice(second, kPriceDecimals) / unit);
 }
 
 // Futures spreads show their first commodity alone.
 void AppendContract(CResultText& list, const CRecord& record, const char* product) {
-  list.Append(WIRE("@TIMEX&%s&%s"), product, record.Text(kCommodity1, kAny));
-  if (*product == 'X') list.Append(WIRE("|%s"), record.Text(kCommodity2, kAny));
+  list.Append(WIRE("@TIMEX&%s&%s"), product, record.Text(kCommodity1));
+  if (*product == 'X') list.Append(WIRE("|%s"), record.Text(kCommodity2));
   list.AppendChar('&');
-  AppendPair(list, record.Text(kMonth1, kAny), record.Text(kMonth2, kAny));
-  AppendPair(list, record.Text(kCallPut, 8), record.Text(kCallPut2, kAny));
+  AppendPair(list, record.Text(kMonth1), record.Text(kMonth2));
+  AppendPair(list, record.Text(kCallPut1), record.Text(kCallPut2));
   AppendStrikes(list, record);
 }
 
 // A record without a price type lacks the field.
 void AppendPrice(CResultText& list, const CRecord& record) {
   if (!record.Has(kPriceType)) return;
-  const int32_t type = record.Number(kPriceType, kAny);
+  const int32_t type = record.Number(kPriceType);
   if (type == 1) {
     list.AppendText("@市價");
   } else if (type == 3) {
     list.AppendText("@範圍市價");
   } else {
-    list.Append(WIRE("@%d"), ScalePrice(record.Text(kPrice, kAny), kPriceDecimals));
+    list.Append(WIRE("@%d"), ScalePrice(record.Text(kPrice), kPriceDecimals));
   }
 }
 
@@ -187,8 +210,8 @@ void AppendStateAndQuantities(CResultText& list, const CRecord& record, const St
                             cancelled,
                             filled,
                             standing.timeInForce,
-                            record.Text(kFailure, kAny),
-                            record.Text(kN6, kAny),
+                            record.Text(kOrderState),
+                            record.Text(kHandlingFlag),
                             message,
                             market};
   list.Append(WIRE("@%d@%s"), quantity, OrderStateText(state));
@@ -197,7 +220,7 @@ void AppendStateAndQuantities(CResultText& list, const CRecord& record, const St
 }
 
 void LogNumber(std::string_view number) {
-  char scratch[kAny];
+  char scratch[kRecord];
   CTextWriter line(scratch, sizeof scratch);
   line.AppendText(number);
   debuglog(line.Text());
@@ -205,23 +228,23 @@ void LogNumber(std::string_view number) {
 
 // Appends the record; false when it is no kind of order.
 bool AppendOrder(CResultText& list, const CRecord& record, int32_t market, Standing& standing) {
-  const std::string_view callPut = record.Text(kCallPut, 8);
+  const std::string_view callPut = record.Text(kCallPut1);
   const bool option = callPut == "C" || callPut == "P";
   if (!option && !IsBlank(callPut)) return false;
-  const bool failed = record.Text(kFailure, kAny) == "E";
-  const std::string_view message = failed ? record.Text(kFailureText, 512) : std::string_view();
+  const bool failed = record.Text(kOrderState) == "E";
+  const std::string_view message = failed ? record.Text(kGatewayText) : std::string_view();
 
-  list.Append(WIRE("%s@%s"), record.Text(kNumber, kAny), record.Text(kReference, kAny));
+  list.Append(WIRE("%s@%s"), record.Text(kGatewayNumber), record.Text(kOrderNumber));
   AppendLegCodes(list, record, option, standing);
   AppendContract(list, record, standing.product);
   AppendStateAndQuantities(list, record, standing, message, market);
   AppendPrice(list, record);
-  const CTransDate date(record.Text(kDate, kAny));
-  const CTransDate orderDate(record.Text(kOrderDate, kAny));
-  list.Append(WIRE("@%s@%s@%s@%s"), FirstSix(record.Text(kTime, kAny)), date.Text(),
-              orderDate.Text(), record.Text(kN6, kAny));
-  const std::string_view mt = record.Text(kMT, kAny);
-  list.Append(WIRE("@%s@%c"), JVFlag(record.Text(kJV, kAny), !message.empty()),
+  const CTransDate date(record.Text(kEntryDate));
+  const CTransDate orderDate(record.Text(kOrderDate));
+  list.Append(WIRE("@%s@%s@%s@%s"), FirstSix(record.Text(kEntryTime)), date.Text(),
+              orderDate.Text(), record.Text(kHandlingFlag));
+  const std::string_view mt = record.Text(kFlagMT);
+  list.Append(WIRE("@%s@%c"), JVFlag(record.Text(kChangeable), !message.empty()),
               standing.timeInForce);
   list.Append(WIRE("@%s!"), mt.empty() ? " " : mt);
   return true;
@@ -246,7 +269,7 @@ char* CGatewayFut::QueryOrderDecode(const char* reply, int* status) {
   *status = 1;
   const std::string_view text = AsText(reply);
   if (text.empty()) return Fail(kNoReply, status);
-  CReplyList orders(text, kTags, kShape);
+  CReplyList orders(text, kTags);
   if (orders.Code().empty()) return Fail("", status);
   if (char* const answer = AnswerWithoutData(orders, "0!", status)) return answer;
 
@@ -256,9 +279,9 @@ char* CGatewayFut::QueryOrderDecode(const char* reply, int* status) {
   while (orders.Next()) {
     const CRecord& record = orders.Record();
     UpdateTimeInForce(record, standing);
-    if (orders.Code() != kDone) continue;
+    if (orders.Code() != kDoneCode) continue;
     UpdateQuantities(record, standing);
-    LogNumber(record.Text(kNumber, kAny));
+    LogNumber(record.Text(kGatewayNumber));
     if (!AppendOrder(list, record, m_nMarket, standing)) return Fail(kLegKindError, status);
     ++count;
   }

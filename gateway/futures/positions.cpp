@@ -14,9 +14,6 @@
 
 namespace {
 
-// No smaller buffer is named for any field: the record is their bound.
-constexpr size_t kAny = kFuturesRecordSize;
-
 constexpr int kPriceDecimals = 4;
 
 // A section is never longer than twice its reply: the shortest record, 16 characters, gives 19, and
@@ -25,6 +22,7 @@ constexpr size_t kSectionPerReply = 2;
 
 constexpr std::string_view kNoOptions = "<6>!0!";
 
+// Of the fields that are named by their tags no more is known than where the result shows them.
 enum Field {
   kCommodity1 = kOwnFields,
   kCommodity2,
@@ -36,61 +34,48 @@ enum Field {
   kStrike2,
   kSide1,
   kSide2,
-  kField48,
-  kW5,
-  kR8,
-  kField50,
+  kPrice48,
+  kPriceW5,
+  kQuantityR8,
+  kDate50,
   kCurrency
 };
 
-constexpr CTagTable kTags({{"67"},
-                           {"68"},
-                           {"M2"},
-                           {"33"},
-                           {"V9"},
-                           {"29"},
-                           {"W0"},
-                           {"V8"},
-                           {"W1"},
-                           {"34"},
-                           {"W2"},
-                           {"32"},
-                           {"EL"},
-                           {"48"},
-                           {"W5"},
-                           {"R8"},
-                           {"50"},
-                           {"28"}});
-static_assert(OpensListTable(kTags));
-
-constexpr ListShape kShape = {kFuturesRecordSize, kAny, kReplyCodeSize, kRefusalSize, true};
+constexpr TagRow kRows[] = {
+    {kSequence, "67", kRecord},   {kResultCode, "68", 8},       {kMessage, "M2", kNotRead},
+    {kCommodity1, "33", kRecord}, {kCommodity2, "V9", kRecord}, {kMonth1, "29", kRecord},
+    {kMonth2, "W0", kRecord},     {kCallPut1, "V8", kRecord},   {kCallPut2, "W1", kRecord},
+    {kStrike1, "34", kRecord},    {kStrike2, "W2", kRecord},    {kSide1, "32", kRecord},
+    {kSide2, "EL", kRecord},      {kPrice48, "48", kRecord},    {kPriceW5, "W5", kRecord},
+    {kQuantityR8, "R8", kRecord}, {kDate50, "50", kRecord},     {kCurrency, "28", kRecord}};
+constexpr CListTable kTags(kRows, kFuturesList);
 
 // One record with its values read.
 struct Position {
   explicit Position(const CRecord& record)
-      : commodity1(record.Text(kCommodity1, kAny)),
-        commodity2(record.Text(kCommodity2, kAny)),
-        month1(record.Text(kMonth1, kAny)),
-        month2(record.Text(kMonth2, kAny)),
-        callPut1(record.Text(kCallPut1, kAny)),
-        callPut2(record.Text(kCallPut2, kAny)),
-        side1(record.Text(kSide1, kAny)),
-        side2(record.Text(kSide2, kAny)),
-        w5(record.Text(kW5, kAny)),
-        field50(record.Text(kField50, kAny)),
-        currency(record.Text(kCurrency, kAny)),
-        strike1(ScalePrice(record.Text(kStrike1, kAny), kPriceDecimals)),
-        strike2(ScalePrice(record.Text(kStrike2, kAny), kPriceDecimals)),
-        price48(ScalePrice(record.Text(kField48, kAny), kPriceDecimals)),
+      : commodity1(record.Text(kCommodity1)),
+        commodity2(record.Text(kCommodity2)),
+        month1(record.Text(kMonth1)),
+        month2(record.Text(kMonth2)),
+        callPut1(record.Text(kCallPut1)),
+        callPut2(record.Text(kCallPut2)),
+        side1(record.Text(kSide1)),
+        side2(record.Text(kSide2)),
+        w5(record.Text(kPriceW5)),
+        date50(record.Text(kDate50)),
+        currency(record.Text(kCurrency)),
+        strike1(ScalePrice(record.Text(kStrike1), kPriceDecimals)),
+        strike2(ScalePrice(record.Text(kStrike2), kPriceDecimals)),
+        price48(ScalePrice(record.Text(kPrice48), kPriceDecimals)),
         priceW5(ScalePrice(w5, kPriceDecimals)),
-        r8(record.Number(kR8, kAny)) {}
+        quantityR8(record.Number(kQuantityR8)) {}
 
   bool IsOption() const { return callPut1 == "P" || callPut1 == "C"; }
   bool HasTwoLegs() const { return !commodity2.empty(); }
 
   std::string_view commodity1, commodity2, month1, month2, callPut1, callPut2, side1, side2, w5,
-      field50, currency;
-  int32_t strike1, strike2, price48, priceW5, r8;
+      date50, currency;
+  int32_t strike1, strike2, price48, priceW5, quantityR8;
 };
 
 const char* CurrencyName(std::string_view code) {
@@ -111,11 +96,11 @@ void AppendFutures(CResultText& list, const Position& position) {
   const char* const currency = CurrencyName(position.currency);
   if (position.HasTwoLegs()) {
     list.Append(WIRE("%s|%s@TIMEX&Y&%s&%s00|%s00@%d@%ld|%ld@%s@%s!"), position.side1,
-                position.side2, position.commodity1, position.month1, position.month2, position.r8,
-                position.price48, position.priceW5, position.field50, currency);
+                position.side2, position.commodity1, position.month1, position.month2,
+                position.quantityR8, position.price48, position.priceW5, position.date50, currency);
   } else {
     list.Append(WIRE("%s@TIMEX&F&%s&%s00@%d@%ld@%s@%s!"), position.side1, position.commodity1,
-                position.month1, position.r8, position.price48, position.field50, currency);
+                position.month1, position.quantityR8, position.price48, position.date50, currency);
   }
 }
 
@@ -123,16 +108,16 @@ void AppendFutures(CResultText& list, const Position& position) {
 void AppendOption(CResultText& list, const Position& position) {
   if (!position.HasTwoLegs()) {
     list.Append(WIRE("%s@TIMEX&O&%s&%s00&%s&%ld@%d@%ld@%s!"), position.side1, position.commodity1,
-                position.month1, position.callPut1, position.strike1, position.r8, position.price48,
-                position.field50);
+                position.month1, position.callPut1, position.strike1, position.quantityR8,
+                position.price48, position.date50);
     return;
   }
   list.Append(WIRE("%s|%s@TIMEX&X&%s|%s&%s00|%s00&%s|%s&%ld|%ld@%d@%ld|"), position.side1,
               position.side2, position.commodity1, position.commodity2, position.month1,
               position.month2, position.callPut1, position.callPut2, position.strike1,
-              position.strike2, position.r8, position.price48);
+              position.strike2, position.quantityR8, position.price48);
   if (!position.w5.empty()) list.Append(WIRE("%ld"), position.priceW5);
-  list.Append(WIRE("@%s!"), position.field50);
+  list.Append(WIRE("@%s!"), position.date50);
 }
 
 }  // namespace
@@ -155,7 +140,7 @@ char* CGatewayFut::QueryInventoryDecode(const char* reply, int* status) {
   const std::string_view text = AsText(reply);
   if (char* const answer = AnswerWithoutRecords(text, "<5>!0!<6>!0!", status)) return answer;
 
-  CReplyList positions(text, kTags, kShape);
+  CReplyList positions(text, kTags);
   CResultText futures(FutText(), kSectionPerReply * text.size());
   CResultText options(OptText(), kSectionPerReply * text.size());
   int futuresCount = 0;

@@ -5,34 +5,30 @@
 #include <cstddef>
 #include <string_view>
 
-#include "gateway/core/reply_reader.h"
+#include "gateway/core/list_frame.h"
 #include "gateway/core/text_writer.h"
 
-// Buffers of a code and of a refusal's message.
-inline constexpr size_t kReplyCodeSize = 8;
-inline constexpr size_t kRefusalSize = 512;
+// Room for one record: a longer one reads as empty. It bounds the fields that have no smaller one.
+inline constexpr size_t kRecord = 1024;
 
-inline constexpr std::string_view kDone = "0000";
-inline constexpr std::string_view kNoData = "5001";
+// Fills and positions: a record without content ends them too.
+inline constexpr ListShape kFuturesList = {kRecord, true};
 
-// A record numbered so, or above, marks the end of every futures list.
-inline constexpr int kEndMark = 900000;
-
-// Room for one record: a longer one reads as empty.
-inline constexpr size_t kFuturesRecordSize = 1024;
+// What the reply as a whole says; a record's own code and message have the same bounds.
+inline constexpr ReplyField kReplyCode = {"68", 8};
+inline constexpr ReplyField kRefusal = {"M2", 512};
 
 inline std::string_view ReplyCode(std::string_view reply) {
-  return Bounded(FindField(reply, "68", Blanks::kTaken), kReplyCodeSize);
+  return ReadField(reply, kReplyCode);
 }
 
 // The code itself, or "message(code)" when it is neither done nor "no data": the gateway's message
 // as it stands, without a source.
 inline void WriteReplyCode(std::string_view code, std::string_view reply, CTextWriter& out) {
-  if (code == kDone || code == kNoData) {
+  if (code == kDoneCode || code == kNoDataCode) {
     out.AppendText(code);
   } else {
-    const std::string_view message = FindField(reply, "M2", Blanks::kTaken);
-    out.Append(WIRE("%s(%s)"), Bounded(message, kRefusalSize), code);
+    out.Append(WIRE("%s(%s)"), ReadField(reply, kRefusal), code);
   }
 }
 

@@ -9,17 +9,26 @@
 
 namespace {
 
-constexpr size_t kRecordSize = 218;
-constexpr size_t kValueSize = 24;
+constexpr size_t kRecord = 218;
 
-enum Field { kCode = kOwnFields, k76, k77, kB8, kB9, kA0, kA1, kA2 };
+// Of the figures no more is known than where the result shows them. There is no list to end.
+enum Field {
+  kStockCode = kOwnFields,
+  kFigure76,
+  kFigure77,
+  kFigureB8,
+  kFigureB9,
+  kFigureA0,
+  kFigureA1,
+  kFigureA2
+};
 
-constexpr CTagTable kTags(
-    {{"67"}, {"68"}, {"M2"}, {"29"}, {"76"}, {"77"}, {"B8"}, {"B9"}, {"A0"}, {"A1"}, {"A2"}});
-static_assert(OpensListTable(kTags), "the list frame reads its rows");
-
-// There is no list to end: the sequence is not read. A refusal is as long as its record lets it be.
-constexpr ListShape kShape = {kRecordSize, kRecordSize, kValueSize, kRecordSize};
+constexpr TagRow kRows[] = {
+    {kSequence, "67", kNotRead}, {kResultCode, "68", 24}, {kMessage, "M2", kRecord},
+    {kStockCode, "29", 24},      {kFigure76, "76", 24},   {kFigure77, "77", 24},
+    {kFigureB8, "B8", 24},       {kFigureB9, "B9", 24},   {kFigureA0, "A0", 24},
+    {kFigureA1, "A1", 24},       {kFigureA2, "A2", 24}};
+constexpr CListTable kTags(kRows, {kRecord});
 
 }  // namespace
 
@@ -40,12 +49,13 @@ char* CGatewayStk::QueryCreditInfoDecode(const char* reply, int* status) {
   *status = 1;
   const std::string_view text = AsText(reply);
   if (TransportFailed(text, status)) return m_szBuffer;
-  const CReplyList credit(text, kTags, kShape);
+  const CReplyList credit(text, kTags);
   if (char* const answer = AnswerWithoutData(credit, "@@@@@@@!", status)) return answer;
   CTextWriter answer = StartRequest();
-  for (const int field : {kCode, k76, k77, kB8, kB9, kA0, kA1}) {
-    answer.Append(WIRE("%s@"), credit.Record().Text(field, kValueSize));
+  for (const int field :
+       {kStockCode, kFigure76, kFigure77, kFigureB8, kFigureB9, kFigureA0, kFigureA1}) {
+    answer.Append(WIRE("%s@"), credit.Record().Text(field));
   }
-  answer.Append(WIRE("%s!"), credit.Record().Text(kA2, kValueSize));
+  answer.Append(WIRE("%s!"), credit.Record().Text(kFigureA2));
   return answer.Text();
 }

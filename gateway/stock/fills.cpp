@@ -14,47 +14,40 @@
 
 namespace {
 
+// Of the fields that are named by their tags no more is known than what the result shows.
 enum Field {
-  kReference = kOwnFields,
-  kKind,
+  kOrderNumber = kOwnFields,
+  kOrderKind,
   kTradeType,
   kSide,
   kStockCode,
-  kFilled,
-  kPrice,
-  kField49,
-  kDate,
-  kTime
+  kFilledQuantity,
+  kFillPrice,
+  kNumber49,
+  kDate50,
+  kTime51
 };
 
-constexpr CTagTable kTags({{"67"},
-                           {"68"},
-                           {"M2"},
-                           {"36"},
-                           {"27"},
-                           {"28"},
-                           {"32"},
-                           {"29"},
-                           {"47"},
-                           {"48"},
-                           {"49"},
-                           {"50"},
-                           {"51"}});
-static_assert(OpensListTable(kTags), "the list frame reads its rows");
+constexpr TagRow kRows[] = {
+    {kSequence, "67", 20},    {kResultCode, "68", 20}, {kMessage, "M2", kRecord},
+    {kOrderNumber, "36", 50}, {kOrderKind, "27", 50},  {kTradeType, "28", 50},
+    {kSide, "32", 50},        {kStockCode, "29", 50},  {kFilledQuantity, "47", 50},
+    {kFillPrice, "48", 50},   {kNumber49, "49", 50},   {kDate50, "50", 50},
+    {kTime51, "51", 50}};
+constexpr CListTable kTags(kRows, kStockList);
 
 constexpr COrderTypes kOrderTypes(kOrderTypeRows, kLiveOrderTypeRows);
 
 int TypeCodeOf(const CRecord& record) {
-  return kOrderTypes.Find(record.Number(kKind, kFieldSize), record.Number(kTradeType, kFieldSize),
-                          record.Text(kSide, kFieldSize) == "B");
+  return kOrderTypes.Find(record.Number(kOrderKind), record.Number(kTradeType),
+                          record.Text(kSide) == "B");
 }
 
 void AppendFill(CResultText& list, const CRecord& record, int typeCode) {
-  list.Append(WIRE("%s@%d@%s@%d@%d@%d@%s@%s!"), record.Text(kReference, kFieldSize), typeCode,
-              record.Text(kStockCode, kFieldSize), record.Number(kFilled, kFieldSize),
-              ScalePrice(record.Text(kPrice, kFieldSize), 2), record.Number(kField49, kFieldSize),
-              CTransDate(record.Text(kDate, kFieldSize)).Text(),
-              FirstSix(record.Text(kTime, kFieldSize)));
+  list.Append(WIRE("%s@%d@%s@%d@%d@%d@%s@%s!"), record.Text(kOrderNumber), typeCode,
+              record.Text(kStockCode), record.Number(kFilledQuantity),
+              ScalePrice(record.Text(kFillPrice), 2), record.Number(kNumber49),
+              CTransDate(record.Text(kDate50)).Text(), FirstSix(record.Text(kTime51)));
 }
 
 }  // namespace
@@ -78,13 +71,13 @@ char* CGatewayStk::QueryReplyDecode(const char* reply, int* status) {
   *status = 1;
   const std::string_view text = AsText(reply);
   if (TransportFailed(text, status)) return m_szBuffer;
-  CReplyList fills(text, kTags, kStockListShape);
+  CReplyList fills(text, kTags);
   if (char* const answer = AnswerWithoutData(fills, "0!", status)) return answer;
   CResultText list({m_pData, m_nDataSize, m_nDataLen}, text.size());
   int count = 0;
   while (fills.NextData()) {
     const CRecord& record = fills.Record();
-    if (record.Number(kFilled, kFieldSize) == 0) continue;
+    if (record.Number(kFilledQuantity) == 0) continue;
     const int typeCode = TypeCodeOf(record);
     if (typeCode == kNoOrderType) return Fail(kOrderKindError, status);
     AppendFill(list, record, typeCode);

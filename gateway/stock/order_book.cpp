@@ -19,33 +19,37 @@
 namespace {
 
 enum Field {
-  kNumber = kOwnFields,
-  kReference,
-  kKind,
+  kGatewayNumber = kOwnFields,
+  kOrderNumber,
+  kOrderKind,
   kTradeType,
   kSide,
   kStockCode,
-  kOrdered,
-  kCancelled,
-  kReduced,
-  kFilled,
-  kState,
-  kText,
-  kN6,
+  kOrderedQuantity,
+  kCancelled41,
+  kReduced37,
+  kFilledQuantity,
+  kOrderState,
+  kGatewayText,
+  kHandlingFlag,
   kPrice,
   kPriceKind,
-  kTime,
+  kEntryTime,
   kEntryDate,
   kOrderDate,
   kChangeable
 };
 
-constexpr CTagTable kTags({{"67"}, {"68"}, {"M2"}, {"46"}, {"36"}, {"27"}, {"28"}, {"32"},
-                           {"29"}, {"70"}, {"41"}, {"37"}, {"47"}, {"39"}, {"K1"}, {"N6"},
-                           {"31"}, {"M8"}, {"22"}, {"21"}, {"44"}, {"JV"}});
-static_assert(OpensListTable(kTags), "the list frame reads its rows");
-
-constexpr size_t kTextSize = 200;  // of the gateway's text
+constexpr TagRow kRows[] = {
+    {kSequence, "67", 20},        {kResultCode, "68", 20},  {kMessage, "M2", kRecord},
+    {kGatewayNumber, "46", 50},   {kOrderNumber, "36", 50}, {kOrderKind, "27", 50},
+    {kTradeType, "28", 50},       {kSide, "32", 50},        {kStockCode, "29", 50},
+    {kOrderedQuantity, "70", 50}, {kCancelled41, "41", 50}, {kReduced37, "37", 50},
+    {kFilledQuantity, "47", 50},  {kOrderState, "39", 50},  {kGatewayText, "K1", 200},
+    {kHandlingFlag, "N6", 50},    {kPrice, "31", 50},       {kPriceKind, "M8", 50},
+    {kEntryTime, "22", 50},       {kEntryDate, "21", 50},   {kOrderDate, "44", 50},
+    {kChangeable, "JV", 50}};
+constexpr CListTable kTags(kRows, kStockList);
 
 // What the gateway's text says of an order that it did not fail.
 constexpr std::string_view kAllCancelledText = "全部取消";
@@ -64,8 +68,8 @@ constexpr OrderTypeRow kBookRows[] = {
 constexpr COrderTypes kOrderTypes(kOrderTypeRows, kLiveOrderTypeRows, kBookRows);
 
 int TypeCodeOf(const CRecord& record) {
-  return kOrderTypes.Find(record.Number(kKind, kFieldSize), record.Number(kTradeType, kFieldSize),
-                          record.Text(kSide, kFieldSize) == "B");
+  return kOrderTypes.Find(record.Number(kOrderKind), record.Number(kTradeType),
+                          record.Text(kSide) == "B");
 }
 
 struct Quantities {
@@ -73,8 +77,8 @@ struct Quantities {
 };
 
 Quantities QuantitiesOf(const CRecord& record) {
-  return {record.Number(kOrdered, kFieldSize), record.Number(kFilled, kFieldSize),
-          WrapAdd(record.Number(kReduced, kFieldSize), record.Number(kCancelled, kFieldSize))};
+  return {record.Number(kOrderedQuantity), record.Number(kFilledQuantity),
+          WrapAdd(record.Number(kReduced37), record.Number(kCancelled41))};
 }
 
 // The market's number says whose wording its users know for an order on its way.
@@ -103,9 +107,9 @@ std::string_view StateOf(const Quantities& order, std::string_view text, bool re
 // other order.
 class CFailure {
  public:
-  explicit CFailure(const CRecord& record) : m_bFailed(record.Text(kState, kFieldSize) == "E") {
+  explicit CFailure(const CRecord& record) : m_bFailed(record.Text(kOrderState) == "E") {
     if (!m_bFailed) return;
-    m_nLength = record.Text(kText, kTextSize).copy(m_szText, sizeof m_szText);
+    m_nLength = record.Text(kGatewayText).copy(m_szText, sizeof m_szText);
     std::replace(m_szText, m_szText + m_nLength, '!', ' ');
   }
 
@@ -115,7 +119,7 @@ class CFailure {
  private:
   bool m_bFailed;
   size_t m_nLength = 0;
-  char m_szText[kTextSize];
+  char m_szText[kRows[kGatewayText].bound];
 };
 
 void AppendFailure(CResultText& list, std::string_view text, int market) {
@@ -124,8 +128,8 @@ void AppendFailure(CResultText& list, std::string_view text, int market) {
 }
 
 void AppendPrice(CResultText& list, const CRecord& record) {
-  const int price = ScalePrice(record.Text(kPrice, kFieldSize), 2);
-  switch (record.Number(kPriceKind, kFieldSize)) {
+  const int price = ScalePrice(record.Text(kPrice), 2);
+  switch (record.Number(kPriceKind)) {
     case kLimitDown:
       return list.AppendText(kLimitDownPrice);
     case kFlat:
@@ -140,7 +144,7 @@ void AppendPrice(CResultText& list, const CRecord& record) {
 
 // 1: the order can be changed, 2: it cannot, empty: nothing is known.
 std::string_view ChangeFlagOf(const CRecord& record, const CFailure& failure) {
-  const std::string_view flag = record.Text(kChangeable, kFieldSize);
+  const std::string_view flag = record.Text(kChangeable);
   if (flag == "Y") return "1";
   return flag == "N" || !failure.Text().empty() ? "2" : "";
 }
@@ -148,21 +152,19 @@ std::string_view ChangeFlagOf(const CRecord& record, const CFailure& failure) {
 void AppendOrder(CResultText& list, const CRecord& record, int typeCode, int market) {
   const Quantities order = QuantitiesOf(record);
   const CFailure failure(record);
-  const std::string_view n6 = record.Text(kN6, kFieldSize);
-  list.Append(WIRE("%s@%s@%d@%s@%d@"), record.Text(kNumber, kFieldSize),
-              record.Text(kReference, kFieldSize), typeCode, record.Text(kStockCode, kFieldSize),
-              order.ordered);
+  const std::string_view n6 = record.Text(kHandlingFlag);
+  list.Append(WIRE("%s@%s@%d@%s@%d@"), record.Text(kGatewayNumber), record.Text(kOrderNumber),
+              typeCode, record.Text(kStockCode), order.ordered);
   if (failure.Failed()) {
     AppendFailure(list, failure.Text(), market);
   } else {
-    list.AppendText(StateOf(order, record.Text(kText, kTextSize), n6 == "0", market));
+    list.AppendText(StateOf(order, record.Text(kGatewayText), n6 == "0", market));
   }
   list.Append(WIRE("@%d@%d@"), order.filled, order.cancelled);
   AppendPrice(list, record);
-  list.Append(WIRE("@%s@%s@%s@%s@%s!"), FirstSix(record.Text(kTime, kFieldSize)),
-              CTransDate(record.Text(kEntryDate, kFieldSize)).Text(),
-              CTransDate(record.Text(kOrderDate, kFieldSize)).Text(), n6,
-              ChangeFlagOf(record, failure));
+  list.Append(WIRE("@%s@%s@%s@%s@%s!"), FirstSix(record.Text(kEntryTime)),
+              CTransDate(record.Text(kEntryDate)).Text(),
+              CTransDate(record.Text(kOrderDate)).Text(), n6, ChangeFlagOf(record, failure));
 }
 
 }  // namespace
@@ -185,7 +187,7 @@ IN_ONE_PIECE char* CGatewayStk::QueryOrderDecode(const char* reply, int* status)
   const std::string_view text = AsText(reply);
   LogReply("QueryOrderDecode", text);
   if (TransportFailed(text, status)) return m_szBuffer;
-  CReplyList orders(text, kTags, kStockListShape);
+  CReplyList orders(text, kTags);
   if (char* const answer = AnswerWithoutData(orders, "0!", status)) return answer;
   CResultText list({m_pData, m_nDataSize, m_nDataLen}, text.size());
   int count = 0;

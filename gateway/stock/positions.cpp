@@ -16,25 +16,28 @@
 
 namespace {
 
-constexpr size_t kCodeSize = 20;
+// Of the quantities no more is known than the section of the result that shows them.
+enum Field {
+  kStockCode = kOwnFields,
+  kQuantity75,
+  kQuantity751,
+  kQuantity752,
+  kQuantity76,
+  kQuantity761,
+  kQuantity762,
+  kQuantity77,
+  kQuantity771,
+  kQuantity772,
+  kQuantityPS
+};
 
-enum Field { kCode = kOwnFields, k75, k751, k752, k76, k761, k762, k77, k771, k772, kPs };
-
-constexpr CTagTable kTags({{"67"},
-                           {"68"},
-                           {"M2"},
-                           {"29"},
-                           {"75"},
-                           {"751"},
-                           {"752"},
-                           {"76"},
-                           {"761"},
-                           {"762"},
-                           {"77"},
-                           {"771"},
-                           {"772"},
-                           {"PS"}});
-static_assert(OpensListTable(kTags), "the list frame reads its rows");
+constexpr TagRow kRows[] = {
+    {kSequence, "67", 20},     {kResultCode, "68", 20}, {kMessage, "M2", kRecord},
+    {kStockCode, "29", 20},    {kQuantity75, "75", 50}, {kQuantity751, "751", 50},
+    {kQuantity752, "752", 50}, {kQuantity76, "76", 50}, {kQuantity761, "761", 50},
+    {kQuantity762, "762", 50}, {kQuantity77, "77", 50}, {kQuantity771, "771", 50},
+    {kQuantity772, "772", 50}, {kQuantityPS, "PS", 50}};
+constexpr CListTable kTags(kRows, kStockList);
 
 constexpr size_t kMaxQuantities = 3;
 constexpr size_t kMaxSections = 4;
@@ -87,11 +90,11 @@ class CSections {
     int32_t quantities[kMaxQuantities];
     int32_t sum = 0;
     for (size_t i = 0; i < shape.count; ++i) {
-      quantities[i] = record.Number(shape.quantities[i], kFieldSize);
+      quantities[i] = record.Number(shape.quantities[i]);
       sum = WrapAdd(sum, quantities[i]);
     }
     if (sum == 0) return false;
-    records.Append(WIRE("%s@%d"), record.Text(kCode, kCodeSize), quantities[0]);
+    records.Append(WIRE("%s@%d"), record.Text(kStockCode), quantities[0]);
     for (size_t i = 1; i < shape.count; ++i) records.Append(WIRE("|%d"), quantities[i]);
     records.AppendText(shape.ending);
     return true;
@@ -133,19 +136,20 @@ char* CGatewayStk::QueryInventoryEncode(const char* branch, const char* identity
 }
 
 char* CGatewayStk::QueryInventoryDecode(const char* reply, int* status) {
-  static constexpr PositionLayout kLayout = {{{2, {k75, k751}, "!"},
-                                              {2, {k76, k761}, "@@@@@!"},
-                                              {2, {k77, k771}, "@@@@!"},
-                                              {1, {kPs}, "|0|0!"}},
+  static constexpr PositionLayout kLayout = {{{2, {kQuantity75, kQuantity751}, "!"},
+                                              {2, {kQuantity76, kQuantity761}, "@@@@@!"},
+                                              {2, {kQuantity77, kQuantity771}, "@@@@!"},
+                                              {1, {kQuantityPS}, "|0|0!"}},
                                              "<0>!0!<1>!0!<2>!0!<3>!0!"};
   return ListPositions(reply, kLayout, status);
 }
 
 char* CGatewayStk::QueryInventoryDecodeJZG(const char* reply, int* status) {
-  static constexpr PositionLayout kLayout = {{{3, {k75, k751, k752}, "!"},
-                                              {3, {k76, k761, k762}, "@@@@@!"},
-                                              {3, {k77, k771, k772}, "@@@@!"}},
-                                             "<0>!0!<1>!0!<2>!0!"};
+  static constexpr PositionLayout kLayout = {
+      {{3, {kQuantity75, kQuantity751, kQuantity752}, "!"},
+       {3, {kQuantity76, kQuantity761, kQuantity762}, "@@@@@!"},
+       {3, {kQuantity77, kQuantity771, kQuantity772}, "@@@@!"}},
+      "<0>!0!<1>!0!<2>!0!"};
   return ListPositions(reply, kLayout, status);
 }
 
@@ -155,7 +159,7 @@ char* CGatewayStk::ListPositions(const char* reply, const PositionLayout& layout
   LogReply("QueryInventoryDecode", text);
   *status = 1;
   if (TransportFailed(text, status)) return m_szBuffer;
-  CReplyList positions(text, kTags, kStockListShape);
+  CReplyList positions(text, kTags);
   if (char* const answer = AnswerWithoutData(positions, layout.noData, status)) return answer;
 
   const ScratchBlock scratch(kMaxSections, text.size());

@@ -20,9 +20,6 @@
 
 namespace {
 
-// No smaller buffer is named for any field: the record is their bound.
-constexpr size_t kAny = kStockListShape.record;
-
 // The period codes of the selectors 1 to 6; the gateway knows no code 3.
 constexpr const char* kPeriodCodes[] = {"1", "2", "4", "5", "6", "7"};
 
@@ -32,34 +29,41 @@ const char* PeriodCodeOf(const char* period) {
   return row < std::size(kPeriodCodes) ? kPeriodCodes[row] : nullptr;
 }
 
+// Of the fields that are named by their tags no more is known than where the result shows them.
 enum Field {
-  kDate = kOwnFields,
-  kKind,
+  kDate50 = kOwnFields,
+  kOrderKind,
   kTradeType,
   kSide,
   kStockCode,
-  k47,
-  kPrice,
-  k49,
-  k79,
-  k78,
-  k84,
-  k81,
-  k82,
-  k85,
-  k87,
-  k86,
-  k89,
-  k88,
+  kQuantity47,
+  kPrice48,
+  kAmount49,
+  kAmount79,
+  kAmount78,
+  kAmount84,
+  kAmount81,
+  kAmount82,
+  kAmount85,
+  kAmount87,
+  kAmount86,
+  kAmount89,
+  kAmount88,
   kSign,
-  k97,
-  kType
+  kAmount97,
+  kTypeText
 };
 
-constexpr CTagTable kTags({{"67"}, {"68"}, {"M2"}, {"50"}, {"27"}, {"28"}, {"32"}, {"29"},
-                           {"47"}, {"48"}, {"49"}, {"79"}, {"78"}, {"84"}, {"81"}, {"82"},
-                           {"85"}, {"87"}, {"86"}, {"89"}, {"88"}, {"96"}, {"97"}, {"KT"}});
-static_assert(OpensListTable(kTags), "the list frame reads its rows");
+constexpr TagRow kRows[] = {
+    {kSequence, "67", 20},      {kResultCode, "68", 20},     {kMessage, "M2", kRecord},
+    {kDate50, "50", kRecord},   {kOrderKind, "27", kRecord}, {kTradeType, "28", kRecord},
+    {kSide, "32", kRecord},     {kStockCode, "29", kRecord}, {kQuantity47, "47", kRecord},
+    {kPrice48, "48", kRecord},  {kAmount49, "49", kRecord},  {kAmount79, "79", kRecord},
+    {kAmount78, "78", kRecord}, {kAmount84, "84", kRecord},  {kAmount81, "81", kRecord},
+    {kAmount82, "82", kRecord}, {kAmount85, "85", kRecord},  {kAmount87, "87", kRecord},
+    {kAmount86, "86", kRecord}, {kAmount89, "89", kRecord},  {kAmount88, "88", kRecord},
+    {kSign, "96", kRecord},     {kAmount97, "97", kRecord},  {kTypeText, "KT", kRecord}};
+constexpr CListTable kTags(kRows, kStockList);
 
 // Kinds from 5 on, without regard to trade type and side: `code` is the first kind's, and the
 // others follow in order.
@@ -72,11 +76,11 @@ constexpr KindRange kKindRanges[] = {{5, 17, 19}, {20, 25, 32}, {26, 26, 39}};
 constexpr COrderTypes kOrderTypes(kOrderTypeRows);
 
 int TypeCodeOf(const CRecord& record) {
-  const int kind = record.Number(kKind, kAny);
+  const int kind = record.Number(kOrderKind);
   for (const KindRange& range : kKindRanges) {
     if (kind >= range.first && kind <= range.last) return range.code + (kind - range.first);
   }
-  return kOrderTypes.Find(kind, record.Number(kTradeType, kAny), record.Text(kSide, kAny) == "B");
+  return kOrderTypes.Find(kind, record.Number(kTradeType), record.Text(kSide) == "B");
 }
 
 // The two amounts that records of these kinds or types show.
@@ -88,14 +92,14 @@ struct PairRow {
 void AppendPair(CResultText& list, const CRecord& record, const PairRow (&rows)[2], int selector) {
   for (const PairRow& row : rows) {
     if (!row.selectors.Has(selector)) continue;
-    list.Append(WIRE("%s@%s@"), record.Text(row.first, kAny), record.Text(row.second, kAny));
+    list.Append(WIRE("%s@%s@"), record.Text(row.first), record.Text(row.second));
     return;
   }
   list.AppendText("0@0@");
 }
 
 std::string_view TextOrZero(const CRecord& record, int field) {
-  return record.Has(field) ? record.Text(field, kAny) : "0";
+  return record.Has(field) ? record.Text(field) : "0";
 }
 
 }  // namespace
@@ -128,13 +132,17 @@ char* CGatewayStk::PaymentEncode(const char* branch, const char* identity, const
 
 char* CGatewayStk::PaymentDecode(const char* reply, int* status) {
   static constexpr PaymentLayout kLayout = {
-      false, kKind, {{SetOf(1, 3), k81, k82}, {SetOf(2, 4), k85, k87}}};
+      false,
+      kOrderKind,
+      {{SetOf(1, 3), kAmount81, kAmount82}, {SetOf(2, 4), kAmount85, kAmount87}}};
   return ListPayments(reply, kLayout, status);
 }
 
 char* CGatewayStk::PaymentDecodeJZG(const char* reply, int* status) {
   static constexpr PaymentLayout kLayout = {
-      true, kType, {{SetOf(1, 12, 13), k81, k82}, {SetOf(2, 21, 22), k85, k87}}};
+      true,
+      kTypeText,
+      {{SetOf(1, 12, 13), kAmount81, kAmount82}, {SetOf(2, 21, 22), kAmount85, kAmount87}}};
   return ListPayments(reply, kLayout, status);
 }
 
@@ -142,21 +150,21 @@ char* CGatewayStk::PaymentDecodeJZG(const char* reply, int* status) {
 // other than a minus is none.
 bool CGatewayStk::AppendPayment(CResultText& list, const CRecord& record,
                                 const PaymentLayout& layout) {
-  list.Append(WIRE("%s@@"), CTransDate(record.Text(kDate, kAny)).Text());
+  list.Append(WIRE("%s@@"), CTransDate(record.Text(kDate50)).Text());
   if (layout.hasTypeText) {
-    list.AppendText(record.Text(kType, kAny));
+    list.AppendText(record.Text(kTypeText));
   } else {
     const int typeCode = TypeCodeOf(record);
     if (typeCode == kNoOrderType) return false;
     list.Append(WIRE("%d"), typeCode);
   }
-  list.Append(WIRE("@%s@%s@%d@%s@%s@%s@%s@"), record.Text(kStockCode, kAny), record.Text(k47, kAny),
-              ScalePrice(record.Text(kPrice, kAny), 2), record.Text(k49, kAny),
-              record.Text(k79, kAny), record.Text(k78, kAny), record.Text(k84, kAny));
-  AppendPair(list, record, layout.pairs, record.Number(layout.selector, kAny));
-  list.Append(WIRE("%s@%s@%s@%s@%s!"), TextOrZero(record, k86), TextOrZero(record, k89),
-              TextOrZero(record, k88), record.Text(kSign, kAny) == "-" ? "-" : "",
-              record.Text(k97, kAny));
+  list.Append(WIRE("@%s@%s@%d@%s@%s@%s@%s@"), record.Text(kStockCode), record.Text(kQuantity47),
+              ScalePrice(record.Text(kPrice48), 2), record.Text(kAmount49), record.Text(kAmount79),
+              record.Text(kAmount78), record.Text(kAmount84));
+  AppendPair(list, record, layout.pairs, record.Number(layout.selector));
+  list.Append(WIRE("%s@%s@%s@%s@%s!"), TextOrZero(record, kAmount86), TextOrZero(record, kAmount89),
+              TextOrZero(record, kAmount88), record.Text(kSign) == "-" ? "-" : "",
+              record.Text(kAmount97));
   return true;
 }
 
@@ -166,7 +174,7 @@ char* CGatewayStk::ListPayments(const char* reply, const PaymentLayout& layout, 
   LogReply("PaymentDecode", text);
   *status = 1;
   if (TransportFailed(text, status)) return m_szBuffer;
-  CReplyList payments(text, kTags, kStockListShape);
+  CReplyList payments(text, kTags);
   if (char* const answer = AnswerWithoutData(payments, "0!", status)) return answer;
   CResultText list({m_pData, m_nDataSize, m_nDataLen}, text.size());
   int count = 0;

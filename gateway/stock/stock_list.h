@@ -4,9 +4,9 @@
 
 #include "gateway/core/list_frame.h"
 
-// Buffers in bytes: a record or value that does not fit with a terminator reads as empty.
-inline constexpr ListShape kStockListShape = {400, 20, 20, 400};
+// The record buffer: a longer record reads as empty. It bounds the fields that have no smaller one.
+inline constexpr size_t kRecord = 400;
 
-inline constexpr size_t kFieldSize = 50;  // of a record's value
+inline constexpr ListShape kStockList = {kRecord};
 
 #endif  // QUORVANE_GATEWAY_STOCK_STOCK_LIST_H_

@@ -12,14 +12,29 @@ namespace {
 
 enum Field { kName = kOwnFields };
 
-constexpr CTagTable kTags({{"67"}, {"68"}, {"M2"}, {"46"}});
-static_assert(OpensListTable(kTags));
-static_assert(!OpensListTable(CTagTable({{"68"}, {"67"}, {"M2"}})));
-static_assert(!OpensListTable(CTagTable({{"67"}, {"68"}, {"46"}})));
+constexpr TagRow kRows[] = {
+    {kSequence, "67", 8}, {kResultCode, "68", 6}, {kMessage, "M2", 10}, {kName, "46", 60}};
+constexpr TagRow kSwappedTags[] = {
+    {kSequence, "68", 8}, {kResultCode, "67", 6}, {kMessage, "M2", 10}};
+constexpr TagRow kNoMessage[] = {{kSequence, "67", 8}, {kResultCode, "68", 6}, {2, "46", 10}};
 
-constexpr ListShape kShape = {60, 8, 6, 10};
-constexpr ListShape kShapeToEmpty = {60, 8, 6, 10, true};
-constexpr ListShape kShapeToLaterEnd = {60, 8, 6, 10, false, 900001};
+// Whether a constant table of these rows builds.
+template <const auto& kTable, int = (static_cast<void>(CListTable(kTable, {60})), 0)>
+constexpr bool Builds(int) {
+  return true;
+}
+template <const auto& kTable>
+constexpr bool Builds(...) {
+  return false;
+}
+
+static_assert(Builds<kRows>(0));
+static_assert(!Builds<kSwappedTags>(0));
+static_assert(!Builds<kNoMessage>(0));
+
+constexpr CListTable kTags(kRows, {60});
+constexpr CListTable kToEmpty(kRows, {60, true});
+constexpr CListTable kToLaterEnd(kRows, {60, false, 900001});
 
 std::string Record(const std::string& sequence, const std::string& code, const std::string& name) {
   return "|00=|67=" + sequence + "|68=" + code + "|46=" + name + "|01=";
@@ -56,17 +71,17 @@ TEST(ListFrame, FirstRecordSpeaksForTheReply) {
        ListVerdict::kRefused, "E001", ""},
   };
   for (const VerdictCase& row : rows) {
-    const CReplyList list(row.reply, kTags, kShape);
+    const CReplyList list(row.reply, kTags);
     EXPECT_EQ(list.Verdict(), row.verdict) << row.label;
     EXPECT_EQ(list.Code(), row.code) << row.label;
     EXPECT_EQ(list.Message(), row.message) << row.label;
   }
 }
 
-std::string NamesOf(const std::string& reply, const ListShape& shape) {
+std::string NamesOf(const std::string& reply, const CListTable& tags) {
   std::string names;
-  for (CReplyList list(reply, kTags, shape); list.NextData();) {
-    names += std::string(list.Record().Text(kName, 60)) + ".";
+  for (CReplyList list(reply, tags); list.NextData();) {
+    names += std::string(list.Record().Text(kName)) + ".";
   }
   return names;
 }
@@ -98,20 +113,20 @@ TEST(ListFrame, WalkEndsAtTheEndMarkOrWithTheReply) {
       {"nothing", "", "", ""},
   };
   for (const WalkCase& row : rows) {
-    EXPECT_EQ(NamesOf(row.reply, kShape), row.names) << row.label;
-    EXPECT_EQ(NamesOf(row.reply, kShapeToEmpty), row.namesToEmpty) << row.label;
+    EXPECT_EQ(NamesOf(row.reply, kTags), row.names) << row.label;
+    EXPECT_EQ(NamesOf(row.reply, kToEmpty), row.namesToEmpty) << row.label;
   }
 }
 
 TEST(ListFrame, EndMarkIsTheLists) {
   const std::string reply = Record("900000", "0000", "a") + Record("900001", "0000", "b");
-  EXPECT_EQ(NamesOf(reply, kShape), "");
-  EXPECT_EQ(NamesOf(reply, kShapeToLaterEnd), "a.");
+  EXPECT_EQ(NamesOf(reply, kTags), "");
+  EXPECT_EQ(NamesOf(reply, kToLaterEnd), "a.");
 }
 
 TEST(ListFrame, NextShowsRecordsWithoutDataToo) {
   const std::string reply = Record("1", "E1", "a") + Record("2", "0000", "b");
-  CReplyList list(reply, kTags, kShape);
+  CReplyList list(reply, kTags);
   ASSERT_TRUE(list.Next());
   EXPECT_EQ(list.Code(), "E1");
   ASSERT_TRUE(list.Next());
@@ -121,7 +136,7 @@ TEST(ListFrame, NextShowsRecordsWithoutDataToo) {
 
 TEST(ListFrame, EndIsForGood) {
   const std::string reply = Record("900000", "0000", "end") + Record("1", "0000", "a");
-  CReplyList list(reply, kTags, kShape);
+  CReplyList list(reply, kTags);
   for (int i = 0; i < 3; ++i) EXPECT_FALSE(list.Next());
 }
 

@@ -12,54 +12,61 @@
 namespace gateway_tests {
 namespace {
 
-constexpr TagRow kRows[] = {{"67"},
-                            {"68"},
-                            {"M2"},
-                            {"PN"},
-                            {"17", Blanks::kSkipped},
-                            {"751"},
-                            {"75"},
-                            {"18", Blanks::kSkipped}};
+enum Field { kCode = kResultCode, kBalance = kOwnFields, kHead, kChange, kOpening, kTail };
+
+constexpr TagRow kRows[] = {{kSequence, "67", 7},
+                            {kCode, "68", 5},
+                            {kMessage, "M2", 20},
+                            {kBalance, "PN", 5},
+                            {kHead, "17", 5, Blanks::kSkipped},
+                            {kChange, "751", 5},
+                            {kOpening, "75", 5},
+                            {kTail, "18", 5, Blanks::kSkipped}};
 constexpr CTagTable kTags(kRows);
 constexpr int kRowCount = static_cast<int>(std::size(kRows));
 
-// As many tags as a table holds; the first and the last skip blanks.
-constexpr CTagTable kFullTable({{"A0", Blanks::kSkipped},
-                                {"A1"},
-                                {"A2"},
-                                {"A3"},
-                                {"A4"},
-                                {"A5"},
-                                {"A6"},
-                                {"A7"},
-                                {"A8"},
-                                {"A9"},
-                                {"B0"},
-                                {"B1"},
-                                {"B2"},
-                                {"B3"},
-                                {"B4"},
-                                {"B5"},
-                                {"B6"},
-                                {"B7"},
-                                {"B8"},
-                                {"B9"},
-                                {"750"},
-                                {"751"},
-                                {"752"},
-                                {"753"},
-                                {"754"},
-                                {"755"},
-                                {"756"},
-                                {"757"},
-                                {"758"},
-                                {"759"},
-                                {"75"},
-                                {"76", Blanks::kSkipped}});
+// Whether a constant table of these rows builds.
+template <const auto& kTable, int = (static_cast<void>(CTagTable(kTable)), 0)>
+constexpr bool Builds(int) {
+  return true;
+}
+template <const auto& kTable>
+constexpr bool Builds(...) {
+  return false;
+}
+
+constexpr TagRow kSwapped[] = {{kCode, "68", 5}, {kSequence, "67", 6}};
+constexpr TagRow kLacking[] = {{kSequence, "67", 6}, {kMessage, "M2", 20}};
+constexpr TagRow kTwice[] = {{kSequence, "67", 6}, {kSequence, "68", 5}};
+static_assert(Builds<kRows>(0));
+static_assert(!Builds<kSwapped>(0));
+static_assert(!Builds<kLacking>(0));
+static_assert(!Builds<kTwice>(0));
+
+// As many tags as a table holds; the first, the 33rd and the last skip blanks.
+constexpr int kFull = 64;
+
+struct FullRows {
+  char tags[kFull][4] = {};
+  TagRow rows[kFull] = {};
+
+  constexpr FullRows() {
+    for (int i = 0; i < kFull; ++i) {
+      char* const tag = tags[i];
+      tag[0] = i < 40 ? static_cast<char>('A' + i / 10) : '7';
+      tag[1] = i < 40 ? static_cast<char>('0' + i % 10) : '5';
+      if (i >= 41) tag[2] = static_cast<char>('A' + i - 41);  // behind a bare 75
+      rows[i] = {i, tag, 20};
+    }
+    for (int i : {0, 32, kFull - 1}) rows[i].blanks = Blanks::kSkipped;
+  }
+};
+
+constexpr FullRows kFullRows;
+constexpr CTagTable kFullTable(kFullRows.rows);
 
 std::string TagOfFullTable(int row) {
-  if (row < 20) return std::string(1, row < 10 ? 'A' : 'B') + std::to_string(row % 10);
-  return row < 30 ? "75" + std::to_string(row - 20) : row == 30 ? "75" : "76";
+  return kFullRows.tags[row];
 }
 
 // The key of a reply of this one field. Every key by which a table finds it is the same, as long as
@@ -112,9 +119,9 @@ TEST(ReplyReader, FieldThatEndsWithItsTagIsNotReadFurther) {
 
 TEST(ReplyReader, FullTableFindsEachOfItsTagsAndNoOther) {
   std::string known;
-  for (int row = 0; row < 32; ++row) {
+  for (int row = 0; row < kFull; ++row) {
     EXPECT_EQ(kFullTable.Find(KeyOf(TagOfFullTable(row) + "=1")), row);
-    EXPECT_EQ(kFullTable.Skips() >> row & 1, row == 0 || row == 31 ? 1U : 0U) << row;
+    EXPECT_EQ(kFullTable.Skips() >> row & 1, row == 0 || row == 32 || row == 63 ? 1U : 0U) << row;
     known += "|" + TagOfFullTable(row) + "|";
   }
   for (int first = 1; first < 256; ++first) {
@@ -142,44 +149,53 @@ TEST(ReplyReader, UnknownFieldsAreKeptNowhere) {
 
 TEST(ReplyReader, RecordOfAFullTableHoldsEveryField) {
   std::string reply = "|00=";
-  for (int row = 31; row >= 0; --row)
+  for (int row = kFull - 1; row >= 0; --row)
     reply += "|" + TagOfFullTable(row) + "=v" + std::to_string(row);
   reply += "|01=";
   CRecord record(kFullTable);
   CRecordWalker walker(reply, 1024);
   ASSERT_TRUE(walker.Next(record));
-  for (int row = 0; row < 32; ++row) {
+  for (int row = 0; row < kFull; ++row) {
     EXPECT_TRUE(record.Has(row));
-    EXPECT_EQ(record.Text(row, 20), "v" + std::to_string(row));
+    EXPECT_EQ(record.Text(row), "v" + std::to_string(row));
   }
   EXPECT_FALSE(walker.Next(record));
-  for (int row = 0; row < 32; ++row) EXPECT_FALSE(record.Has(row));
+  for (int row = 0; row < kFull; ++row) EXPECT_FALSE(record.Has(row));
 }
 
-TEST(ReplyReader, ValuesAreReadAsTheirBuffersHoldThem) {
+TEST(ReplyReader, ValuesAreReadAsTheirRowsBoundThem) {
   CRecord record(kTags);
-  CRecordWalker walker("|00=|67=900001|68=0000|17= 12x|75=|01=", 200);
+  CRecordWalker walker("|00=|67=900000|68=00000|17= 12x|75=|01=", 200);
   ASSERT_TRUE(walker.Next(record));
-  EXPECT_EQ(record.Text(0, 6), "");
-  EXPECT_EQ(record.Number(0, 6), 0);
-  EXPECT_TRUE(record.Has(0)) << "too long to be read, but there";
-  EXPECT_EQ(record.Text(0, 7), "900001");
-  EXPECT_EQ(record.Number(0, 7), 900001);
-  EXPECT_EQ(record.Number(4, 10), 12);
-  EXPECT_FALSE(record.Has(6)) << "there, but empty";
-  EXPECT_EQ(record.Text(6, 10), "");
-  EXPECT_FALSE(record.Has(5));
-  EXPECT_EQ(record.Number(5, 10), 0);
+  EXPECT_EQ(record.Text(kSequence), "900000");
+  EXPECT_EQ(record.Number(kSequence), 900000);
+  EXPECT_EQ(record.Text(kCode), "");
+  EXPECT_EQ(record.Number(kCode), 0);
+  EXPECT_TRUE(record.Has(kCode)) << "too long to be read, but there";
+  EXPECT_EQ(record.Number(kHead), 12);
+  EXPECT_FALSE(record.Has(kOpening)) << "there, but empty";
+  EXPECT_EQ(record.Text(kOpening), "");
+  EXPECT_FALSE(record.Has(kChange));
+  EXPECT_EQ(record.Number(kChange), 0);
   EXPECT_EQ(Bounded("abc", 3), "");
   EXPECT_EQ(Bounded("abc", 4), "abc");
   EXPECT_EQ(Bounded("", 0), "");
+}
+
+TEST(ReplyReader, FieldOfAWholeReplyIsReadAsItIsBound) {
+  constexpr ReplyField kShort = {"68", 5}, kSkipping = {"17", 3, Blanks::kSkipped};
+  EXPECT_EQ(ReadField("|68=0000|", kShort), "0000");
+  EXPECT_EQ(ReadField("|68=00000|", kShort), "");
+  EXPECT_EQ(ReadField("|68=|68=0000", kShort), "") << "the first counts";
+  EXPECT_EQ(ReadField("68=0000", kShort), "");
+  EXPECT_EQ(ReadField("|17= |17=12|", kSkipping), "12");
 }
 
 TEST(ReplyReader, FieldsTooShortForATagHideNoOther) {
   CRecord record(kTags);
   CRecordWalker walker("|00=|6|8=1|68|=2|=|||75|1=3|0|1=|68=0000|01|=|01=", 200);
   ASSERT_TRUE(walker.Next(record));
-  EXPECT_EQ(record.Text(1, 8), "0000");
+  EXPECT_EQ(record.Text(kCode), "0000");
   for (int row : {0, 2, 3, 4, 5}) EXPECT_FALSE(record.Has(row)) << row;
   EXPECT_FALSE(walker.Next(record));
 }
@@ -188,12 +204,12 @@ TEST(ReplyReader, LastFieldOfARecordIsNotClosed) {
   CRecord record(kTags);
   CRecordWalker walker("|00=|17= |01=|00=|17=|17= |18= |17=5|01=|00=|17= |010=|01=", 200);
   ASSERT_TRUE(walker.Next(record));
-  EXPECT_EQ(record.Text(4, 10), " ") << "taken as found";
+  EXPECT_EQ(record.Text(kHead), " ") << "taken as found";
   ASSERT_TRUE(walker.Next(record));
-  EXPECT_EQ(record.Text(4, 10), "5");
-  EXPECT_FALSE(record.Has(7));
+  EXPECT_EQ(record.Text(kHead), "5");
+  EXPECT_FALSE(record.Has(kTail));
   ASSERT_TRUE(walker.Next(record));
-  EXPECT_FALSE(record.Has(4)) << "a bar that only looks like the end closes it";
+  EXPECT_FALSE(record.Has(kHead)) << "a bar that only looks like the end closes it";
 }
 
 TEST(ReplyReader, RecordOfItsBoundIsDroppedAndTheWalkGoesOn) {
@@ -225,10 +241,11 @@ void ExpectReadAlike(CGatewayPub& gateway, const std::string& reply, int bound) 
     ASSERT_EQ(record.Empty(), copy[0] == '\0') << reply;
     for (int row = 0; row < kRowCount; ++row) {
       const bool skips = kRows[row].blanks == Blanks::kSkipped;
-      char value[5];
-      const int length = gateway.GetToken(kRows[row].tag, copy, value, sizeof value, skips);
+      char value[20];
+      const int size = static_cast<int>(kRows[row].bound);
+      const int length = gateway.GetToken(kRows[row].tag, copy, value, size, skips);
       ASSERT_EQ(record.Has(row), length > 0) << reply << ", " << kRows[row].tag;
-      ASSERT_EQ(record.Text(row, sizeof value), value) << reply << ", " << kRows[row].tag;
+      ASSERT_EQ(record.Text(row), value) << reply << ", " << kRows[row].tag;
     }
   }
   while (more) {  // closing fields without a record behind the last one
@@ -302,8 +319,8 @@ TEST(ReplyReader, HostileArrangementsOfMarkersAreWalkedInLinearTime) {
   }
 }
 
-constexpr ListShape kShape = {64, 20, 5, 20};
-constexpr ListShape kStoppingShape = {64, 20, 5, 20, true, 900001};
+constexpr CListTable kPlain(kRows, {64});
+constexpr CListTable kStopping(kRows, {64, true, 900001});
 
 struct VerdictCase {
   const char* reply;
@@ -326,18 +343,18 @@ constexpr VerdictCase kVerdictCases[] = {
 
 TEST(ReplyReader, FirstRecordSpeaksForTheList) {
   for (const VerdictCase& row : kVerdictCases) {
-    const CReplyList list(row.reply, kTags, kShape);
+    const CReplyList list(row.reply, kPlain);
     EXPECT_EQ(list.Verdict(), row.verdict) << row.reply;
     EXPECT_EQ(list.Code(), row.code) << row.reply;
     EXPECT_EQ(list.Message(), row.message) << row.reply;
   }
 }
 
-// The values of tag 75 that a list with this shape shows.
-std::string ListOf(const std::string& reply, const ListShape& shape) {
+// The values of tag 75 that a list of this table shows.
+std::string ListOf(const std::string& reply, const CListTable& tags) {
   std::string values;
-  CReplyList list(reply, kTags, shape);
-  while (list.NextData()) values += std::string(list.Record().Text(6, 20)) + ",";
+  CReplyList list(reply, tags);
+  while (list.NextData()) values += std::string(list.Record().Text(kOpening)) + ",";
   EXPECT_FALSE(list.NextData()) << "at its end for good";
   return values;
 }
@@ -369,8 +386,8 @@ TEST(ReplyReader, ListEndsAtItsMarkOrWithTheReply) {
               {refused, "", ""},
               {"", "", ""}};
   for (const auto& row : rows) {
-    EXPECT_EQ(ListOf(row.reply, kShape), row.plain) << row.reply;
-    EXPECT_EQ(ListOf(row.reply, kStoppingShape), row.stopping) << row.reply;
+    EXPECT_EQ(ListOf(row.reply, kPlain), row.plain) << row.reply;
+    EXPECT_EQ(ListOf(row.reply, kStopping), row.stopping) << row.reply;
   }
 }
 
