@@ -43,7 +43,8 @@ class CGatewayPub {
 
   // Append the header of an order likewise. `function` is 'I' (new), 'D' (cancel), 'C' (change) or
   // a futures function letter; `rocDate` a date such as 1130115 or empty. `orderKey`, a buffer of
-  // kBufferSize bytes, receives the text that opens the order's signature payload.
+  // kBufferSize bytes, receives the text that opens the order's signature payload; it stays as it
+  // was where the device's address is missing.
   int initOrderHead(char function, const char* branch, const char* identity, const char* password,
                     const char* rocDate, char* out, char* orderKey);
   int initOrderHead1(char function, const char* branch, const char* identity, const char* password,
@@ -59,7 +60,8 @@ class CGatewayPub {
 
   // Copies the value of the first field `tag` of `reply` into `out` (cleared before, `outSize`
   // bytes) if it fits with its terminator. `skipBlank` passes over empty and single-blank values
-  // that a '|' closes. Returns the value's length, 0 when there is none, even if it did not fit.
+  // that a '|' closes. Returns the value's length, 0 when there is none, even if it did not fit. A
+  // null reply or tag finds nothing.
   int GetToken(const char* tag, const char* reply, char* out, int outSize, bool skipBlank);
 
   // Copies the next record, from "|00=" to before "|01=", into `out` (cleared before) if it fits,
@@ -68,7 +70,8 @@ class CGatewayPub {
 
   // Copies the text from `*cursor` to before `separator` into `out` (not cleared before; may be
   // null) if it fits and is not empty, and moves `*cursor` behind the separator, or to the end of
-  // the text when there is none and `out` is not null.
+  // the text when there is none and `out` is not null. An empty separator is forbidden: the cursor
+  // would stand still.
   void GetFieldString(char** cursor, const char* separator, char* out, int outSize);
 
   // Sets `*status` to -1 and `message` (cleared before) to what to tell the user when the reply is
@@ -78,7 +81,11 @@ class CGatewayPub {
   // Puts "[GATEWAY]" before a message that names no source; `message` has room for 9 more bytes.
   void MakeErrorMsg(char* message);
 
-  // Appends `data`, whose length is `length`, to m_pData; `reset` empties it first.
+  // Joins `data` to the end of the text in m_pData and adds `length`, its length, to m_nDataLen;
+  // `reset` empties both first. A wrong length is booked as it is told, the text is joined whole
+  // all the same. Grows by what is needed plus 4096 zeroed bytes where the text would reach the
+  // capacity; when memory runs out the text stays as it was. Null, an empty text and a length of 0
+  // do nothing. `data` must not lie in m_pData, which may move.
   void AppendData(const char* data, int length, bool reset);
 
   // As the free function of the same name.
@@ -88,7 +95,8 @@ class CGatewayPub {
   // between decimal text and integers scaled by 10^decimals.
 
   // Converts in place, by length: 1130115 and 990115 become western, 20240115 becomes 1130115; any
-  // other text, and one whose number is 0, stays. `date` has room for at least 10 bytes.
+  // other text, and one whose number is 0, stays. `date` has room for at least 10 bytes: a year
+  // before 912 becomes a negative one of four digits.
   void TransDate(char* date);
 
   // 1130115 to 20240115; 0 stays 0.
@@ -104,7 +112,8 @@ class CGatewayPub {
   int32_t GetPriceString(const char* text, int decimals);
   int64_t GetPriceString2(const char* text, int decimals);
 
-  // Appends `src` to `dst`, zero-filled and three times as long, with every blank as "%20".
+  // Appends `src` to `dst`, zero-filled and three times as long, with every blank as "%20". The two
+  // must not overlap: `src` would be overwritten unread, and never end.
   void fctRep(const char* src, char* dst);
 
   // Replaces every `from` in `text` by `to`, both characters; a `to` of 0 cuts the text.
@@ -166,7 +175,7 @@ class CGatewayPub {
   int32_t m_nDataSize;  // capacity of m_pData
   int32_t m_nDataLen;   // characters in m_pData
   char m_szBuffer[kBufferSize];
-  char* m_pData;  // long results; released with array delete
+  char* m_pData;  // a long result, from its first byte on; released with array delete
   int32_t m_nMarket;
   int32_t m_nPlatform;
   int32_t m_nSeqNo;
@@ -220,11 +229,6 @@ class CGatewayPub {
 
  private:
   friend struct OrderKey;
-
-  // Of the texts in m_szSerialNo and m_szLocalIP: kept by their setters, for a look at a field that
-  // was just written would wait for it.
-  size_t m_nSerialNoLen;
-  size_t m_nLocalIPLen;
 
   // Reads the clock and reduces m_nSeqNo modulo 100.
   void TakeStamp(Stamp& stamp);

@@ -27,13 +27,16 @@ constexpr Edition kEditions[] = {
     Named("QVPHONE"), kNoEdition,        Named("QVTAB"),    kNoEdition,       Named("QVLITE"),
     Named("QVPRO"),   Named("QVFUTURE"), Named("QVOPTION"), Named("QVWATCH"), Named("QVPRO")};
 
-// Keeps at most as many characters as the field has; one that they fill has no terminator. `length`
-// is the text's in the field, whose other characters are zero.
+// Keeps at most as many characters as the field has; one that they fill has no terminator.
 template <size_t kSize>
-void SetField(char (&field)[kSize], size_t& length, const char* text) {
-  if (length > 0) memset(field, 0, kSize);
-  length = text == nullptr ? 0 : strnlen(text, kSize);
-  CopyShort(field, text, length);
+void SetField(char (&field)[kSize], const char* text) {
+  memset(field, 0, kSize);
+  if (text != nullptr) memcpy(field, text, strnlen(text, kSize));
+}
+
+template <size_t kSize>
+std::string_view TextOf(const char (&field)[kSize]) {
+  return {field, strnlen(field, kSize)};
 }
 
 }  // namespace
@@ -46,9 +49,7 @@ CGatewayPub::CGatewayPub()
       m_nPlatform(0),
       m_nSeqNo(0),
       m_szSerialNo{},
-      m_szLocalIP{},
-      m_nSerialNoLen(0),
-      m_nLocalIPLen(0) {
+      m_szLocalIP{} {
   m_szBuffer[0] = '\0';
 }
 
@@ -58,11 +59,11 @@ CGatewayPub::~CGatewayPub() {
 }
 
 void CGatewayPub::setSerialNumber(const char* serial) {
-  SetField(m_szSerialNo, m_nSerialNoLen, serial);
+  SetField(m_szSerialNo, serial);
 }
 
 void CGatewayPub::setLocalIP(const char* ip) {
-  SetField(m_szLocalIP, m_nLocalIPLen, ip);
+  SetField(m_szLocalIP, ip);
 }
 
 void CGatewayPub::debuglog(const char* text) {
@@ -70,12 +71,13 @@ void CGatewayPub::debuglog(const char* text) {
 }
 
 std::string_view CGatewayPub::LocalIP() const {
-  return {m_szLocalIP, m_nLocalIPLen};
+  return TextOf(m_szLocalIP);
 }
 
 // A full serial number has no terminator, so the gateway knows it with the address run onto it.
 PaddedText CGatewayPub::SerialNo(std::string_view address, SerialScratch& scratch) const {
-  if (m_nSerialNoLen < sizeof m_szSerialNo) return {{m_szSerialNo, m_nSerialNoLen}};
+  const std::string_view own = TextOf(m_szSerialNo);
+  if (own.size() < sizeof m_szSerialNo) return {own};
   memcpy(scratch, m_szSerialNo, sizeof m_szSerialNo);
   memcpy(scratch + sizeof m_szSerialNo, address.data(), address.size());
   return {{scratch, sizeof m_szSerialNo + address.size()}};

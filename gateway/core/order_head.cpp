@@ -100,9 +100,9 @@ int CGatewayPub::WritePublicHead(OrderHead head, char function, const OrderOrigi
   KeyStore store;
   const OrderKey key(*this, head, function, origin, store);
   const bool written = WriteOrderHead(line, key);
-  if (orderKey != nullptr) {
+  if (orderKey != nullptr && HasAddress(key)) {
     CTextWriter text(orderKey, kBufferSize);
-    if (HasAddress(key)) key.AppendTo(text);
+    key.AppendTo(text);
     text.Text();
   }
   return EndPublicHead(line, written);

@@ -15,8 +15,9 @@ void ClearBuffer(char* out, int size) {
 int CGatewayPub::GetToken(const char* tag, const char* reply, char* out, int outSize,
                           bool skipBlank) {
   ClearBuffer(out, outSize);
+  if (tag == nullptr) return 0;
   const Blanks blanks = skipBlank ? Blanks::kSkipped : Blanks::kTaken;
-  const std::string_view value = FindField(AsText(reply), AsText(tag), blanks);
+  const std::string_view value = FindField(AsText(reply), tag, blanks);
   CopyIfFits(value, out, outSize);
   return static_cast<int>(value.size());
 }

@@ -19,22 +19,25 @@ void Adopt(const HeapText& owner, char* block, size_t size) {
 }  // namespace
 
 void AppendHeapText(const HeapText& owner, const char* text, int length, bool reset) {
-  if (text == nullptr || length <= 0) return;
-  if (reset && owner.length > 0) {
+  const std::string_view added = AsText(text);
+  if (added.empty() || length == 0) return;
+  if (reset && owner.data != nullptr) {
     owner.length = 0;
     memset(owner.data, 0, static_cast<size_t>(owner.size));
   }
-  const auto used = static_cast<size_t>(owner.length);
-  const size_t needed = used + static_cast<size_t>(length);
-  if (needed >= static_cast<size_t>(owner.size)) {
+  const auto size = static_cast<size_t>(owner.size);
+  const size_t used = owner.data == nullptr ? 0 : strnlen(owner.data, size);
+  const size_t needed = used + added.size();
+  if (needed >= size) {
     char* const block = Allocate(needed + kSlack);
     if (block == nullptr) return;
     memset(block, 0, needed + kSlack);
     if (used > 0) memcpy(block, owner.data, used);
     Adopt(owner, block, needed + kSlack);
   }
-  memcpy(owner.data + used, text, strnlen(text, static_cast<size_t>(length)));
-  owner.length = static_cast<int32_t>(needed);
+  memcpy(owner.data + used, added.data(), added.size());
+  owner.data[needed] = '\0';
+  owner.length = WrapAdd(owner.length, length);
 }
 
 char* RenewHeapText(const HeapText& owner, size_t length) {
@@ -49,7 +52,7 @@ char* RenewHeapText(const HeapText& owner, size_t length) {
 CResultText::CResultText(const HeapText& owner, size_t expected)
     : CWireText(&m_cNoRoom, &m_cNoRoom),
       m_owner(owner),
-      m_nExpected(expected),
+      m_nExpected(expected < INT32_MAX ? expected : INT32_MAX),
       m_pRecords(&m_cNoRoom) {
   owner.length = 0;
 }
@@ -57,24 +60,25 @@ CResultText::CResultText(const HeapText& owner, size_t expected)
 char* CResultText::Finish(std::string_view opening, int count) {
   if (m_pRecords == &m_cNoRoom) MakeRoom(0);
   if (m_bFailed) return nullptr;
+  char* const start = m_owner.data;
   const size_t size = opening.size() + DecimalSize(count, 0) + 1;
-  char* const start = m_pRecords - size;
+  const size_t length = Length();
+  memmove(start + size, m_pRecords, length);
   memcpy(start, opening.data(), opening.size());
   WriteDecimal(start + opening.size(), count, 0);
-  m_pRecords[-1] = '!';
-  *m_pAt = '\0';
-  m_owner.length = static_cast<int32_t>(m_pAt - m_owner.data);
+  start[size - 1] = '!';
+  start[size + length] = '\0';
+  m_owner.length = static_cast<int32_t>(size + length);
   return start;
 }
 
 bool CResultText::MakeRoom(size_t count) {
   if (m_bFailed) return false;
   const size_t used = Length();
-  if (m_pRecords != &m_cNoRoom)
-    m_nExpected = m_nExpected < INT32_MAX / 8 ? 8 * m_nExpected : INT32_MAX;
-  if (m_nExpected < used + count) m_nExpected = used + count;
-  const size_t size = kOpeningRoom + m_nExpected + kSlack;
-  char* const block = Allocate(size);
+  const size_t needed = kOpeningRoom + used + count + 1;
+  const size_t wanted = (needed > m_nExpected ? needed : m_nExpected) + kSlack;
+  const size_t size = wanted < INT32_MAX ? wanted : INT32_MAX;
+  char* const block = needed <= size ? Allocate(size) : nullptr;
   if (block == nullptr) {
     m_bFailed = true;
     m_pEnd = m_pAt;  // nothing more fits, however short
@@ -83,6 +87,7 @@ bool CResultText::MakeRoom(size_t count) {
   char* const records = block + kOpeningRoom;
   if (used > 0) memcpy(records, m_pRecords, used);
   Adopt(m_owner, block, size);
+  m_nExpected = size < INT32_MAX / 8 ? 8 * size : INT32_MAX;
   m_pRecords = records;
   m_pAt = records + used;
   m_pEnd = block + size - 1;

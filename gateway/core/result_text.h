@@ -13,24 +13,23 @@ struct HeapText {
   int32_t& length;  // characters
 };
 
-// Appends `length` characters of `text`, growing by what is needed plus 4096 zeroed bytes whenever
-// the text would reach the capacity. `reset` empties the text first. When memory runs out the old
-// text stays as it was.
+// Joins `text` to the text that is there (see CGatewayPub::AppendData).
 void AppendHeapText(const HeapText& owner, const char* text, int length, bool reset);
 
 // Replaces the text by one of `length` characters, all of which its owner fills, and returns it;
 // null, with the old text as it was, when memory runs out.
 char* RenewHeapText(const HeapText& owner, size_t length);
 
-// Writes the records of one list straight into an object's heap text, with room kept before them
-// for what opens the list: the finished list is never copied. A list that memory cannot hold
-// fails once, for good.
+// Writes the records of one list into an object's heap text. A list that memory cannot hold fails
+// once, for good.
 class CResultText : public CWireText<CResultText> {
  public:
   static constexpr bool kGrows = true;
+  static constexpr size_t kOpeningRoom = 20;  // kept before the records for what opens the list
 
   // `owner`'s text is replaced. `expected` is a fair guess of the list's size: a first allocation
-  // holds that much, and a second eight times as much, more than any reply of that size can give.
+  // holds that much, and a second eight times as much, more than any reply of that size can give,
+  // or all that an int can tell.
   CResultText(const HeapText& owner, size_t expected);
   CResultText(const CResultText&) = delete;
   CResultText& operator=(const CResultText&) = delete;
@@ -41,13 +40,11 @@ class CResultText : public CWireText<CResultText> {
   size_t Length() const { return static_cast<size_t>(m_pAt - m_pRecords); }
 
   // The terminated list behind "%s%d!" of `opening` (at most 8 characters) and `count`, or null
-  // when it failed. Lies in the owner's heap text.
+  // when it failed. It begins where the owner's heap text does.
   char* Finish(std::string_view opening, int count);
 
  private:
   friend class CWireText<CResultText>;
-  static constexpr size_t kOpeningRoom = 20;
-
   __attribute__((noinline, cold)) bool MakeRoom(size_t count);
 
   HeapText m_owner;

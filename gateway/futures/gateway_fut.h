@@ -14,6 +14,8 @@ struct FuturesOrder;
 // are the header's (see initQueryHead and initOrderHead).
 class CGatewayFut : public CGatewayPub {
  public:
+  static constexpr size_t kBodySize = 1024;  // of an order's own tags, with terminator
+
   CGatewayFut();
   ~CGatewayFut() override;
 
@@ -50,9 +52,9 @@ class CGatewayFut : public CGatewayPub {
                            char function, char w3, char timeInForce, char unusedLetter, char side1,
                            char side2, int quantity, int unusedNumber, int price, int* status);
 
-  // Append the order's own tags to the terminated text in `body` and turn the order key in
-  // `signature` into the signature payload; both are buffers of kBufferSize bytes. Return 1, or 0
-  // with the parameter error alone in `body`.
+  // Append the order's own tags to the terminated text in `body`, a buffer of kBodySize bytes, and
+  // turn the order key in `signature`, a buffer of kBufferSize bytes, into the signature payload.
+  // Return 1, or 0 with the parameter error alone in `body`.
   int EncodeSubmitOrderRecord(const char* reference, const char* orderDate, const char* commodity1,
                               const char* commodity2, const char* month1, const char* month2,
                               const char* strike1, const char* strike2, const char* callPut1,

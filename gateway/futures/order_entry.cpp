@@ -187,7 +187,7 @@ bool WriteRecord(CGatewayPub& gateway, const FuturesOrder& order, Sign* sign, CT
 // A public record method: what it returns, and its two buffers.
 int EncodeRecord(CGatewayPub& gateway, const FuturesOrder& order, Sign* sign, char* body,
                  char* signature) {
-  CTextWriter line = CTextWriter::Continue(body, CGatewayPub::kBufferSize);
+  CTextWriter line = CTextWriter::Continue(body, CGatewayFut::kBodySize);
   CTextWriter payload = CTextWriter::Continue(signature, CGatewayPub::kBufferSize);
   const bool written = WriteRecord(gateway, order, sign, line, payload);
   const bool fits = !payload.Overflowed();

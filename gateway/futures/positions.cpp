@@ -20,8 +20,6 @@ constexpr int kPriceDecimals = 4;
 // a price gives less than its field.
 constexpr size_t kSectionPerReply = 2;
 
-constexpr std::string_view kNoOptions = "<6>!0!";
-
 // Of the fields that are named by their tags no more is known than where the result shows them.
 enum Field {
   kCommodity1 = kOwnFields,
@@ -134,7 +132,7 @@ char* CGatewayFut::QueryInventoryEncode(const char* branch, const char* identity
   return Finish(line, status, kBadParameters);
 }
 
-// The sections grow side by side in the object's two texts, the first with room for both.
+// The sections grow side by side in the object's two texts.
 char* CGatewayFut::QueryInventoryDecode(const char* reply, int* status) {
   *status = 1;
   const std::string_view text = AsText(reply);
@@ -155,10 +153,15 @@ char* CGatewayFut::QueryInventoryDecode(const char* reply, int* status) {
       ++futuresCount;
     }
   }
-  const char* const section =
-      optionsCount == 0 ? kNoOptions.data() : options.Finish("<6>!", optionsCount);
-  futures.AppendText(AsText(section));
-  char* const result = section == nullptr ? nullptr : futures.Finish("<5>!", futuresCount);
-  if (result == nullptr) *status = -1;
+  const std::string_view first = AsText(futures.Finish("<5>!", futuresCount));
+  const std::string_view second = AsText(options.Finish("<6>!", optionsCount));
+  if (first.empty() || second.empty()) {
+    *status = -1;
+    return nullptr;
+  }
+  char* const result = RenewResult(first.size() + second.size(), status);
+  if (result == nullptr) return nullptr;
+  memcpy(result, first.data(), first.size());
+  memcpy(result + first.size(), second.data(), second.size());
   return result;
 }

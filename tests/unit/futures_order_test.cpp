@@ -55,7 +55,7 @@ class FuturesOrder : public CSessionTest {
 
   // The body or, when the order is refused, the message; the payload goes to m_payload.
   std::string Record(const Order& o, bool inPlaces = false, const std::string& key = "KEY") {
-    const CRoomAtPageEnd body(CGatewayPub::kBufferSize, '\0');
+    const CRoomAtPageEnd body(CGatewayFut::kBodySize, '\0');
     const CRoomAtPageEnd signature(CGatewayPub::kBufferSize, '\0');
     key.copy(signature, key.size());
     const auto method =
@@ -407,7 +407,7 @@ TEST_F(FuturesOrder, ReferenceValuesOfOneTo47Characters) {
 }
 
 TEST_F(FuturesOrder, RecordGoesBehindWhatTheBodyHeldAndFailsAlone) {
-  const CRoomAtPageEnd body(CGatewayPub::kBufferSize, '\0');
+  const CRoomAtPageEnd body(CGatewayFut::kBodySize, '\0');
   const CRoomAtPageEnd signature(CGatewayPub::kBufferSize, '\0');
   const auto encode = [&](char kind, const char* commodity) {
     return m_gateway.EncodeSubmitOrderRecord("", "", commodity, "", "1", "", "", "", "", "", 0,
@@ -424,6 +424,24 @@ TEST_F(FuturesOrder, RecordGoesBehindWhatTheBodyHeldAndFailsAlone) {
   const std::string huge(5000, 'T');
   EXPECT_EQ(encode(1, huge.c_str()), 0);
   EXPECT_EQ(std::string(body), kParameterError);
+}
+
+TEST_F(FuturesOrder, BodyThatFillsItsBufferIsWholeAndOneCharacterMoreFails) {
+  for (bool inPlaces : {false, true}) {
+    for (char function : {'I', 'C'}) {
+      Order order = OfKind(1, function);
+      order.commodity1 = "T";
+      const size_t rest = Record(order, inPlaces).size() - 1;
+      const std::string longest(CGatewayFut::kBodySize - 1 - rest, 'T');
+      order.commodity1 = longest.c_str();
+      EXPECT_EQ(Record(order, inPlaces).size(), CGatewayFut::kBodySize - 1);
+      EXPECT_EQ(m_nReturned, 1);
+      const std::string over = longest + "T";
+      order.commodity1 = over.c_str();
+      EXPECT_EQ(Record(order, inPlaces), kParameterError);
+      EXPECT_EQ(m_nReturned, 0);
+    }
+  }
 }
 
 TEST_F(FuturesOrder, PayloadThatDoesNotFitIsAParameterError) {

@@ -44,13 +44,14 @@ TEST_F(HeapTexts, FirstAppendAllocatesItsLengthAndFourKilobytes) {
 TEST_F(HeapTexts, NothingIsDoneForNothing) {
   m_gateway.AppendData(nullptr, 5, false);
   m_gateway.AppendData("abc", 0, false);
-  m_gateway.AppendData("abc", -1, false);
+  m_gateway.AppendData("", 5, false);
   EXPECT_EQ(m_gateway.m_pData, nullptr);
   EXPECT_EQ(m_gateway.m_nDataSize, 0);
   EXPECT_EQ(m_gateway.m_nDataLen, 0);
   Append("abc");
   m_gateway.AppendData(nullptr, 5, true);
   m_gateway.AppendData("x", 0, true);
+  m_gateway.AppendData("", 5, true);
   EXPECT_STREQ(m_gateway.m_pData, "abc") << "no reset either";
   EXPECT_EQ(m_gateway.m_nDataLen, 3);
 }
@@ -94,6 +95,43 @@ TEST_F(HeapTexts, ResetClearsTheTextAndKeepsTheCapacity) {
   EXPECT_TRUE(RestIsZero());
 }
 
+// A length is booked as the caller tells it; the text that is there says where the next one goes.
+TEST_F(HeapTexts, WholeTextsAreJoinedWhateverTheirLengthsSay) {
+  for (int length : {1, 2, 4, 100, -1, -100, INT32_MAX, INT32_MIN}) {
+    CGatewayPub gateway;
+    gateway.AppendData(CTextAtPageEnd("abc"), length, false);
+    EXPECT_STREQ(gateway.m_pData, "abc") << length;
+    EXPECT_EQ(gateway.m_nDataLen, length);
+    gateway.AppendData(CTextAtPageEnd("def"), 3, false);
+    EXPECT_STREQ(gateway.m_pData, "abcdef") << length;
+    EXPECT_EQ(gateway.m_nDataLen, WrapAdd(length, 3));
+    gateway.AppendData("g", 1, true);
+    EXPECT_STREQ(gateway.m_pData, "g") << length;
+    EXPECT_EQ(gateway.m_nDataLen, 1) << length;
+  }
+}
+
+TEST_F(HeapTexts, RoomIsMadeForWhatIsReallyThere) {
+  const std::string first(5000, 'a'), second(9000, 'b'), third(5000, 'c');
+  m_gateway.AppendData(first.c_str(), 1, false);
+  EXPECT_EQ(m_gateway.m_pData, first);
+  m_gateway.AppendData(second.c_str(), 1, false);
+  EXPECT_EQ(m_gateway.m_pData, first + second);
+  m_gateway.AppendData(third.c_str(), 1, false);
+  EXPECT_EQ(m_gateway.m_pData, first + second + third) << "growth carries the whole old text";
+  EXPECT_EQ(m_gateway.m_nDataLen, 3);
+}
+
+// What a decoder left there is a text as any other.
+TEST_F(HeapTexts, TextGoesOnBehindAList) {
+  CResultText list(Owner(), 10);
+  list.AppendText("a!");
+  list.Finish("", 1);
+  m_gateway.AppendData("more", 4, false);
+  EXPECT_STREQ(m_gateway.m_pData, "1!a!more");
+  EXPECT_EQ(m_gateway.m_nDataLen, 8);
+}
+
 TEST_F(HeapTexts, AppendWithoutMemoryKeepsTheOldText) {
   {
     const CAllocations none(1);
@@ -129,8 +167,9 @@ TEST_F(HeapTexts, ListOpensWithItsCount) {
     const char* const result = list.Finish(row.opening, row.count);
     EXPECT_STREQ(result, row.expected);
     EXPECT_FALSE(list.Failed());
-    EXPECT_GE(result, m_gateway.m_pData);
-    EXPECT_LT(result + strlen(result), m_gateway.m_pData + m_gateway.m_nDataSize);
+    EXPECT_EQ(result, m_gateway.m_pData);
+    EXPECT_EQ(strlen(result), static_cast<size_t>(m_gateway.m_nDataLen));
+    EXPECT_LT(m_gateway.m_nDataLen, m_gateway.m_nDataSize);
   }
 }
 
@@ -198,15 +237,39 @@ TEST_F(HeapTexts, ListWithoutMemoryFailsForGood) {
   EXPECT_EQ(empty.Finish("", 0), nullptr);
 }
 
-TEST_F(HeapTexts, SizesThatAnIntCannotHoldAreRefused) {
+TEST_F(HeapTexts, ListThatOutgrowsALargeExpectationIsWhole) {
+  constexpr size_t kExpected = size_t{260} << 20;
+  constexpr size_t kHalf = size_t{150} << 20;
+  const auto fill = [](char c) { return [c](char* at) { memset(at, c, kHalf); }; };
+  CResultText list(Owner(), kExpected);
+  list.AppendWritten(kHalf, fill('a'));
+  list.AppendWritten(kHalf, fill('b'));
+  list.AppendText("c!");
+  const char* const text = list.Finish("", 3);
+  ASSERT_NE(text, nullptr);
+  const std::string_view result(text);
+  EXPECT_EQ(result.size(), 2 * kHalf + 4);
+  EXPECT_EQ(result.substr(0, 3), "3!a");
+  EXPECT_EQ(result.substr(1 + kHalf, 2), "ab");
+  EXPECT_EQ(result.substr(1 + 2 * kHalf), "bc!");
+}
+
+// The last size that an int holds is a block's, its terminator and the list's opening included.
+TEST_F(HeapTexts, SizesUpToWhatAnIntHoldsAreServedAndNoMore) {
   EXPECT_EQ(RenewHeapText(Owner(), INT32_MAX), nullptr);
   EXPECT_EQ(m_gateway.m_pData, nullptr);
-  CResultText list(Owner(), INT32_MAX / 8);
-  list.AppendWritten(INT32_MAX / 8, [](char*) {});
+  constexpr size_t kLongest = INT32_MAX - CResultText::kOpeningRoom - 1;
+  const auto nothing = [](char*) {};
+  CResultText list(Owner(), size_t{600} << 20);
+  list.AppendWritten(kLongest, nothing);
   EXPECT_FALSE(list.Failed());
-  list.AppendText(std::string(5000, 'a'));
+  EXPECT_EQ(m_gateway.m_nDataSize, INT32_MAX);
+  list.AppendText("x");
   EXPECT_TRUE(list.Failed());
   EXPECT_EQ(list.Finish("", 1), nullptr);
+  CResultText overrated(Owner(), SIZE_MAX);
+  overrated.AppendText("short!");
+  EXPECT_STREQ(overrated.Finish("", 1), "1!short!");
 }
 
 }  // namespace

@@ -52,7 +52,7 @@ class OrderHead : public CSessionTest {
                            a.rocDate, out, key);
     }
     m_text = out;
-    m_key = key;
+    m_key.assign(key, strnlen(key, CGatewayPub::kBufferSize));
     m_lines = m_log.Take();
     return result;
   }
@@ -196,6 +196,7 @@ TEST_F(OrderHead, WithoutAnAddressTheVariantsThatSendItFail) {
     m_gateway.m_nSeqNo = 123;
     EXPECT_EQ(Write(variant, "X&X"), 0);
     EXPECT_EQ(m_text, kNoAddress);
+    EXPECT_EQ(m_key, std::string(CGatewayPub::kBufferSize, '#')) << "as it was";
     EXPECT_EQ(m_lines, Lines{});
     EXPECT_EQ(m_gateway.m_nSeqNo, 23);
   }

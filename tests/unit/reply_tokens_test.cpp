@@ -106,6 +106,15 @@ TEST_F(ReplyTokens, GetTokenLeavesABufferOfNoSizeAlone) {
   EXPECT_STREQ(out, "");
 }
 
+TEST_F(ReplyTokens, GetTokenFindsNothingForANullTag) {
+  for (bool skip : {false, true}) {
+    char out[4] = "###";
+    EXPECT_EQ(m_gateway.GetToken(nullptr, "|=1|", out, 4, skip), 0);
+    EXPECT_STREQ(out, "");
+    EXPECT_EQ(m_gateway.GetToken(nullptr, nullptr, out, 4, skip), 0);
+  }
+}
+
 struct RecordCase {
   const char* title;
   const char* reply;

@@ -33,6 +33,9 @@ TEST_F(SessionObject, FieldsStandInTheirOrder) {
   EXPECT_EQ(sizeof gateway.m_szBuffer, 4096U);
   EXPECT_EQ(sizeof gateway.m_szSerialNo, 20U);
   EXPECT_EQ(sizeof gateway.m_szLocalIP, 64U);
+  const std::ptrdiff_t end = place(gateway.m_szLocalIP) + 64;
+  EXPECT_EQ(sizeof gateway, static_cast<size_t>((end + pointer - 1) / pointer * pointer))
+      << "nothing stands behind the address";
 }
 
 TEST_F(SessionObject, HasAVirtualDestructorAndIsNotCopied) {
@@ -130,6 +133,54 @@ TEST_F(SessionObject, ShorterTextReplacesALongerOne) {
   gateway.setLocalIP("2001:db8::1");
   gateway.setLocalIP("::1");
   EXPECT_STREQ(gateway.m_szLocalIP, "::1");
+}
+
+// A caller in C++ may fill the fields itself; they alone say what is sent.
+TEST_F(SessionObject, HeadersSendWhatTheFieldsHold) {
+  const struct {
+    const char* serial;
+    const char* address;
+    std::string sent;  // as tag SN
+  } rows[] = {{"AB", "::1", "AB"},
+              {"1234567890123456789", "10.0.0.1", "1234567890123456789"},
+              {"12345678901234567890", "10.0.0.1", "1234567890123456789010.0.0.1"}};
+  CGatewayPub gateway;
+  gateway.setSerialNumber("from the setter");
+  gateway.setLocalIP("from the setter");
+  for (const auto& row : rows) {
+    const std::string serial = row.serial, address = row.address;
+    memset(gateway.m_szSerialNo, 0, sizeof gateway.m_szSerialNo);
+    memset(gateway.m_szLocalIP, 0, sizeof gateway.m_szLocalIP);
+    serial.copy(gateway.m_szSerialNo, sizeof gateway.m_szSerialNo);
+    address.copy(gateway.m_szLocalIP, sizeof gateway.m_szLocalIP);
+    char query[CGatewayPub::kBufferSize] = "";
+    EXPECT_EQ(gateway.initQueryHead("9A00", "", "pw", query), 1);
+    EXPECT_NE(std::string(query).find("|SN=" + row.sent + "|"), std::string::npos) << query;
+    EXPECT_NE(std::string(query).find(std::string("|IP=") + row.address + "|"), std::string::npos);
+    char order[CGatewayPub::kBufferSize] = "";
+    char key[CGatewayPub::kBufferSize] = "";
+    EXPECT_EQ(gateway.initOrderHead1('I', "9A00", "1234567", "pw", "", order, key), 1);
+    EXPECT_NE(std::string(order).find("|SN=" + row.sent + "|"), std::string::npos) << order;
+    EXPECT_EQ(std::string(key).rfind(row.sent + "," + row.address + ",", 0), 0U) << key;
+  }
+  gateway.m_szLocalIP[0] = '\0';
+  char query[CGatewayPub::kBufferSize] = "";
+  EXPECT_EQ(gateway.initQueryHead("9A00", "", "pw", query), 0) << "no address";
+}
+
+// A full serial number goes on into the address; a full address ends with its field.
+TEST_F(SessionObject, FullFieldsEndWhereTheyEnd) {
+  struct {
+    CGatewayPub gateway;
+    char behind[8] = "untold!";
+  } host;
+  const std::string serial(20, 's'), address(64, 'a');
+  memcpy(host.gateway.m_szSerialNo, serial.data(), serial.size());
+  memcpy(host.gateway.m_szLocalIP, address.data(), address.size());
+  char query[CGatewayPub::kBufferSize] = "";
+  EXPECT_EQ(host.gateway.initQueryHead("9A00", "", "pw", query), 1);
+  EXPECT_NE(std::string(query).find("|IP=" + address + "|"), std::string::npos) << query;
+  EXPECT_NE(std::string(query).find("|SN=" + serial + address + "|"), std::string::npos) << query;
 }
 
 }  // namespace
