@@ -12,6 +12,7 @@
 #include <vector>
 
 #include "tests/abi/load.h"
+#include "tests/support/golden_answer.h"
 #include "tests/support/golden_file.h"
 #include "tests/support/recording_host.h"
 #include "tests/support/surroundings.h"
@@ -89,16 +90,8 @@ class CAbiRun {
     if (!SetClockOf(golden)) Fault(golden.Where(), "has an odd clock");
     CRecordingHost host(Placement::kBeforeUnreadable);
     const Outcome outcome = host.Call(row, golden.arguments);
-    if (!outcome.violations.empty()) Fault(golden.Where(), outcome.violations.front());
-    if (outcome.result != FillPlatformName(golden.result, platform)) {
-      Fault(golden.Where(), "answered " + outcome.result.value_or("(null)"));
-    }
-    if (outcome.status != golden.status) Fault(golden.Where(), "has another status");
-    if (golden.logLines.has_value()) {
-      std::vector<std::string> expected = *golden.logLines;
-      for (std::string& line : expected) line = FillPlatformName(line, platform);
-      if (outcome.logLines != expected) Fault(golden.Where(), "has other log lines");
-    }
+    const std::string difference = TellDifference(golden, outcome, platform);
+    if (!difference.empty()) Fault(golden.Where(), difference);
     m_digests[row.name].Add(outcome);
     ++m_nCalls;
   }

@@ -21,7 +21,7 @@ namespace {
 using gateway_tests::Export;
 
 // An input's arguments: a choice of bound, whether blanks are skipped, a tag, the reply.
-constexpr Export kReaders = {"Readers", "bbSS", nullptr, 0};
+constexpr Export kReaders = {"Readers", "bbSS", "bound skipBlank tag reply", nullptr, 0};
 
 constexpr size_t kBounds[] = {1, 2, 3, 5, 8, 16, 20, 40, 64, 128, 200, 218, 400, 512, 1024, 8192};
 

@@ -8,6 +8,7 @@
 #include <string_view>
 #include <utility>
 
+#include "tests/support/golden_answer.h"
 #include "tests/support/golden_file.h"
 #include "tests/support/recording_host.h"
 #include "tests/support/surroundings.h"
@@ -21,8 +22,17 @@ void PrintTo(const GoldenCase& golden, std::ostream* out) {
 
 namespace {
 
-constexpr Placement kPlacements[] = {Placement::kHeap, Placement::kBeforeUnreadable,
-                                     Placement::kAfterUnreadable};
+struct GoldenPlacement {
+  Placement placement;
+  const char* remark;
+};
+
+// Each is tried when those before it hold.
+constexpr GoldenPlacement kPlacements[] = {
+    {Placement::kHeap, ""},
+    {Placement::kBeforeUnreadable, " (with texts that end before an unreadable page)"},
+    {Placement::kAfterUnreadable, " (with texts that begin behind an unreadable page)"},
+};
 
 const GoldenCases& AllGolden() {
   static const GoldenCases s_Cases = ReadGoldenCases(TEST_VECTORS);
@@ -50,18 +60,13 @@ TEST_P(Golden, Case) {
   ASSERT_TRUE(SetClockOf(golden)) << golden.clock;
   const std::string platform = PlatformName(golden.PlatformRow());
 
-  for (Placement placement : kPlacements) {
-    SCOPED_TRACE(golden.Where() + ", placement " + std::to_string(static_cast<int>(placement)));
-    CRecordingHost host(placement);
+  for (const GoldenPlacement& placement : kPlacements) {
+    CRecordingHost host(placement.placement);
     const Outcome outcome = host.Call(*row, golden.arguments);
-    EXPECT_EQ(outcome.violations, std::vector<std::string>());
-    ASSERT_TRUE(outcome.result.has_value());
-    EXPECT_EQ(*outcome.result, FillPlatformName(golden.result, platform));
-    EXPECT_EQ(outcome.status, golden.status);
-    if (!golden.logLines.has_value()) continue;
-    std::vector<std::string> expected = *golden.logLines;
-    for (std::string& line : expected) line = FillPlatformName(line, platform);
-    EXPECT_EQ(outcome.logLines, expected);
+    const std::string difference = TellDifference(golden, outcome, platform);
+    if (!difference.empty()) {
+      FAIL() << golden.Where() << placement.remark << "\n  " << difference;
+    }
   }
 }
 
@@ -115,14 +120,14 @@ TEST(GoldenRequests, EachFillsItsBufferAndNoMore) {
   CRecordingHost host;
   for (const GoldenCase& golden : AllGolden().cases) {
     const Export* const row = FindExport(golden.operation);
-    const std::string field = "PWD=pw";
-    const size_t at = golden.result.find(field);
-    const bool sent = golden.status.value_or(1) == 1 && at != std::string::npos;
-    if (!sent || golden.arguments.size() <= kPassword || golden.arguments[kPassword].text != "pw" ||
+    if (golden.arguments.size() <= kPassword || golden.arguments[kPassword].text != "pw" ||
         !SetClockOf(golden)) {
       continue;
     }
-    const std::string result = FillPlatformName(golden.result, PlatformName(golden.PlatformRow()));
+    const Outcome usual = host.Call(*row, golden.arguments);
+    const std::string& result = usual.result.value();
+    const std::string field = "PWD=pw";
+    if (usual.status.value_or(1) != 1 || result.find(field) == std::string::npos) continue;
     const std::string password(2 + kRequestCapacity - result.size(), 'p');
     Arguments arguments = golden.arguments;
     arguments[kPassword] = Argument::Text(password);
@@ -130,7 +135,7 @@ TEST(GoldenRequests, EachFillsItsBufferAndNoMore) {
     std::string expected = result;
     expected.replace(result.find(field), field.size(), "PWD=" + password);
     EXPECT_EQ(whole.result, expected) << golden.Where();
-    EXPECT_EQ(whole.status, golden.status) << golden.Where();
+    EXPECT_EQ(whole.status, usual.status) << golden.Where();
     arguments[kPassword] = Argument::Text(password + "p");
     EXPECT_EQ(host.Call(*row, arguments).result, "[CLIENT]傳入的參數錯誤") << golden.Where();
     ++tried;
@@ -148,7 +153,8 @@ TEST(GoldenRequests, TextsOfEveryLengthAroundTheBufferAreWholeOrNotSent) {
     const auto texts = static_cast<size_t>(
         std::count_if(golden.arguments.begin(), golden.arguments.end(),
                       [](const Argument& a) { return !a.text.value_or("").empty(); }));
-    if (row->IsDecoder() || golden.status.value_or(1) != 1 || !SetClockOf(golden) ||
+    if (row->IsDecoder() || !SetClockOf(golden) ||
+        host.Call(*row, golden.arguments).status.value_or(1) != 1 ||
         !tried.emplace(row->name, texts).second) {
       continue;
     }

@@ -2,6 +2,7 @@
 
 #include <dlfcn.h>
 
+#include <algorithm>
 #include <utility>
 
 namespace gateway_tests {
@@ -53,100 +54,20 @@ struct Shape {
   }
 };
 
-using S = jstring;
 using I = jint;
+using S = jstring;
 using B = jbyte;
 using C = jchar;
+using Status = jintArray;
 
 template <typename... Arguments>
-using Encode = Shape<I, I, I, S, S, Arguments..., jintArray>;
-
-using OneText = Encode<S>;
-using ThreeTexts = Encode<S, S, S>;
-using ThreeTextsInt = Encode<S, S, S, I>;
-using FourTexts = Encode<S, S, S, S>;
-using FourTextsInt = Encode<S, S, S, S, I>;
-using FiveTexts = Encode<S, S, S, S, S>;
-using OpenAccount = Encode<S, S, S, S, S, S, B, B>;
-using StockOrder = Encode<S, S, S, S, S, I, I, I, B, B, B, B, B, B>;
-using StockChange = Encode<S, S, S, S, S, S, I, I, I, B, B, B, B, B, B>;
-using StockOrderNoStatus = Shape<I, I, I, S, S, S, S, S, B, B>;
-using FuturesOrder =
-    Encode<S, S, S, S, S, S, S, S, S, S, S, S, S, B, B, B, C, C, C, C, C, C, I, I, I>;
-using Decode = Shape<S, jintArray>;
-using DecodeMarket = Shape<I, S, jintArray>;
-
-template <typename Types>
-constexpr Export Row(const char* name, int keptStrings = 0) {
-  return Export{name, Types::kLetters, &Types::Call, keptStrings};
+constexpr Export Row(const char* name, const char* argumentNames, int keptStrings = 0) {
+  using Types = Shape<Arguments...>;
+  return Export{name, Types::kLetters, argumentNames, &Types::Call, keptStrings};
 }
 
 constexpr Export kExports[kExportCount] = {
-    // Login and account list.
-    Row<ThreeTexts>("AuthEncode"),
-    Row<Decode>("AuthDecode"),
-    Row<ThreeTexts>("GetTotalAccountEncode"),
-    Row<Decode>("GetTotalAccountDecode"),
-    // Account maintenance.
-    Row<OpenAccount>("OpenAccountEncode", 3),
-    Row<Decode>("OpenAccountDecode"),
-    Row<FourTexts>("ChangePasswordEncode"),
-    Row<Decode>("ChangePasswordDecode"),
-    Row<ThreeTexts>("QueryBankRemainEncode"),
-    Row<Decode>("QueryBankRemainDecode"),
-    // Certificates.
-    Row<OneText>("RegisterCertEncode"),
-    Row<Decode>("RegisterCertDecode"),
-    Row<OneText>("GetCertEncode"),
-    Row<OneText>("GetCertEncode2"),
-    Row<Decode>("GetCertDecode"),
-    Row<FiveTexts>("ApplyCertEncode"),
-    Row<Decode>("ApplyCertDecode"),
-    Row<FiveTexts>("RevokeCertEncode"),
-    Row<Decode>("RevokeCertDecode"),
-    Row<FiveTexts>("ReNewCertEncode"),
-    Row<Decode>("ReNewCertDecode"),
-    Row<OneText>("GetCertStatusEncode"),
-    Row<Decode>("GetCertStatusDecode"),
-    Row<OneText>("InstallCertOKEncode"),
-    Row<Decode>("InstallCertOKDecode"),
-    Row<OneText>("OpenCertEncode"),
-    Row<Decode>("OpenCertDecode"),
-    // Stock orders.
-    Row<StockOrder>("SubmitOrderEncode"),
-    Row<StockOrder>("SubmitOrderEncode1"),
-    Row<StockOrderNoStatus>("SubmitOrderEncode2"),
-    Row<StockChange>("CancelOrderEncode"),
-    Row<StockChange>("CancelOrderEncode1"),
-    Row<StockChange>("ChangeOrderEncode"),
-    Row<StockChange>("ChangeOrderEncode1"),
-    Row<Decode>("SubmitOrderDecode"),
-    Row<Decode>("CancelChangeOrderDecode"),
-    // Stock lists, positions, settlement.
-    Row<FourTextsInt>("QueryOrderEncode"),
-    Row<DecodeMarket>("QueryOrderDecode"),
-    Row<FiveTexts>("QueryReplyEncode"),
-    Row<Decode>("QueryReplyDecode"),
-    Row<ThreeTexts>("QueryInventoryEncode"),
-    Row<Decode>("QueryInventoryDecode"),
-    Row<Decode>("QueryInventoryDecodeJZG"),
-    Row<FourTexts>("QueryCreditInfoEncode"),
-    Row<Decode>("QueryCreditInfoDecode"),
-    Row<FiveTexts>("PaymentEncode"),
-    Row<Decode>("PaymentDecode"),
-    Row<Decode>("PaymentDecodeJZG"),
-    // Futures and options.
-    Row<FuturesOrder>("FutSubmitOrderEncode"),
-    Row<FuturesOrder>("FutSubmitOrderEncode1"),
-    Row<Decode>("FutSubmitOrderDecode"),
-    Row<FourTextsInt>("FutQueryOrderEncode"),
-    Row<Decode>("FutQueryOrderDecode"),
-    Row<FiveTexts>("FutQueryReplyEncode"),
-    Row<Decode>("FutQueryReplyDecode"),
-    Row<ThreeTexts>("FutQueryInventoryEncode"),
-    Row<Decode>("FutQueryInventoryDecode"),
-    Row<ThreeTextsInt>("QueryFinanceEncode"),
-    Row<Decode>("QueryFinanceDecode"),
+#include "tests/support/call_rows.inc"
 };
 
 // Where entry points are looked up: the shared library when the program can load it, else (a
@@ -184,6 +105,16 @@ std::string Export::Descriptor() const {
   std::string text = "(";
   for (char letter : shape) text.append(JavaTypeOf(letter));
   return text.append(")Ljava/lang/String;");
+}
+
+std::vector<std::string_view> Export::ArgumentNames() const {
+  std::vector<std::string_view> names;
+  for (std::string_view rest = argumentNames; !rest.empty();) {
+    const size_t end = std::min(rest.find(' '), rest.size());
+    names.push_back(rest.substr(0, end));
+    rest.remove_prefix(std::min(end + 1, rest.size()));
+  }
+  return names;
 }
 
 void* Export::EntryPoint() const {

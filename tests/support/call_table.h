@@ -6,6 +6,7 @@
 #include <cstddef>
 #include <string>
 #include <string_view>
+#include <vector>
 
 namespace gateway_tests {
 
@@ -18,6 +19,8 @@ struct Export {
   std::string_view name;
   // One letter for each Java argument: i int, S String, b byte, c char, s the status int[].
   std::string_view shape;
+  // Names of the Java arguments in their order, parted by blanks, without the status array.
+  std::string_view argumentNames;
   Caller call;
   // Number of last strings that the export keeps on purpose (never releases).
   int keptStrings;
@@ -28,6 +31,7 @@ struct Export {
   std::string SymbolName() const;
   // The Java method descriptor, "(III...[I)Ljava/lang/String;".
   std::string Descriptor() const;
+  std::vector<std::string_view> ArgumentNames() const;
   // Address of the entry point in the loaded library; null while the library lacks it.
   void* EntryPoint() const;
 };

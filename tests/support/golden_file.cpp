@@ -4,15 +4,18 @@
 #include <charconv>
 #include <filesystem>
 #include <fstream>
+#include <functional>
+#include <map>
 #include <set>
 #include <string_view>
 
+#include "tests/support/golden_text.h"
 #include "tests/support/surroundings.h"
 
 namespace gateway_tests {
 namespace {
 
-// Takes `prefix` (a key and the blank after it, or the whole line) off the front of the line.
+// Takes `key` (and the blank behind it) off the front of the line.
 bool TakeKey(std::string_view& line, std::string_view key) {
   if (line.substr(0, key.size()) != key) return false;
   if (line.size() > key.size() && line[key.size()] != ' ') return false;
@@ -20,46 +23,11 @@ bool TakeKey(std::string_view& line, std::string_view key) {
   return true;
 }
 
-bool Unescape(std::string_view text, std::string& out) {
-  for (size_t i = 0; i < text.size(); ++i) {
-    if (text[i] != '\\') {
-      out.push_back(text[i]);
-      continue;
-    }
-    if (++i == text.size()) return false;
-    switch (text[i]) {
-      case 'n':
-        out.push_back('\n');
-        break;
-      case 'r':
-        out.push_back('\r');
-        break;
-      case 't':
-        out.push_back('\t');
-        break;
-      case 's':
-        out.push_back(' ');
-        break;
-      case '\\':
-        out.push_back('\\');
-        break;
-      case 'z':
-        break;
-      case 'x': {
-        unsigned value = 0;
-        const char* const digits = text.data() + i + 1;
-        if (i + 2 >= text.size()) return false;
-        if (std::from_chars(digits, digits + 2, value, 16).ptr != digits + 2) return false;
-        if (value == 0) return false;
-        out.push_back(static_cast<char>(value));
-        i += 2;
-        break;
-      }
-      default:
-        return false;
-    }
-  }
-  return true;
+// Takes the first word off the front of the line.
+std::string_view TakeWord(std::string_view& line) {
+  const std::string_view word = line.substr(0, line.find(' '));
+  line.remove_prefix(std::min(line.size(), word.size() + 1));
+  return word;
 }
 
 bool ReadNumber(std::string_view text, int64_t low, int64_t high, int64_t& out) {
@@ -68,10 +36,41 @@ bool ReadNumber(std::string_view text, int64_t low, int64_t high, int64_t& out) 
   return read.ec == std::errc() && read.ptr == end && low <= out && out <= high;
 }
 
+// A number, or a character in quotes.
+bool ReadCode(std::string_view text, int64_t low, int64_t high, int64_t& out) {
+  const bool quoted = text.size() == 3 && text.front() == '\'' && text.back() == '\'';
+  if (!quoted) return ReadNumber(text, low, high, out);
+  out = text[1];
+  return ' ' <= out && out <= '~';
+}
+
+// What stands behind an argument's name: its type and its value.
+bool ReadValue(std::string_view line, Argument& out) {
+  if (TakeKey(line, "str")) {
+    out.letter = 'S';
+    out.text = Unescape(line);
+    return out.text.has_value();
+  }
+  if (line == "null") {
+    out.letter = 'S';
+    return true;
+  }
+  if (TakeKey(line, "int")) return ReadNumber(line, INT32_MIN, INT32_MAX, out.number);
+  if (TakeKey(line, "byte")) {
+    out.letter = 'b';
+    return ReadCode(line, INT8_MIN, INT8_MAX, out.number);
+  }
+  out.letter = 'c';
+  return TakeKey(line, "char") && ReadCode(line, 0, UINT16_MAX, out.number);
+}
+
+using NamedArguments = std::map<std::string, Argument, std::less<>>;
+
 // Reads one file line by line.
 class CGoldenReader {
  public:
-  CGoldenReader(std::string file, GoldenCases& out) : m_file(std::move(file)), m_out(out) {}
+  CGoldenReader(std::string file, Unanswered unanswered, GoldenCases& out)
+      : m_file(std::move(file)), m_unanswered(unanswered), m_out(out) {}
 
   void Read(std::istream& in) {
     std::string line;
@@ -80,8 +79,11 @@ class CGoldenReader {
       if (!line.empty() && (line.back() == ' ' || line.back() == '\r' || line.back() == '\t')) {
         Error("the line ends in a blank (write \\s)");
       }
-      if (line.empty() || line[0] == '#') continue;
-      if (!ReadLine(line)) Error("not understood: " + line);
+      if (line.empty() || line[0] == '#') {
+        EndCase();
+      } else if (!ReadLine(line)) {
+        Error("not understood: " + line);
+      }
     }
     EndCase();
     if (m_titles.empty()) Error("no case in the file");
@@ -90,21 +92,41 @@ class CGoldenReader {
  private:
   bool ReadLine(std::string_view line) {
     if (TakeKey(line, "==")) return BeginCase(line);
+    if (TakeKey(line, "usual")) return ReadUsual(line);
     if (!m_bInCase) return false;
     if (TakeKey(line, "op")) return Set(m_case.operation, line);
     if (TakeKey(line, "clock")) return Set(m_case.clock, line);
-    if (TakeKey(line, "arg")) return ReadArgument(line);
     if (TakeKey(line, "status")) return ReadStatus(line);
     if (TakeKey(line, "result")) {
-      if (m_bResult) return false;
+      const std::optional<std::string> result = Unescape(line);
+      if (m_bResult || !result.has_value()) return false;
       m_bResult = true;
-      return Unescape(line, m_case.result);
+      m_case.result = *result;
+      return true;
     }
     if (TakeKey(line, "log")) {
+      const std::optional<std::string> text = Unescape(line);
       if (!m_case.logLines.has_value()) m_case.logLines.emplace();
-      return Unescape(line, m_case.logLines->emplace_back());
+      m_case.logLines->push_back(text.value_or(""));
+      return text.has_value();
     }
-    return false;
+    const std::string name(TakeWord(line));
+    Argument argument;
+    return ReadValue(line, argument) && m_named.emplace(name, std::move(argument)).second;
+  }
+
+  // What holds from here on for each case that does not say otherwise.
+  bool ReadUsual(std::string_view line) {
+    EndCase();
+    const std::string name(TakeWord(line));
+    if (name == "clock") {
+      m_usualClock = line;
+      return true;
+    }
+    Argument argument;
+    if (!ReadValue(line, argument)) return false;
+    m_usual[name] = std::move(argument);
+    return true;
   }
 
   bool BeginCase(std::string_view title) {
@@ -123,34 +145,8 @@ class CGoldenReader {
     return true;
   }
 
-  bool ReadArgument(std::string_view line) {
-    Argument argument;
-    int64_t& number = argument.number;
-    bool good = true;
-    if (TakeKey(line, "str")) {
-      argument.letter = 'S';
-      good = Unescape(line, argument.text.emplace());
-    } else if (line == "null") {
-      argument.letter = 'S';
-    } else if (TakeKey(line, "int")) {
-      good = ReadNumber(line, INT32_MIN, INT32_MAX, number);
-    } else if (TakeKey(line, "byte")) {
-      argument.letter = 'b';
-      good = ReadNumber(line, INT8_MIN, INT8_MAX, number);
-    } else if (TakeKey(line, "char")) {
-      argument.letter = 'c';
-      good = ReadNumber(line, 0, UINT16_MAX, number);
-    } else {
-      return false;
-    }
-    m_case.arguments.push_back(std::move(argument));
-    return good;
-  }
-
   bool ReadStatus(std::string_view line) {
-    if (m_bStatus) return false;
-    m_bStatus = true;
-    if (line == "none") return true;
+    if (m_case.status.has_value()) return false;
     int64_t number = 0;
     if (!ReadNumber(line, INT32_MIN, INT32_MAX, number)) return false;
     m_case.status = static_cast<int32_t>(number);
@@ -158,27 +154,44 @@ class CGoldenReader {
   }
 
   void EndCase() {
-    if (m_bInCase) {
-      if (m_case.operation.empty()) CaseError("no op");
-      if (!m_bStatus) CaseError("no status");
-      if (!m_bResult) CaseError("no result");
-      CheckShape();
+    if (!m_bInCase) return;
+    const Export* const row = FindExport(m_case.operation);
+    if (row == nullptr) {
+      CaseError("no operation is named \"" + m_case.operation + "\"");
+    } else {
+      FillCase(*row);
       m_out.cases.push_back(std::move(m_case));
     }
     m_case = GoldenCase();
-    m_bInCase = m_bStatus = m_bResult = false;
+    m_named.clear();
+    m_bInCase = m_bResult = false;
   }
 
-  void CheckShape() {
-    const Export* const row = FindExport(m_case.operation);
-    if (row == nullptr) return CaseError("no operation is named " + m_case.operation);
-    std::string shape;
-    for (const Argument& argument : m_case.arguments) shape.push_back(argument.letter);
-    if (row->HasStatus()) shape.push_back('s');
-    if (shape != row->shape) {
-      CaseError("arguments " + shape + " where " + std::string(row->shape) + " is declared");
+  void FillCase(const Export& row) {
+    if (m_case.clock.empty()) m_case.clock = m_usualClock;
+    if (!m_bResult && m_unanswered == Unanswered::kError) {
+      CaseError("no result (scripts/golden --accept writes it)");
     }
-    if (row->HasStatus() != m_case.status.has_value()) CaseError("status does not fit");
+    if (row.HasStatus()) {
+      m_case.status = m_case.status.value_or(1);
+    } else if (m_case.status.has_value()) {
+      CaseError("the method has no status");
+    }
+    const std::vector<std::string_view> names = row.ArgumentNames();
+    for (size_t i = 0; i < names.size(); ++i) AddArgument(names[i], row.shape[i]);
+    for (const auto& [name, argument] : m_named) CaseError("no argument is named " + name);
+  }
+
+  void AddArgument(std::string_view name, char letter) {
+    auto given = m_named.find(name);
+    const bool usual = given == m_named.end();
+    if (usual) given = m_usual.find(name);
+    if (given == (usual ? m_usual : m_named).end()) {
+      return CaseError("no value for " + std::string(name));
+    }
+    if (given->second.letter != letter) CaseError(std::string(name) + " has another type");
+    m_case.arguments.push_back(given->second);
+    if (!usual) m_named.erase(given);
   }
 
   void Error(const std::string& text) {
@@ -187,12 +200,15 @@ class CGoldenReader {
   void CaseError(const std::string& text) { m_out.errors.push_back(m_case.Where() + ": " + text); }
 
   std::string m_file;
+  Unanswered m_unanswered;
   GoldenCases& m_out;
   std::set<std::string> m_titles;
+  std::string m_usualClock;
+  NamedArguments m_usual;
   GoldenCase m_case;
+  NamedArguments m_named;  // those that the case names
   int m_nLine = 0;
   bool m_bInCase = false;
-  bool m_bStatus = false;
   bool m_bResult = false;
 };
 
@@ -222,7 +238,7 @@ int64_t GoldenCase::PlatformRow() const {
   return encoder && arguments.size() > 1 ? arguments[1].number : 0;
 }
 
-GoldenCases ReadGoldenCases(const std::string& directory) {
+GoldenCases ReadGoldenCases(const std::string& directory, Unanswered unanswered) {
   std::vector<std::filesystem::path> files;
   std::error_code error;
   for (const auto& entry : std::filesystem::directory_iterator(directory, error)) {
@@ -233,13 +249,13 @@ GoldenCases ReadGoldenCases(const std::string& directory) {
   if (files.empty()) cases.errors.push_back("no golden file in " + directory);
   for (const auto& file : files) {
     std::ifstream in(file);
-    CGoldenReader(file.filename().string(), cases).Read(in);
+    CGoldenReader(file.filename().string(), unanswered, cases).Read(in);
   }
   return cases;
 }
 
 bool SetClockOf(const GoldenCase& golden) {
-  return SetClock(golden.clock.empty() ? "2024-01-15 13:45:21" : golden.clock);
+  return SetClock(golden.clock);
 }
 
 std::string PlatformName(int64_t row) {

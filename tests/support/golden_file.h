@@ -21,7 +21,7 @@ struct GoldenCase {
   Arguments arguments;
   std::optional<int32_t> status;
   std::string result;
-  // Empty when the case says nothing about log lines.
+  // None when the case says nothing about log lines.
   std::optional<std::vector<std::string>> logLines;
 
   // "login.txt:12: title".
@@ -38,10 +38,13 @@ struct GoldenCases {
   std::vector<std::string> errors;
 };
 
-GoldenCases ReadGoldenCases(const std::string& directory);
+// Whether a case without a result is an error, or one that is still to be answered.
+enum class Unanswered { kError, kTaken };
 
-// Stops the clock where the case has it, at a day of its own where it does not care; false when it
-// names no such time.
+GoldenCases ReadGoldenCases(const std::string& directory,
+                            Unanswered unanswered = Unanswered::kError);
+
+// Stops the clock where the case has it; false when it names no such time.
 bool SetClockOf(const GoldenCase& golden);
 
 // The name that the library sends for a platform row, read from a header that it builds.

@@ -80,4 +80,13 @@ Java_com_brindlex_kernel_quorvane_Surroundings_nativeMethods(JNIEnv* env, jclass
   return MakeArray(env, methods);
 }
 
+JNIEXPORT jobjectArray JNICALL
+Java_com_brindlex_kernel_quorvane_Surroundings_argumentNames(JNIEnv* env, jclass) {
+  std::vector<std::string> methods;
+  for (const auto& row : gateway_tests::AllExports()) {
+    methods.push_back(std::string(row.name).append(" ").append(row.argumentNames));
+  }
+  return MakeArray(env, methods);
+}
+
 }  // extern "C"

@@ -12,30 +12,47 @@ import java.time.LocalDateTime;
 import java.time.ZoneId;
 import java.time.format.DateTimeFormatter;
 import java.util.ArrayList;
+import java.util.Arrays;
+import java.util.HashMap;
 import java.util.List;
+import java.util.Map;
 import java.util.TreeMap;
 
 /** One golden case; the format is described in {@code tests/vectors/README.md}. */
 final class GoldenCase {
     private static final DateTimeFormatter CLOCK = DateTimeFormatter.ofPattern("yyyy-MM-dd HH:mm:ss");
     private static final ZoneId MARKET = ZoneId.of("Asia/Taipei");
+    /** The names of each method's arguments, in their order. */
+    private static final Map<String, List<String>> ARGUMENT_NAMES = new HashMap<>();
+
+    static {
+        for (String method : Surroundings.argumentNames()) {
+            List<String> words = Arrays.asList(method.split(" "));
+            ARGUMENT_NAMES.put(words.get(0), words.subList(1, words.size()));
+        }
+    }
 
     final String title;
     final Path file;
     final int line;
     String operation;
-    LocalDateTime clock = LocalDateTime.parse("2024-01-15 13:45:21", CLOCK);
+    LocalDateTime clock;
     final List<Object> arguments = new ArrayList<>();
     /** Null when the method has no status array. */
-    Integer status;
+    Integer status = 1;
     String result;
     /** Null when the case says nothing about log lines. */
     List<String> logLines;
 
-    private GoldenCase(String title, Path file, int line) {
+    /** Values of arguments by name: what is usual in the file, and what the case gives. */
+    private final Map<String, Object> values;
+
+    private GoldenCase(String title, Path file, int line, Map<String, Object> usual) {
         this.title = title;
         this.file = file;
         this.line = line;
+        this.values = new HashMap<>(usual);
+        this.clock = (LocalDateTime) usual.get("clock");
     }
 
     /** The local time of the case in seconds since 1970. */
@@ -62,22 +79,36 @@ final class GoldenCase {
 
     private static List<GoldenCase> read(Path file) throws IOException {
         List<GoldenCase> cases = new ArrayList<>();
+        Map<String, Object> usual = new HashMap<>();
         int number = 0;
         for (String text : Files.readAllLines(file, StandardCharsets.UTF_8)) {
             ++number;
+            String key = firstWord(text);
+            String value = behind(key, text);
             if (text.isEmpty() || text.charAt(0) == '#') {
                 continue;
-            }
-            int blank = text.indexOf(' ');
-            String key = blank < 0 ? text : text.substring(0, blank);
-            String value = blank < 0 ? "" : text.substring(blank + 1);
-            if (key.equals("==")) {
-                cases.add(new GoldenCase(value, file, number));
+            } else if (key.equals("usual")) {
+                String name = firstWord(value);
+                String given = behind(name, value);
+                usual.put(name, name.equals("clock") ? LocalDateTime.parse(given, CLOCK)
+                        : argument(given));
+            } else if (key.equals("==")) {
+                cases.add(new GoldenCase(value, file, number, usual));
             } else {
                 cases.get(cases.size() - 1).take(key, value);
             }
         }
+        cases.forEach(GoldenCase::setArguments);
         return cases;
+    }
+
+    private static String firstWord(String text) {
+        int blank = text.indexOf(' ');
+        return blank < 0 ? text : text.substring(0, blank);
+    }
+
+    private static String behind(String word, String text) {
+        return text.substring(Math.min(text.length(), word.length() + 1));
     }
 
     private void take(String key, String value) throws CharacterCodingException {
@@ -88,11 +119,8 @@ final class GoldenCase {
             case "clock":
                 clock = LocalDateTime.parse(value, CLOCK);
                 break;
-            case "arg":
-                arguments.add(argument(value));
-                break;
             case "status":
-                status = value.equals("none") ? null : Integer.valueOf(value);
+                status = Integer.valueOf(value);
                 break;
             case "result":
                 result = unescape(value);
@@ -104,14 +132,26 @@ final class GoldenCase {
                 logLines.add(unescape(value));
                 break;
             default:
-                throw new IllegalArgumentException(title + ": not understood: " + key);
+                values.put(key, argument(value));
         }
     }
 
-    private Object argument(String text) throws CharacterCodingException {
-        int blank = text.indexOf(' ');
-        String type = blank < 0 ? text : text.substring(0, blank);
-        String value = blank < 0 ? "" : text.substring(blank + 1);
+    private void setArguments() {
+        for (String name : ARGUMENT_NAMES.get(operation)) {
+            if (!values.containsKey(name)) {
+                throw new IllegalArgumentException(title + ": no value for " + name);
+            }
+            arguments.add(values.get(name));
+        }
+        if (!Natives.hasStatus(operation)) {
+            status = null;
+        }
+    }
+
+    private static Object argument(String text) throws CharacterCodingException {
+        String type = firstWord(text);
+        String value = behind(type, text);
+        boolean quoted = value.length() == 3 && value.startsWith("'") && value.endsWith("'");
         switch (type) {
             case "null":
                 return null;
@@ -120,11 +160,11 @@ final class GoldenCase {
             case "int":
                 return Integer.valueOf(value);
             case "byte":
-                return Byte.valueOf(value);
+                return quoted ? (byte) value.charAt(1) : Byte.parseByte(value);
             case "char":
-                return (char) Integer.parseInt(value);
+                return quoted ? value.charAt(1) : (char) Integer.parseInt(value);
             default:
-                throw new IllegalArgumentException(title + ": no argument type " + type);
+                throw new IllegalArgumentException("not understood: " + text);
         }
     }
 
@@ -154,8 +194,6 @@ final class GoldenCase {
                     break;
                 case '\\':
                     out.write('\\');
-                    break;
-                case 'z':
                     break;
                 case 'x':
                     out.write(Integer.parseInt(new String(in, i + 1, 2, StandardCharsets.US_ASCII), 16));

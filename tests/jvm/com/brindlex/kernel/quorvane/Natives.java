@@ -20,6 +20,21 @@ final class Natives {
             this.status = status;
             this.logLines = logLines;
         }
+
+        @Override
+        public boolean equals(Object other) {
+            return other instanceof Outcome && ((Outcome) other).toString().equals(toString());
+        }
+
+        @Override
+        public int hashCode() {
+            return toString().hashCode();
+        }
+
+        @Override
+        public String toString() {
+            return "status " + status + ", result " + result + ", log " + logLines;
+        }
     }
 
     private static final TreeMap<String, Method> METHODS = new TreeMap<>();
@@ -36,6 +51,12 @@ final class Natives {
 
     static TreeMap<String, Method> all() {
         return METHODS;
+    }
+
+    /** Whether the method takes a status array. */
+    static boolean hasStatus(String name) {
+        Class<?>[] types = METHODS.get(name).getParameterTypes();
+        return types[types.length - 1] == int[].class;
     }
 
     /** Plays a golden case with its clock. */
@@ -59,7 +80,7 @@ final class Natives {
         }
         Object[] values = arguments.toArray();
         int[] status = null;
-        if (method.getParameterTypes()[method.getParameterCount() - 1] == int[].class) {
+        if (hasStatus(name)) {
             status = new int[] {0x5A5A};
             values = Arrays.copyOf(values, values.length + 1);
             values[values.length - 1] = status;

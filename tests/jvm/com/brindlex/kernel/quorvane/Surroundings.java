@@ -31,4 +31,11 @@ final class Surroundings {
      * @return one text each, name and descriptor: {@code "AuthDecode(Ljava/lang/String;[I)..."}
      */
     static native String[] nativeMethods();
+
+    /**
+     * The names of their arguments, without the status array.
+     *
+     * @return one text each, the method's name in front: {@code "QueryOrderDecode market reply"}
+     */
+    static native String[] argumentNames();
 }
