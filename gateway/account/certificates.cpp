@@ -41,10 +41,8 @@ void LogLength(const char* label, std::string_view message) {
   debuglog(line.Text());
 }
 
-}  // namespace
-
 // What tells one request from another.
-struct CGatewayPub::CertRequest {
+struct CertRequest {
   const char* function;
   const char* parameterError;  // for a message that cannot be sent
   bool hasBirth = false;
@@ -52,29 +50,15 @@ struct CGatewayPub::CertRequest {
 };
 
 // Whose certificate it is; requests without a birth date do not say.
-struct CGatewayPub::CertOwner {
+struct CertOwner {
   const char* branch = "";
   const char* identity = "";
   const char* password = "";
   const char* birth = "";
 };
 
-// An empty message is refused before the header is made.
-bool CGatewayPub::WriteCertHead(CTextWriter& line, const CertRequest& request,
-                                const CertOwner& owner, std::string_view message, int* status) {
-  *status = 1;
-  if (message.empty()) {
-    Fail(line, status, request.parameterError);
-    return false;
-  }
-  LogStep(request.steps.beforeHead);
-  if (WriteQueryHead(line, owner.branch, owner.identity, owner.password)) return true;
-  *status = -1;
-  return false;
-}
-
-void CGatewayPub::WriteCertTail(CTextWriter& line, const CertRequest& request,
-                                const CertOwner& owner, std::string_view message) {
+void WriteTail(CTextWriter& line, const CertRequest& request, const CertOwner& owner,
+               std::string_view message) {
   line.Append(WIRE("FUNC=%s|MSG="), request.function);
   line.AppendWritten(CBase64Utils::EncodedSize(message.size()), [message](char* out) {
     CBase64Utils::EncodeTo(message.data(), message.size(), out);
@@ -83,115 +67,25 @@ void CGatewayPub::WriteCertTail(CTextWriter& line, const CertRequest& request,
   line.AppendText("|01=");
 }
 
-char* CGatewayPub::EncodeCert(const CertRequest& request, const CertOwner& owner,
-                              const char* certMsg, int* status) {
+// An empty message is refused before the header is made.
+char* EncodeCert(CGatewayPub& gateway, const CertRequest& request, const CertOwner& owner,
+                 const char* certMsg, int* status) {
   const std::string_view message = AsText(certMsg);
-  CTextWriter line = StartRequest();
-  if (!WriteCertHead(line, request, owner, message, status)) return line.Text();
+  if (message.empty()) return gateway.Fail(request.parameterError, status);
+  LogStep(request.steps.beforeHead);
+  CTextWriter line = gateway.StartQuery(owner.branch, owner.identity, owner.password, status);
+  if (*status != 1) return line.Text();
   for (const char* step : request.steps.afterHead) LogStep(step);
-  WriteCertTail(line, request, owner, message);
+  WriteTail(line, request, owner, message);
   for (const char* step : request.steps.afterTail) LogStep(step);
-  return Finish(line, status, request.parameterError);
-}
-
-char* CGatewayPub::ApplyCertEncode(const char* branch, const char* identity, const char* password,
-                                   const char* birth, const char* certMsg, int* status) {
-  return EncodeCert({"13", kApplyCertParameters, true}, {branch, identity, password, birth},
-                    certMsg, status);
-}
-
-char* CGatewayPub::ReNewCertEncode(const char* branch, const char* identity, const char* password,
-                                   const char* birth, const char* certMsg, int* status) {
-  return EncodeCert({"15", kReNewCertParameters, true}, {branch, identity, password, birth},
-                    certMsg, status);
-}
-
-char* CGatewayPub::RevokeCertEncode(const char* branch, const char* identity, const char* password,
-                                    const char* birth, const char* certMsg, int* status) {
-  return EncodeCert({"18", kRevokeCertParameters, true, kRevokeSteps},
-                    {branch, identity, password, birth}, certMsg, status);
-}
-
-char* CGatewayPub::GetCertEncode(const char* certMsg, int* status) {
-  debuglog("GetCertEncode");
-  return EncodeCert({"11", kGetCertParameters}, {}, certMsg, status);
-}
-
-char* CGatewayPub::GetCertEncode2(const char* certMsg, int* status) {
-  LogLength("regMsg", AsText(certMsg));
-  return EncodeCert({"11", kGetCertParameters, false, kGetCert2Steps}, {}, certMsg, status);
-}
-
-char* CGatewayPub::GetCertStatusEncode(const char* certMsg, int* status) {
-  return EncodeCert({"14", kGetCertStatusParameters}, {}, certMsg, status);
-}
-
-char* CGatewayPub::InstallCertOKEncode(const char* certMsg, int* status) {
-  return EncodeCert({"16", kInstallCertOKParameters}, {}, certMsg, status);
-}
-
-char* CGatewayPub::OpenCertEncode(const char* certMsg, int* status) {
-  return EncodeCert({"17", kOpenCertParameters}, {}, certMsg, status);
-}
-
-// Its message has no limit: the request is written into one heap block of its very size.
-char* CGatewayPub::RegisterCertEncode(const char* certMsg, int* status) {
-  constexpr CertRequest kRequest = {"10", kRegisterCertParameters};
-  const std::string_view message = AsText(certMsg);
-  LogLength("RegisterCertEncode:", message);
-  debuglog(certMsg);
-  CTextWriter head = StartRequest();
-  if (!WriteCertHead(head, kRequest, {}, message, status)) return head.Text();
-  const std::string_view header(head.Text(), head.Length());
-  const size_t length =
-      header.size() + strlen("FUNC=10|MSG=|01=") + CBase64Utils::EncodedSize(message.size());
-  char* const room = RenewResult(length, status);
-  if (room == nullptr) return nullptr;
-  CTextWriter line(room, length + 1);
-  line.AppendText(header);
-  WriteCertTail(line, kRequest, {}, message);
-  return line.Text();
-}
-
-char* CGatewayPub::ApplyCertDecode(const char* reply, int* status) {
-  return DecodeCert("ApplyCertDecode", reply, status);
-}
-
-char* CGatewayPub::ReNewCertDecode(const char* reply, int* status) {
-  return DecodeCert("ReNewCertDecode", reply, status);
-}
-
-char* CGatewayPub::RevokeCertDecode(const char* reply, int* status) {
-  return DecodeCert("RevokeCertDecode", reply, status);
-}
-
-char* CGatewayPub::GetCertDecode(const char* reply, int* status) {
-  return DecodeCert("GetCertDecode", reply, status);
-}
-
-char* CGatewayPub::GetCertStatusDecode(const char* reply, int* status) {
-  return DecodeCert("GetCertStatusDecode", reply, status);
-}
-
-char* CGatewayPub::InstallCertOKDecode(const char* reply, int* status) {
-  return DecodeCert("InstallCertOKDecode", reply, status);
-}
-
-// Logs under the name of the status reply.
-char* CGatewayPub::OpenCertDecode(const char* reply, int* status) {
-  return DecodeCert("GetCertStatusDecode", reply, status);
-}
-
-char* CGatewayPub::RegisterCertDecode(const char* reply, int* status) {
-  return DecodeCert("RegisterCertDecode", reply, status);
+  return CGatewayPub::Finish(line, status, request.parameterError);
 }
 
 // The first record alone is read, whatever its length; without one, code and text are empty.
-char* CGatewayPub::DecodeCert(const char* label, const char* reply, int* status) {
+char* DecodeCert(CGatewayPub& gateway, const char* label, const char* reply, int* status) {
   const std::string_view text = AsText(reply);
-  LogReply(label, text);
-  *status = 1;
-  if (TransportFailed(text, status)) return m_szBuffer;
+  gateway.LogReply(label, text);
+  if (gateway.TransportFailed(text, status)) return gateway.m_szBuffer;
   CRecord record(kTags);
   CRecordWalker walker(text, kUnbounded);
   walker.Next(record);
@@ -199,7 +93,7 @@ char* CGatewayPub::DecodeCert(const char* label, const char* reply, int* status)
   const std::string_view answer = record.Text(kMessage);
   const bool accepted = code == kDoneCode;
   const size_t length = answer.size() + (accepted ? 0 : strlen("[CERT] ") + code.size());
-  char* const room = RenewResult(length, status);
+  char* const room = gateway.RenewResult(length, status);
   if (room == nullptr) return nullptr;
   CTextWriter result(room, length + 1);
   if (!accepted) {
@@ -208,4 +102,99 @@ char* CGatewayPub::DecodeCert(const char* label, const char* reply, int* status)
   }
   result.AppendText(answer);
   return result.Text();
+}
+
+}  // namespace
+
+char* CGatewayPub::ApplyCertEncode(const char* branch, const char* identity, const char* password,
+                                   const char* birth, const char* certMsg, int* status) {
+  return EncodeCert(*this, {"13", kApplyCertParameters, true}, {branch, identity, password, birth},
+                    certMsg, status);
+}
+
+char* CGatewayPub::ReNewCertEncode(const char* branch, const char* identity, const char* password,
+                                   const char* birth, const char* certMsg, int* status) {
+  return EncodeCert(*this, {"15", kReNewCertParameters, true}, {branch, identity, password, birth},
+                    certMsg, status);
+}
+
+char* CGatewayPub::RevokeCertEncode(const char* branch, const char* identity, const char* password,
+                                    const char* birth, const char* certMsg, int* status) {
+  return EncodeCert(*this, {"18", kRevokeCertParameters, true, kRevokeSteps},
+                    {branch, identity, password, birth}, certMsg, status);
+}
+
+char* CGatewayPub::GetCertEncode(const char* certMsg, int* status) {
+  debuglog("GetCertEncode");
+  return EncodeCert(*this, {"11", kGetCertParameters}, {}, certMsg, status);
+}
+
+char* CGatewayPub::GetCertEncode2(const char* certMsg, int* status) {
+  LogLength("regMsg", AsText(certMsg));
+  return EncodeCert(*this, {"11", kGetCertParameters, false, kGetCert2Steps}, {}, certMsg, status);
+}
+
+char* CGatewayPub::GetCertStatusEncode(const char* certMsg, int* status) {
+  return EncodeCert(*this, {"14", kGetCertStatusParameters}, {}, certMsg, status);
+}
+
+char* CGatewayPub::InstallCertOKEncode(const char* certMsg, int* status) {
+  return EncodeCert(*this, {"16", kInstallCertOKParameters}, {}, certMsg, status);
+}
+
+char* CGatewayPub::OpenCertEncode(const char* certMsg, int* status) {
+  return EncodeCert(*this, {"17", kOpenCertParameters}, {}, certMsg, status);
+}
+
+// Its message has no limit: the request is written into one heap block of its very size.
+char* CGatewayPub::RegisterCertEncode(const char* certMsg, int* status) {
+  constexpr CertRequest kRequest = {"10", kRegisterCertParameters};
+  const std::string_view message = AsText(certMsg);
+  LogLength("RegisterCertEncode:", message);
+  debuglog(certMsg);
+  if (message.empty()) return Fail(kRequest.parameterError, status);
+  CTextWriter head = StartQuery("", "", "", status);
+  if (*status != 1) return head.Text();
+  const std::string_view header(head.Text(), head.Length());
+  const size_t length =
+      header.size() + strlen("FUNC=10|MSG=|01=") + CBase64Utils::EncodedSize(message.size());
+  char* const room = RenewResult(length, status);
+  if (room == nullptr) return nullptr;
+  CTextWriter line(room, length + 1);
+  line.AppendText(header);
+  WriteTail(line, kRequest, {}, message);
+  return line.Text();
+}
+
+char* CGatewayPub::ApplyCertDecode(const char* reply, int* status) {
+  return DecodeCert(*this, "ApplyCertDecode", reply, status);
+}
+
+char* CGatewayPub::ReNewCertDecode(const char* reply, int* status) {
+  return DecodeCert(*this, "ReNewCertDecode", reply, status);
+}
+
+char* CGatewayPub::RevokeCertDecode(const char* reply, int* status) {
+  return DecodeCert(*this, "RevokeCertDecode", reply, status);
+}
+
+char* CGatewayPub::GetCertDecode(const char* reply, int* status) {
+  return DecodeCert(*this, "GetCertDecode", reply, status);
+}
+
+char* CGatewayPub::GetCertStatusDecode(const char* reply, int* status) {
+  return DecodeCert(*this, "GetCertStatusDecode", reply, status);
+}
+
+char* CGatewayPub::InstallCertOKDecode(const char* reply, int* status) {
+  return DecodeCert(*this, "InstallCertOKDecode", reply, status);
+}
+
+// Logs under the name of the status reply.
+char* CGatewayPub::OpenCertDecode(const char* reply, int* status) {
+  return DecodeCert(*this, "GetCertStatusDecode", reply, status);
+}
+
+char* CGatewayPub::RegisterCertDecode(const char* reply, int* status) {
+  return DecodeCert(*this, "RegisterCertDecode", reply, status);
 }

@@ -93,53 +93,48 @@ int AppendNotice(CResultText& list, std::string_view reply) {
   return 1;
 }
 
-}  // namespace
-
-char* CGatewayPub::EncodeAccountQuery(const char* branch, const char* identity,
-                                      const char* password, const char* function, int* status) {
-  *status = 1;
-  CTextWriter line = StartRequest();
-  if (!WriteQueryHead(line, branch, identity, password)) {
-    *status = -1;
-    return line.Text();
-  }
+char* EncodeFunction(CGatewayPub& gateway, const char* branch, const char* identity,
+                     const char* password, const char* function, int* status) {
+  CTextWriter line = gateway.StartQuery(branch, identity, password, status);
+  if (*status != 1) return line.Text();
   line.Append(WIRE("FUNC=%s|01="), function);
-  return Finish(line, status, kBadParameters);
+  return CGatewayPub::Finish(line, status, kBadParameters);
 }
+
+char* ListAccounts(CGatewayPub& gateway, std::string_view reply, bool login, int* status) {
+  if (gateway.TransportFailed(reply, status)) return gateway.m_szBuffer;
+  const std::string_view code = ReadField(reply, kReplyCode);
+  if (login) LogText("[strResult]", code);
+  if (code != kDoneCode) return gateway.Fail(ReadField(reply, kRefusal), status);
+  CResultText list({gateway.m_pData, gateway.m_nDataSize, gateway.m_nDataLen}, reply.size());
+  int count = AppendAccountLines(list, reply);
+  if (count == 0) return gateway.Answer("0!");
+  if (login) count += AppendNotice(list, reply);
+  char* const result = CGatewayPub::FinishList(list, count, status);
+  if (login) LogStatus(*status);
+  return result;
+}
+
+}  // namespace
 
 char* CGatewayPub::AuthEncode(const char* branch, const char* identity, const char* password,
                               int* status) {
-  return EncodeAccountQuery(branch, identity, password, "0", status);
+  return EncodeFunction(*this, branch, identity, password, "0", status);
 }
 
 char* CGatewayPub::GetTotalAccountEncode(const char* branch, const char* identity,
                                          const char* password, int* status) {
-  return EncodeAccountQuery(branch, identity, password, "12", status);
+  return EncodeFunction(*this, branch, identity, password, "12", status);
 }
 
 char* CGatewayPub::AuthDecode(const char* reply, int* status) {
   const std::string_view text = AsText(reply);
   LogReply("AuthDecode", text);
-  return ListAccounts(text, true, status);
+  return ListAccounts(*this, text, true, status);
 }
 
 char* CGatewayPub::GetTotalAccountDecode(const char* reply, int* status) {
   const std::string_view text = AsText(reply);
   LogReply("GetTotalAccountDecode", text);
-  return ListAccounts(text, false, status);
-}
-
-char* CGatewayPub::ListAccounts(std::string_view reply, bool login, int* status) {
-  *status = 1;
-  if (TransportFailed(reply, status)) return m_szBuffer;
-  const std::string_view code = ReadField(reply, kReplyCode);
-  if (login) LogText("[strResult]", code);
-  if (code != kDoneCode) return Fail(ReadField(reply, kRefusal), status);
-  CResultText list({m_pData, m_nDataSize, m_nDataLen}, reply.size());
-  int count = AppendAccountLines(list, reply);
-  if (count == 0) return Answer("0!");
-  if (login) count += AppendNotice(list, reply);
-  char* const result = FinishList(list, count, status);
-  if (login) LogStatus(*status);
-  return result;
+  return ListAccounts(*this, text, false, status);
 }

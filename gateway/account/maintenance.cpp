@@ -28,17 +28,21 @@ int UnsignedCode(char code) {
   return static_cast<unsigned char>(code);
 }
 
+// The answer to a request that has no result but its success.
+char* Acknowledge(CGatewayPub& gateway, std::string_view reply, int* status) {
+  if (gateway.TransportFailed(reply, status)) return gateway.m_szBuffer;
+  const std::string_view code = ReadField(reply, kReplyCode);
+  if (code == kDoneCode) return gateway.Answer("");
+  return gateway.Refuse(ReadField(reply, kRefusal), code, status);
+}
+
 }  // namespace
 
 char* CGatewayPub::OpenAccountEncode(const char*, const char* identity, const char*,
                                      const char* name, const char* address, const char* tel,
                                      char time, char item, int* status) {
-  *status = 1;
-  CTextWriter line = StartRequest();
-  if (!WriteQueryHead(line, "", identity, "")) {
-    *status = -1;
-    return line.Text();
-  }
+  CTextWriter line = StartQuery("", identity, "", status);
+  if (*status != 1) return line.Text();
   line.Append(WIRE("FUNC=9|NAME=%s|ADDRESS=%s|TEL=%s"), name, address, tel);
   line.Append(WIRE("|TIME=%d|ITEM=%d|01="), UnsignedCode(time), UnsignedCode(item));
   return Finish(line, status, kBadParameters);
@@ -49,24 +53,16 @@ char* CGatewayPub::OpenAccountEncode(const char*, const char* identity, const ch
 char* CGatewayPub::ChangePasswordEncode(const char* branch, const char* identity,
                                         const char* password, const char* newPassword,
                                         int* status) {
-  *status = 1;
-  CTextWriter line = StartRequest();
-  if (!WriteQueryHead(line, branch, identity, password)) {
-    *status = -1;
-    return line.Text();
-  }
+  CTextWriter line = StartQuery(branch, identity, password, status);
+  if (*status != 1) return line.Text();
   line.Append(WIRE("FUNC=1|54=%s|55=%s|01="), password, newPassword);
   return FinishEscaped(line, status, kBadParameters);
 }
 
 char* CGatewayPub::QueryBankRemainEncode(const char* branch, const char* identity,
                                          const char* password, int* status) {
-  *status = 1;
-  CTextWriter line = StartRequest();
-  if (!WriteQueryHead(line, branch, identity, password)) {
-    *status = -1;
-    return line.Text();
-  }
+  CTextWriter line = StartQuery(branch, identity, password, status);
+  if (*status != 1) return line.Text();
   line.AppendText("FUNC=7|01=");
   return FinishEscaped(line, status, kBadParameters);
 }
@@ -74,27 +70,18 @@ char* CGatewayPub::QueryBankRemainEncode(const char* branch, const char* identit
 char* CGatewayPub::OpenAccountDecode(const char* reply, int* status) {
   const std::string_view text = AsText(reply);
   LogReply("OpenAccountDecode", text);
-  return Acknowledge(text, status);
+  return Acknowledge(*this, text, status);
 }
 
 // Its reply is not logged.
 char* CGatewayPub::ChangePasswordDecode(const char* reply, int* status) {
-  return Acknowledge(AsText(reply), status);
-}
-
-char* CGatewayPub::Acknowledge(std::string_view reply, int* status) {
-  *status = 1;
-  if (TransportFailed(reply, status)) return m_szBuffer;
-  const std::string_view code = ReadField(reply, kReplyCode);
-  if (code == kDoneCode) return Answer("");
-  return Refuse(ReadField(reply, kRefusal), code, status);
+  return Acknowledge(*this, AsText(reply), status);
 }
 
 // The result code is not looked at: a refused query shows an empty balance.
 char* CGatewayPub::QueryBankRemainDecode(const char* reply, int* status) {
   const std::string_view text = AsText(reply);
   LogReply("QueryBankRemainDecode", text);
-  *status = 1;
   if (TransportFailed(text, status)) return m_szBuffer;
   CRecord record(kTags);
   CRecordWalker walker(text, kRecord);

@@ -21,7 +21,7 @@ char* CGatewayPub::Fail(CTextWriter& line, int* status, const char* message) {
 }
 
 char* CGatewayPub::Answer(std::string_view text) {
-  CTextWriter answer(m_szBuffer, sizeof m_szBuffer);
+  CTextWriter answer = StartRequest();
   answer.AppendText(text);
   return answer.Text();
 }
@@ -33,7 +33,7 @@ char* CGatewayPub::Fail(std::string_view message, int* status) {
 
 char* CGatewayPub::Refuse(std::string_view message, std::string_view code, int* status) {
   *status = -1;
-  CTextWriter answer(m_szBuffer, sizeof m_szBuffer);
+  CTextWriter answer = StartRequest();
   answer.Append(WIRE("%s%s"), SourceOf(message), message);
   if (!code.empty()) answer.Append(WIRE("(%s)"), code);
   return answer.Text();
@@ -64,6 +64,7 @@ char* CGatewayPub::RenewResult(size_t length, int* status) {
 }
 
 bool CGatewayPub::TransportFailed(std::string_view reply, int* status) {
+  *status = 1;
   const Transport transport = JudgeTransport(reply);
   if (transport == Transport::kOk) return false;
   Fail(TransportMessage(transport), status);

@@ -182,15 +182,19 @@ class CGatewayPub {
   char m_szSerialNo[kSerialNoSize];  // no terminator when full
   char m_szLocalIP[kLocalIPSize];    // no terminator when full
 
- protected:
-  // The public headers at work. False leaves a message alone in `line`; an overflow is no failure
-  // here, Finish tells it.
-  bool WriteQueryHead(CTextWriter& line, const char* branch, const char* identity,
-                      const char* password);
-  bool WriteOrderHead(CTextWriter& line, const OrderKey& key);
+  // What operations are made of.
 
-  // An empty request in m_szBuffer.
+  // An empty request or short result in m_szBuffer.
   CTextWriter StartRequest() { return CTextWriter(m_szBuffer, sizeof m_szBuffer); }
+
+  // Starts a query with its header, in m_szBuffer. The status is 1, or -1 when the header failed:
+  // then its message alone stands there. An overflow is no failure here, Finish tells it.
+  CTextWriter StartQuery(const char* branch, const char* identity, const char* password,
+                         int* status);
+
+  // Writes the header of an order. False leaves a message alone in `line`; an overflow is no
+  // failure here either.
+  bool WriteOrderHead(CTextWriter& line, const OrderKey& key);
 
   // Ends an encoder: its request, or the message `overflow` and status -1 when it did not fit.
   static char* Finish(CTextWriter& line, int* status, const char* overflow);
@@ -221,7 +225,8 @@ class CGatewayPub {
   // ran out.
   char* RenewResult(size_t length, int* status);
 
-  // Whether the reply is a transport failure: then m_szBuffer tells it and the status is -1.
+  // Whether the reply is a transport failure. The status is 1, or -1 if so: then m_szBuffer tells
+  // it.
   bool TransportFailed(std::string_view reply, int* status);
 
   // Logs "<name>: Len:<length>" and then the reply itself.
@@ -237,23 +242,10 @@ class CGatewayPub {
   PaddedText PlatformName() const;
   char RequestKind() const;
 
+  bool WriteQueryHead(CTextWriter& line, const char* branch, const char* identity,
+                      const char* password);
   int WritePublicHead(OrderHead head, char function, const OrderOrigin& origin, char* out,
                       char* orderKey);
-
-  char* EncodeAccountQuery(const char* branch, const char* identity, const char* password,
-                           const char* function, int* status);
-  char* ListAccounts(std::string_view reply, bool login, int* status);
-  char* Acknowledge(std::string_view reply, int* status);
-
-  struct CertRequest;
-  struct CertOwner;
-  bool WriteCertHead(CTextWriter& line, const CertRequest& request, const CertOwner& owner,
-                     std::string_view message, int* status);
-  static void WriteCertTail(CTextWriter& line, const CertRequest& request, const CertOwner& owner,
-                            std::string_view message);
-  char* EncodeCert(const CertRequest& request, const CertOwner& owner, const char* certMsg,
-                   int* status);
-  char* DecodeCert(const char* label, const char* reply, int* status);
 };
 
 #endif  // QUORVANE_GATEWAY_CORE_GATEWAY_PUB_H_

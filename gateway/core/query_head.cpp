@@ -45,6 +45,13 @@ int CGatewayPub::initQueryHead(const char* branch, const char* identity, const c
   return EndPublicHead(line, written);
 }
 
+CTextWriter CGatewayPub::StartQuery(const char* branch, const char* identity, const char* password,
+                                    int* status) {
+  CTextWriter line = StartRequest();
+  *status = WriteQueryHead(line, branch, identity, password) ? 1 : -1;
+  return line;
+}
+
 bool CGatewayPub::WriteQueryHead(CTextWriter& line, const char* branch, const char* identity,
                                  const char* password) {
   Stamp stamp;

@@ -117,21 +117,19 @@ void AppendFill(CResultText& list, const CRecord& record) {
 
 char* CGatewayFut::QueryReplyEncode(const char* branch, const char* identity, const char* password,
                                     const char* startDate, const char* endDate, int* status) {
-  *status = 1;
-  CTextWriter line = StartRequest();
   for (const char* const text : {branch, identity, password, startDate, endDate}) {
-    if (AsText(text).empty()) return Fail(line, status, kBadParameters);
+    if (AsText(text).empty()) return Fail(kBadParameters, status);
   }
   const int start = RocDateToStandardDate(startDate);
   const int end = RocDateToStandardDate(endDate);
-  if (start == 0 || end == 0) return Fail(line, status, kBadDateRange);
-  if (!StartQuery(line, branch, identity, password, status)) return line.Text();
+  if (start == 0 || end == 0) return Fail(kBadDateRange, status);
+  CTextWriter line = StartQuery(branch, identity, password, status);
+  if (*status != 1) return line.Text();
   line.Append(WIRE("FUNC=x|FUNC1=1|SDATE=%d|EDATE=%d|01=\n"), start, end);
   return FinishEscaped(line, status, kBadParameters);
 }
 
 char* CGatewayFut::QueryReplyDecode(const char* reply, int* status) {
-  *status = 1;
   const std::string_view text = AsText(reply);
   if (char* const answer = AnswerWithoutRecords(text, "0!", status)) return answer;
 

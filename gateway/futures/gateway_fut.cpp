@@ -46,6 +46,7 @@ char* CGatewayFut::GetResultCode(const char* reply, char* out, int size) {
 
 char* CGatewayFut::AnswerWithoutRecords(std::string_view reply, std::string_view noData,
                                         int* status) {
+  *status = 1;
   if (reply.empty()) return Fail(kNoReply, status);
   const std::string_view code = ReplyCode(reply);
   if (code == kDoneCode) return nullptr;
@@ -54,11 +55,4 @@ char* CGatewayFut::AnswerWithoutRecords(std::string_view reply, std::string_view
   CTextWriter answer(m_szBuffer, sizeof m_szBuffer);
   WriteReplyCode(code, reply, answer);
   return answer.Text();
-}
-
-bool CGatewayFut::StartQuery(CTextWriter& line, const char* branch, const char* identity,
-                             const char* password, int* status) {
-  if (WriteQueryHead(line, branch, identity, password)) return true;
-  *status = -1;
-  return false;
 }

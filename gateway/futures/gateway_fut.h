@@ -119,13 +119,9 @@ class CGatewayFut : public CGatewayPub {
   char* EncodeOrder(OrderHead head, const OrderOrigin& origin, const FuturesOrder& order,
                     int* status);
 
-  // Starts the request of a query; false leaves the header's message in `line` and status -1.
-  bool StartQuery(CTextWriter& line, const char* branch, const char* identity, const char* password,
-                  int* status);
-
   // Ends the decoder of a list of fills or positions that the reply as a whole refuses, in
-  // GetResultCode's words, or that has nothing to show, which the user interface knows as `noData`.
-  // Null when there are records to read.
+  // GetResultCode's words and with status -1, or that has nothing to show, which the user interface
+  // knows as `noData`. Null when there are records to read.
   char* AnswerWithoutRecords(std::string_view reply, std::string_view noData, int* status);
 };
 

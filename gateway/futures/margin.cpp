@@ -75,9 +75,8 @@ constexpr int QueryTypeOnWire(int queryType) {
 
 char* CGatewayFut::QueryFinanceEncode(const char* branch, const char* identity,
                                       const char* password, int queryType, int* status) {
-  *status = 1;
-  CTextWriter line = StartRequest();
-  if (!StartQuery(line, branch, identity, password, status)) return line.Text();
+  CTextWriter line = StartQuery(branch, identity, password, status);
+  if (*status != 1) return line.Text();
   line.Append(WIRE("FUNC=P|28=%d|01="), QueryTypeOnWire(queryType));
   return FinishEscaped(line, status, kBadParameters);
 }

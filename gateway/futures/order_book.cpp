@@ -254,9 +254,8 @@ bool AppendOrder(CResultText& list, const CRecord& record, int32_t market, Stand
 
 char* CGatewayFut::QueryOrderEncode(const char* branch, const char* identity, const char* password,
                                     const char* date, int selection, int* status) {
-  *status = 1;
-  CTextWriter line = StartRequest();
-  if (!StartQuery(line, branch, identity, password, status)) return line.Text();
+  CTextWriter line = StartQuery(branch, identity, password, status);
+  if (*status != 1) return line.Text();
   const CTransDate day(AsText(date));
   if (day.Text().empty()) return Fail(line, status, kBadOrderDate);
   line.Append(WIRE("FUNC=x|FUNC1=0|SDATE=%s"), day.Text());

@@ -122,19 +122,17 @@ void AppendOption(CResultText& list, const Position& position) {
 
 char* CGatewayFut::QueryInventoryEncode(const char* branch, const char* identity,
                                         const char* password, int* status) {
-  *status = 1;
-  CTextWriter line = StartRequest();
   for (const char* const text : {branch, identity, password}) {
-    if (AsText(text).empty()) return Fail(line, status, kBadPositionQuery);
+    if (AsText(text).empty()) return Fail(kBadPositionQuery, status);
   }
-  if (!StartQuery(line, branch, identity, password, status)) return line.Text();
+  CTextWriter line = StartQuery(branch, identity, password, status);
+  if (*status != 1) return line.Text();
   line.AppendText("FUNC=O|01=");
   return Finish(line, status, kBadParameters);
 }
 
 // The sections grow side by side in the object's two texts.
 char* CGatewayFut::QueryInventoryDecode(const char* reply, int* status) {
-  *status = 1;
   const std::string_view text = AsText(reply);
   if (char* const answer = AnswerWithoutRecords(text, "<5>!0!<6>!0!", status)) return answer;
 

@@ -34,19 +34,14 @@ constexpr CListTable kTags(kRows, {kRecord});
 
 char* CGatewayStk::QueryCreditInfoEncode(const char* branch, const char* identity,
                                          const char* password, const char* stockCode, int* status) {
-  *status = 1;
-  CTextWriter line = StartRequest();
-  if (!WriteQueryHead(line, branch, identity, password)) {
-    *status = -1;
-    return line.Text();
-  }
+  CTextWriter line = StartQuery(branch, identity, password, status);
+  if (*status != 1) return line.Text();
   line.Append(WIRE("|FUNC=8|29=%s|01="), stockCode);
   return FinishEscaped(line, status, kBadParameters);
 }
 
 // The reply is not logged.
 char* CGatewayStk::QueryCreditInfoDecode(const char* reply, int* status) {
-  *status = 1;
   const std::string_view text = AsText(reply);
   if (TransportFailed(text, status)) return m_szBuffer;
   const CReplyList credit(text, kTags);

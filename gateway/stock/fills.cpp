@@ -54,12 +54,8 @@ void AppendFill(CResultText& list, const CRecord& record, int typeCode) {
 
 char* CGatewayStk::QueryReplyEncode(const char* branch, const char* identity, const char* password,
                                     const char* startDate, const char* endDate, int* status) {
-  *status = 1;
-  CTextWriter line = StartRequest();
-  if (!WriteQueryHead(line, branch, identity, password)) {
-    *status = -1;
-    return line.Text();
-  }
+  CTextWriter line = StartQuery(branch, identity, password, status);
+  if (*status != 1) return line.Text();
   const CTransDate start(AsText(startDate));
   const CTransDate end(AsText(endDate));
   if (start.Text().empty() || end.Text().empty()) return Fail(line, status, kDateError);
@@ -68,7 +64,6 @@ char* CGatewayStk::QueryReplyEncode(const char* branch, const char* identity, co
 }
 
 char* CGatewayStk::QueryReplyDecode(const char* reply, int* status) {
-  *status = 1;
   const std::string_view text = AsText(reply);
   if (TransportFailed(text, status)) return m_szBuffer;
   CReplyList fills(text, kTags);

@@ -171,19 +171,14 @@ void AppendOrder(CResultText& list, const CRecord& record, int typeCode, int mar
 
 char* CGatewayStk::QueryOrderEncode(const char* branch, const char* identity, const char* password,
                                     const char* date, int tradeType, int* status) {
-  *status = 1;
-  CTextWriter line = StartRequest();
-  if (!WriteQueryHead(line, branch, identity, password)) {
-    *status = -1;
-    return line.Text();
-  }
+  CTextWriter line = StartQuery(branch, identity, password, status);
+  if (*status != 1) return line.Text();
   if (AsText(date).empty()) return Fail(line, status, kDateError);
   line.Append(WIRE("|FUNC=2|SDATE=%s|EDATE=%s|28=%d|01=\n"), date, date, tradeType);
   return FinishEscaped(line, status, kBadParameters);
 }
 
 IN_ONE_PIECE char* CGatewayStk::QueryOrderDecode(const char* reply, int* status) {
-  *status = 1;
   const std::string_view text = AsText(reply);
   LogReply("QueryOrderDecode", text);
   if (TransportFailed(text, status)) return m_szBuffer;

@@ -125,12 +125,8 @@ struct CGatewayStk::PositionLayout {
 
 char* CGatewayStk::QueryInventoryEncode(const char* branch, const char* identity,
                                         const char* password, int* status) {
-  *status = 1;
-  CTextWriter line = StartRequest();
-  if (!WriteQueryHead(line, branch, identity, password)) {
-    *status = -1;
-    return line.Text();
-  }
+  CTextWriter line = StartQuery(branch, identity, password, status);
+  if (*status != 1) return line.Text();
   line.AppendText("|FUNC=5|01=");
   return FinishEscaped(line, status, kBadParameters);
 }
@@ -157,7 +153,6 @@ char* CGatewayStk::QueryInventoryDecodeJZG(const char* reply, int* status) {
 char* CGatewayStk::ListPositions(const char* reply, const PositionLayout& layout, int* status) {
   const std::string_view text = AsText(reply);
   LogReply("QueryInventoryDecode", text);
-  *status = 1;
   if (TransportFailed(text, status)) return m_szBuffer;
   CReplyList positions(text, kTags);
   if (char* const answer = AnswerWithoutData(positions, layout.noData, status)) return answer;

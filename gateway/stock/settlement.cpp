@@ -113,12 +113,8 @@ struct CGatewayStk::PaymentLayout {
 
 char* CGatewayStk::PaymentEncode(const char* branch, const char* identity, const char* password,
                                  const char* period, const char* endDate, int* status) {
-  *status = 1;
-  CTextWriter line = StartRequest();
-  if (!WriteQueryHead(line, branch, identity, password)) {
-    *status = -1;
-    return line.Text();
-  }
+  CTextWriter line = StartQuery(branch, identity, password, status);
+  if (*status != 1) return line.Text();
   line.AppendText("|FUNC=6|H4=1");
   if (const char* const code = PeriodCodeOf(period)) {
     line.Append(WIRE("|SDATE=%s|EDATE="), code);
@@ -172,7 +168,6 @@ bool CGatewayStk::AppendPayment(CResultText& list, const CRecord& record,
 char* CGatewayStk::ListPayments(const char* reply, const PaymentLayout& layout, int* status) {
   const std::string_view text = AsText(reply);
   LogReply("PaymentDecode", text);
-  *status = 1;
   if (TransportFailed(text, status)) return m_szBuffer;
   CReplyList payments(text, kTags);
   if (char* const answer = AnswerWithoutData(payments, "0!", status)) return answer;
