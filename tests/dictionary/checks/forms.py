@@ -67,20 +67,18 @@ class Writer:
         """Whether the dictionary has a form, and one alone, for these values."""
         return len(forms_of(self.operation, self.values)) == 1 and self._identity() is not None
 
+    def header_text(self):
+        """The header of values that have a form."""
+        header = self.header["begin"] + self._identity() + self.header.get("end", "")
+        if "orderDate" in self.header and self.values["orderDate"]:
+            header += self.header["orderDate"]
+        return self._fill(header)
+
     def request(self):
         """The request of values that have a form."""
-        forms = forms_of(self.operation, self.values)
-        identity = self._identity()
-        header = self.header["begin"] + identity
-        if not self._stops_at_identity():
-            header += self.header.get("end", "")
-            if "orderDate" in self.header and self.values["orderDate"]:
-                header += self.header["orderDate"]
-        text = self._fill(header + self._pieces(forms[0]["body"]))
+        form = forms_of(self.operation, self.values)[0]
+        text = self.header_text() + self._fill(self._pieces(form["body"]))
         return text.replace(" ", "%20") if self.operation.get("blanksEscaped") else text
-
-    def _stops_at_identity(self):
-        return not self.header["identity"]
 
     def _identity(self):
         rows = self.header["identity"]

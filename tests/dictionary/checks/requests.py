@@ -36,7 +36,7 @@ HOSTILE = {
 }
 
 
-def run(whole, program):
+def run(whole, program, _):
     found = library.Findings()
     lib = library.Library(program)
     messages = load.by_name(whole["messages"], "id")
