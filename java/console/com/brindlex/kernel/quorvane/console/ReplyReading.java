@@ -74,7 +74,10 @@ final class ReplyReading {
                 .map(token -> token.value().equals("0000")).orElse(false);
     }
 
-    /** Balance and margin are read from the first record alone; two lists end with the reply. */
+    /**
+     * Balance and margin are read from the first record alone; the lists of accounts, and the fills
+     * and positions of futures, need no end mark.
+     */
     private static boolean endsWithMark(Operation operation) {
         return operation == Operation.QUERY_ORDER_DECODE
                 || operation == Operation.QUERY_REPLY_DECODE
