@@ -26,7 +26,7 @@ set(CMAKE_CXX_COMPILER_TARGET ${target})
 set(CMAKE_STRIP llvm-strip)
 set(CMAKE_TRY_COMPILE_TARGET_TYPE STATIC_LIBRARY)
 # As the NDK: tables to unwind by, the compiler's routines from an archive.
-set(CMAKE_CXX_FLAGS_INIT "-funwind-tables -isystem ${ANDROID_NDK}/sysroot/include \
+set(CMAKE_CXX_FLAGS_INIT "-funwind-tables -isystem \"${ANDROID_NDK}/sysroot/include\" \
 -isystem /usr/include/android/nativehelper")
 set(CMAKE_SHARED_LINKER_FLAGS_INIT
-    "-fuse-ld=lld -static-libgcc -L${ANDROID_NDK}/sysroot/lib/${ANDROID_ABI}")
+    "-fuse-ld=lld -static-libgcc -L\"${ANDROID_NDK}/sysroot/lib/${ANDROID_ABI}\"")
