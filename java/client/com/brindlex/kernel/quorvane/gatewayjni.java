@@ -40,7 +40,7 @@ package com.brindlex.kernel.quorvane;
  */
 public final class gatewayjni {
     static {
-        System.loadLibrary("quorvane");
+        NativeLibrary.load();
     }
 
     // Everything is static.
