@@ -30,8 +30,4 @@ inline const char* SourceOf(std::string_view message) {
   return "[GATEWAY]";
 }
 
-// Orders.
-inline constexpr char kOrderKindError[] = "[CLIENT] 委託種類錯誤";
-inline constexpr char kOrderInTransit[] = "委託單傳送中!!";
-
 #endif  // QUORVANE_GATEWAY_CORE_MESSAGES_H_

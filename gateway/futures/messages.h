@@ -11,4 +11,6 @@ inline constexpr char kBadDateRange[] = "[CLIENT]起訖日期錯誤";
 inline constexpr char kBadPositionQuery[] = "傳入的參數錯誤";  // the one without a source
 inline constexpr char kLegKindError[] = "[CLIENT]委託種類錯誤";
 
+inline constexpr char kRangeMarketPrice[] = "範圍市價";
+
 #endif  // QUORVANE_GATEWAY_FUTURES_MESSAGES_H_

@@ -14,8 +14,9 @@
 #include "gateway/futures/gateway_fut.h"
 #include "gateway/futures/leg_code.h"
 #include "gateway/futures/messages.h"
-#include "gateway/futures/order_state.h"
 #include "gateway/futures/reply_code.h"
+#include "gateway/orders/messages.h"
+#include "gateway/orders/order_state.h"
 
 namespace {
 
@@ -186,9 +187,9 @@ void AppendPrice(CResultText& list, const CRecord& record) {
   if (!record.Has(kPriceType)) return;
   const int32_t type = record.Number(kPriceType);
   if (type == 1) {
-    list.AppendText("@市價");
+    list.Append(WIRE("@%s"), kMarketPrice);
   } else if (type == 3) {
-    list.AppendText("@範圍市價");
+    list.Append(WIRE("@%s"), kRangeMarketPrice);
   } else {
     list.Append(WIRE("@%d"), ScalePrice(record.Text(kPrice), kPriceDecimals));
   }
@@ -231,7 +232,7 @@ bool AppendOrder(CResultText& list, const CRecord& record, int32_t market, Stand
   const std::string_view callPut = record.Text(kCallPut1);
   const bool option = callPut == "C" || callPut == "P";
   if (!option && !IsBlank(callPut)) return false;
-  const bool failed = record.Text(kOrderState) == "E";
+  const bool failed = IsFailed(record.Text(kOrderState));
   const std::string_view message = failed ? record.Text(kGatewayText) : std::string_view();
 
   list.Append(WIRE("%s@%s"), record.Text(kGatewayNumber), record.Text(kOrderNumber));

@@ -1,22 +1,18 @@
-// Futures and options orders: new, change, cancel, and the gateway's answer to them.
+// Futures and options orders: new, change, cancel.
 //
 //   request  <order header> 27 28 29 30 31 M8 32 33 34 O4 V5 V6 V8 [<second leg>]
 //            ( W3 | 36 46 37 ) N6 <signature payload>
-//   reply    |39=blank|19=code|46=number|44=date|MT=flag|K1=refusal
-//   result   46 @ date @ @ accepted @ flag @ !
 #include "gateway/core/conversions.h"
 #include "gateway/core/messages.h"
 #include "gateway/core/protocol.h"
 #include "gateway/futures/futures_order.h"
 #include "gateway/futures/gateway_fut.h"
+#include "gateway/orders/order_reference.h"
 
 namespace {
 
 // Room for one value of an order reference: a longer one is dropped.
 constexpr size_t kReferencePartSize = 48;
-
-// Room for a refused order's message.
-constexpr size_t kRefusalSize = 128;
 
 constexpr int kPriceDecimals = 4;
 constexpr char kMarketPrice[] = "00000000.000000";
@@ -74,16 +70,6 @@ const char* CombinationCode(const FuturesOrder& order) {
   return SameStart(first.month, second.month, 16) ? "1" : "2";
 }
 
-// The two values of a reference, joined by '&'; what follows a second '&' is not read.
-struct Reference {
-  explicit Reference(std::string_view text)
-      : first(Bounded(TakePiece(text, '&'), kReferencePartSize)),
-        second(Bounded(TakePiece(text, '&'), kReferencePartSize)) {}
-
-  std::string_view first;
-  std::string_view second;
-};
-
 // W1 carries the call/put and W2 the strike; only a new order repeats its quantity for the leg.
 void WriteSecondLeg(const FuturesOrder& order, CTextWriter& body) {
   const Leg& leg = order.second;
@@ -107,8 +93,9 @@ void WriteBody(const FuturesOrder& order, const char* price, CTextWriter& body) 
     body.Append(WIRE("|W3=%c"), order.w3);
     return;
   }
-  const Reference reference(AsText(order.reference));
-  body.Append(WIRE("|36=%s|46=%s|37=%ld"), reference.first, reference.second, order.quantity);
+  const OrderReference reference(AsText(order.reference), kReferencePartSize);
+  body.Append(WIRE("|36=%s|46=%s|37=%ld"), reference.orderNumber, reference.gatewayNumber,
+              order.quantity);
 }
 
 // An order and the two texts that its signature payload needs beside it.
@@ -123,7 +110,7 @@ void SignPlain(const Signing& signing, CTextWriter& out) {
   const FuturesOrder& order = signing.order;
   const Leg& first = order.first;
   const Leg& second = order.second;
-  const Reference reference(AsText(order.reference));
+  const OrderReference reference(AsText(order.reference), kReferencePartSize);
   if (order.IsNew() && order.HasTwoLegs()) {
     out.Append(WIRE("!!%s_%c_%c_%s_%s_%s_%s_%c_%s_%s_%s_%s_%ld_%s"), signing.key, order.timeInForce,
                first.side, first.commodity, first.month, first.strike, first.callPut, second.side,
@@ -134,9 +121,9 @@ void SignPlain(const Signing& signing, CTextWriter& out) {
                first.commodity, first.month, first.strike, first.callPut, order.quantity,
                signing.price);
   } else if (order.function == 'C') {
-    out.Append(WIRE("!!%s_%s_%ld"), signing.key, reference.first, order.quantity);
+    out.Append(WIRE("!!%s_%s_%ld"), signing.key, reference.orderNumber, order.quantity);
   } else {
-    out.Append(WIRE("!!%s_%s"), signing.key, reference.first);
+    out.Append(WIRE("!!%s_%s"), signing.key, reference.orderNumber);
   }
 }
 
@@ -146,7 +133,7 @@ void SignInPlaces(const Signing& signing, CTextWriter& out) {
   const FuturesOrder& order = signing.order;
   const Leg& first = order.first;
   const Leg& second = order.second;
-  const Reference reference(AsText(order.reference));
+  const OrderReference reference(AsText(order.reference), kReferencePartSize);
   if (order.IsNew() && order.HasTwoLegs()) {
     out.Append(WIRE("|PL=S!!%s,%c,%c,%d,%c,%s,%s,%s,%s,%c,%s,%s,%s,%s,%ld,%s,"), signing.key,
                order.timeInForce, order.w3, int{order.priceType}, first.side, first.commodity,
@@ -158,12 +145,12 @@ void SignInPlaces(const Signing& signing, CTextWriter& out) {
                first.month, first.strike, first.callPut, order.quantity, signing.price);
   } else if (order.function == 'A') {
     out.Append(WIRE("|PL=S!!%s,%c,,,,,,,,,,,,,%ld,%s,%s"), signing.key, order.timeInForce,
-               order.quantity, signing.price, reference.first);
+               order.quantity, signing.price, reference.orderNumber);
   } else if (order.function == 'C') {
     out.Append(WIRE("|PL=S!!%s,,,,,,,,,,,,,,%ld,,%s"), signing.key, order.quantity,
-               reference.first);
+               reference.orderNumber);
   } else {
-    out.Append(WIRE("|PL=S!!%s,,,,,,,,,,,,,,0,,%s"), signing.key, reference.first);
+    out.Append(WIRE("|PL=S!!%s,,,,,,,,,,,,,,0,,%s"), signing.key, reference.orderNumber);
   }
 }
 
@@ -213,16 +200,6 @@ FuturesOrder NameOrder(const char* reference, const char* commodity1, const char
           timeInForce,
           quantity,
           price};
-}
-
-constexpr bool IsAccepted(std::string_view code) {
-  return !code.empty() && std::string_view("STXY").find(code.front()) != std::string_view::npos;
-}
-
-// What follows the accepted flag, by the first character of tag MT.
-const char* FlagEnding(std::string_view flag) {
-  if (flag.empty()) return "@@!";
-  return flag.front() == '0' ? "@0@!" : flag.front() == '1' ? "@1@!" : "@@!";
 }
 
 }  // namespace
@@ -307,25 +284,4 @@ int CGatewayFut::EncodeSubmitOrderRecord1(
                                 callPut1, callPut2, n6, orderKind, priceType, function, w3,
                                 timeInForce, side1, side2, quantity, price),
                       SignInPlaces, body, signature);
-}
-
-// An empty reply is told from a failed transport first: the order is under way.
-char* CGatewayFut::SubmitOrderDecode(const char* reply, int* status) {
-  *status = 1;
-  const std::string_view text = AsText(reply);
-  if (text.empty()) return Answer(kOrderInTransit);
-  if (TransportFailed(text, status)) return m_szBuffer;
-  const auto value = [text](std::string_view tag, size_t bound, Blanks blanks = Blanks::kTaken) {
-    return Bounded(FindField(text, tag, blanks), bound);
-  };
-  if (value("39", 256) != " ") return Fail(value("K1", kRefusalSize, Blanks::kSkipped), status);
-  const std::string_view code = value("19", 128);
-  if (!IsAccepted(code)) return Fail(value("K1", kRefusalSize), status);
-
-  const CTransDate date(value("44", 16));
-  CTextWriter record(m_szBuffer, sizeof m_szBuffer);
-  record.Append(WIRE("%s@%s@"), value("46", 128), date.Text());
-  record.AppendText(code.front() == 'X' ? "@0" : "@1");
-  record.AppendText(FlagEnding(value("MT", kBufferSize)));
-  return record.Text();
 }

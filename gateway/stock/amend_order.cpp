@@ -5,7 +5,7 @@
 //
 // The price goes out as a plain number of hundredths, and neither it nor the quantity is checked.
 #include "gateway/core/conversions.h"
-#include "gateway/core/protocol.h"
+#include "gateway/orders/order_reference.h"
 #include "gateway/stock/gateway_stk.h"
 #include "gateway/stock/stock_order.h"
 
@@ -30,46 +30,40 @@ const char* FindFaultTagged(const StockOrder& order) {
   return kTaggedKinds.Has(order.kind) ? FindFaultBehindKind(order) : kOrderKindError;
 }
 
-// What names the order to the broker, and what names it to the gateway.
-struct Reference {
-  std::string_view order, gateway;
-};
-
-Reference SplitReference(const StockOrder& order) {
-  std::string_view rest = order.reference;
-  const std::string_view first = Bounded(TakePiece(rest, '&'), kReferenceSize);
-  return {first, Bounded(TakePiece(rest, '&'), kReferenceSize)};
+OrderReference SplitReference(const StockOrder& order) {
+  return OrderReference(order.reference, kReferenceSize);
 }
 
 // A body begins alike in every form; `rest` are the values of the format's own marks. One piece: a
 // side of NUL loses all that follows it.
 template <class Format, class... Rest>
 void WriteBody(CTextWriter& line, Format format, const StockOrder& order,
-               const Reference& reference, const Rest&... rest) {
-  line.Append(format, RocToWesternDate(order.origin.rocDate), reference.order, reference.gateway,
-              order.tradeType, order.stockCode, SentPrice(order), order.side, rest...);
+               const OrderReference& reference, const Rest&... rest) {
+  line.Append(format, RocToWesternDate(order.origin.rocDate), reference.orderNumber,
+              reference.gatewayNumber, order.tradeType, order.stockCode, SentPrice(order),
+              order.side, rest...);
 }
 
 // Sends no quantity, and lots of 1000 whatever the order says.
 void WriteCancel(CTextWriter& line, const StockOrder& order, const OrderKey& key) {
-  const Reference reference = SplitReference(order);
+  const OrderReference reference = SplitReference(order);
   WriteBody(line, WIRE("|10=%08d|36=%s|46=%s|28=%d|29=%s|31=%d|32=%c|N6=%d|27=%d|UT=1000|13=%c"),
             order, reference, order.n6, order.kind, order.flag13);
   line.AppendPieces(OpenBare(), key.Plain());
-  line.Append(WIRE("_%s_%c_%s__"), reference.order, order.side, order.stockCode);
+  line.Append(WIRE("_%s_%c_%s__"), reference.orderNumber, order.side, order.stockCode);
 }
 
 void WriteChange(CTextWriter& line, const StockOrder& order, const OrderKey& key) {
-  const Reference reference = SplitReference(order);
+  const OrderReference reference = SplitReference(order);
   WriteBody(line,
             WIRE("|10=%08d|36=%s|46=%s|28=%d|29=%s|31=%d|32=%c|37=%d|N6=%d|27=%d|UT=%d|13=%c"),
             order, reference, SentQuantity(order), order.n6, order.kind, order.unit, order.flag13);
   line.AppendPieces(OpenBare(), key.Plain());
-  line.Append(WIRE("_%s_%c_%s_%d_"), reference.order, order.side, order.stockCode,
+  line.Append(WIRE("_%s_%c_%s_%d_"), reference.orderNumber, order.side, order.stockCode,
               SentQuantity(order));
 }
 
-void WriteTaggedBody(CTextWriter& line, const StockOrder& order, const Reference& reference) {
+void WriteTaggedBody(CTextWriter& line, const StockOrder& order, const OrderReference& reference) {
   WriteBody(line, WIRE("|10=%08d|36=%s|46=%s|28=%d|29=%s|31=%d|32=%c|37=%d|N6=%d|27=%d|UT=%d"),
             order, reference, SentQuantity(order), order.n6, order.kind, order.unit);
 }
@@ -77,19 +71,19 @@ void WriteTaggedBody(CTextWriter& line, const StockOrder& order, const Reference
 // In tag PL the columns of order kind, price kind and price stay empty, for a cancellation the
 // quantity's, too.
 void WriteTaggedCancel(CTextWriter& line, const StockOrder& order, const OrderKey& key) {
-  const Reference reference = SplitReference(order);
+  const OrderReference reference = SplitReference(order);
   WriteTaggedBody(line, order, reference);
   line.AppendPieces(OpenTagged(), key.Signed());
   line.Append(WIRE(",%c,%s,,%d,,,,%s"), order.side, order.stockCode, order.tradeType,
-              reference.order);
+              reference.orderNumber);
 }
 
 void WriteTaggedChange(CTextWriter& line, const StockOrder& order, const OrderKey& key) {
-  const Reference reference = SplitReference(order);
+  const OrderReference reference = SplitReference(order);
   WriteTaggedBody(line, order, reference);
   line.AppendPieces(OpenTagged(), key.Signed());
   line.Append(WIRE(",%c,%s,,%d,,%d,,%s"), order.side, order.stockCode, order.tradeType,
-              SentQuantity(order), reference.order);
+              SentQuantity(order), reference.orderNumber);
 }
 
 constexpr OrderForm kCancel = {'D', OrderHead::kPlain, FindFault, WriteCancel};

@@ -95,10 +95,6 @@ class CGatewayStk : public CGatewayPub {
   // The one road of the encoders that have a status.
   char* EncodeOrder(const OrderForm& form, const StockOrder& order, int* status);
 
-  // Whether the gateway's answer refuses an order, or is none: then m_szBuffer tells it and the
-  // status is -1. Otherwise `outcome` is one of "STXY".
-  bool OrderRefused(std::string_view reply, char& outcome, int* status);
-
   // What differs between the brokerages' layouts of positions and of settlement, and the lists.
   struct PositionLayout;
   struct PaymentLayout;

@@ -10,6 +10,7 @@
 #include <algorithm>
 
 #include "gateway/core/conversions.h"
+#include "gateway/orders/order_state.h"
 #include "gateway/stock/gateway_stk.h"
 #include "gateway/stock/messages.h"
 #include "gateway/stock/order_type_codes.h"
@@ -51,10 +52,6 @@ constexpr TagRow kRows[] = {
     {kChangeable, "JV", 50}};
 constexpr CListTable kTags(kRows, kStockList);
 
-// What the gateway's text says of an order that it did not fail.
-constexpr std::string_view kAllCancelledText = "全部取消";
-constexpr std::string_view kSentText = "委託已傳送，等待接收回報！";
-
 // What the text of a failed order says while it waits, on the market that shows it.
 constexpr std::string_view kWaitingText = "WAIT ";
 constexpr int kWaitingMarket = 8;
@@ -72,42 +69,11 @@ int TypeCodeOf(const CRecord& record) {
                           record.Text(kSide) == "B");
 }
 
-struct Quantities {
-  int ordered, filled, cancelled;
-};
-
-Quantities QuantitiesOf(const CRecord& record) {
-  return {record.Number(kOrderedQuantity), record.Number(kFilledQuantity),
-          WrapAdd(record.Number(kReduced37), record.Number(kCancelled41))};
-}
-
-// The market's number says whose wording its users know for an order on its way.
-bool CallsSentOrdersReceived(int market) {
-  return market == 3 || market == 103;
-}
-
-// The state of an order that did not fail: by the gateway's text, else by what became of it.
-std::string_view StateOf(const Quantities& order, std::string_view text, bool reserved,
-                         int market) {
-  if (text == kAllCancelledText) return kCancelledState;
-  if (text == kSentText) {
-    return CallsSentOrdersReceived(market) ? kReceivedState : kProcessingState;
-  }
-  if (order.cancelled == order.ordered) return kCancelledState;
-  if (order.filled == 0) {
-    if (order.cancelled != 0) return kReducedState;
-    return reserved ? kReservedState : kAcceptedState;
-  }
-  if (order.ordered == order.filled) return kFilledState;
-  if (order.ordered == WrapAdd(order.cancelled, order.filled)) return kFilledCancelledState;
-  return kPartlyFilledState;
-}
-
 // What the gateway says of a failed order, with no '!' that would end the record; empty for any
 // other order.
 class CFailure {
  public:
-  explicit CFailure(const CRecord& record) : m_bFailed(record.Text(kOrderState) == "E") {
+  explicit CFailure(const CRecord& record) : m_bFailed(IsFailed(record.Text(kOrderState))) {
     if (!m_bFailed) return;
     m_nLength = record.Text(kGatewayText).copy(m_szText, sizeof m_szText);
     std::replace(m_szText, m_szText + m_nLength, '!', ' ');
@@ -150,21 +116,28 @@ std::string_view ChangeFlagOf(const CRecord& record, const CFailure& failure) {
 }
 
 void AppendOrder(CResultText& list, const CRecord& record, int typeCode, int market) {
-  const Quantities order = QuantitiesOf(record);
+  const OrderState order = {record.Number(kOrderedQuantity),
+                            WrapAdd(record.Number(kReduced37), record.Number(kCancelled41)),
+                            record.Number(kFilledQuantity),
+                            '\0',
+                            record.Text(kOrderState),
+                            record.Text(kHandlingFlag),
+                            record.Text(kGatewayText),
+                            market};
   const CFailure failure(record);
-  const std::string_view n6 = record.Text(kHandlingFlag);
   list.Append(WIRE("%s@%s@%d@%s@%d@"), record.Text(kGatewayNumber), record.Text(kOrderNumber),
-              typeCode, record.Text(kStockCode), order.ordered);
+              typeCode, record.Text(kStockCode), order.quantity);
   if (failure.Failed()) {
     AppendFailure(list, failure.Text(), market);
   } else {
-    list.AppendText(StateOf(order, record.Text(kGatewayText), n6 == "0", market));
+    list.AppendText(OrderStateText(order));
   }
   list.Append(WIRE("@%d@%d@"), order.filled, order.cancelled);
   AppendPrice(list, record);
   list.Append(WIRE("@%s@%s@%s@%s@%s!"), FirstSix(record.Text(kEntryTime)),
               CTransDate(record.Text(kEntryDate)).Text(),
-              CTransDate(record.Text(kOrderDate)).Text(), n6, ChangeFlagOf(record, failure));
+              CTransDate(record.Text(kOrderDate)).Text(), order.handlingFlag,
+              ChangeFlagOf(record, failure));
 }
 
 }  // namespace

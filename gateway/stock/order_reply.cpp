@@ -1,59 +1,48 @@
-// The gateway's answers to orders: one line of fields, no records.
+// The gateway's answers to stock orders (see orders/order_answer.h).
 //
-//   reply    |39=state|K1=text|19=outcome|46=number|44=date
 //   result   new order: number@date@@accepted!   cancellation, change: empty
-//
-// An order went through when 39 is a single blank and 19 begins with one of S, T, X, Y; else the
-// text K1 says why not.
 #include "gateway/core/conversions.h"
-#include "gateway/core/messages.h"
+#include "gateway/orders/messages.h"
+#include "gateway/orders/order_answer.h"
 #include "gateway/stock/gateway_stk.h"
 
 namespace {
 
-// Two values of this size fit the answer.
-constexpr size_t kAnswerFieldSize = 2000;
+constexpr ReplyField kRefusalMark = {"39", 20};
+constexpr ReplyField kGatewayText = {"K1", 200};
+constexpr ReplyField kAcceptance = {"19", 20};
 
-std::string_view Read(std::string_view reply, std::string_view tag, size_t bound) {
-  return Bounded(FindField(reply, tag, Blanks::kTaken), bound);
-}
+// Two values of this size fit the result.
+constexpr ReplyField kGatewayNumber = {"46", 2000};
+constexpr ReplyField kOrderDate = {"44", 2000};
 
-// The outcome when the gateway took the order, or NUL.
-char OutcomeOf(std::string_view reply) {
-  if (Read(reply, "39", 20) != " ") return '\0';
-  const std::string_view outcome = Read(reply, "19", 20);
-  if (outcome.empty() || memchr("STXY", outcome.front(), 4) == nullptr) return '\0';
-  return outcome.front();
+// The letter with which the gateway took an order. NUL when it refused one, or sent no answer: then
+// m_szBuffer tells it and the status is -1.
+char LetterOf(CGatewayPub& gateway, std::string_view reply, int* status) {
+  if (reply.empty()) {
+    gateway.Fail(kOrderInTransit, status);
+    return '\0';
+  }
+  if (gateway.TransportFailed(reply, status)) return '\0';
+  const bool refused = ReadField(reply, kRefusalMark) != kNoRefusalMark;
+  const char letter = refused ? '\0' : AcceptanceLetter(ReadField(reply, kAcceptance));
+  if (letter == '\0') gateway.Fail(ReadField(reply, kGatewayText), status);
+  return letter;
 }
 
 }  // namespace
 
-bool CGatewayStk::OrderRefused(std::string_view reply, char& outcome, int* status) {
-  *status = 1;
-  if (reply.empty()) {
-    Fail(kOrderInTransit, status);
-    return true;
-  }
-  if (TransportFailed(reply, status)) return true;
-  outcome = OutcomeOf(reply);
-  if (outcome != '\0') return false;
-  Fail(Read(reply, "K1", 200), status);
-  return true;
-}
-
 char* CGatewayStk::SubmitOrderDecode(const char* reply, int* status) {
   const std::string_view text = AsText(reply);
-  char outcome;
-  if (OrderRefused(text, outcome, status)) return m_szBuffer;
-  const CTransDate date(Read(text, "44", kAnswerFieldSize));
-  CTextWriter answer(m_szBuffer, sizeof m_szBuffer);
-  answer.Append(WIRE("%s@%s@@%s!"), Read(text, "46", kAnswerFieldSize), date.Text(),
-                outcome == 'X' ? "0" : "1");
-  return answer.Text();
+  const char letter = LetterOf(*this, text, status);
+  if (letter == '\0') return m_szBuffer;
+  const CTransDate date(ReadField(text, kOrderDate));
+  CTextWriter result = StartRequest();
+  result.Append(WIRE("%s@%s@@%c!"), ReadField(text, kGatewayNumber), date.Text(),
+                AcceptedFlag(letter));
+  return result.Text();
 }
 
 char* CGatewayStk::CancelChangeOrderDecode(const char* reply, int* status) {
-  char outcome;
-  if (OrderRefused(AsText(reply), outcome, status)) return m_szBuffer;
-  return Answer("");
+  return LetterOf(*this, AsText(reply), status) == '\0' ? m_szBuffer : Answer("");
 }
