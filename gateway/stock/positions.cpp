@@ -107,7 +107,7 @@ class CSections {
 // Memory for one call; null when there is none left.
 struct ScratchBlock {
   ScratchBlock(size_t count, size_t size)
-      : data(size <= INT32_MAX / count ? new (std::nothrow_t{}) char[count * size] : nullptr) {}
+      : data(size <= SIZE_MAX / count ? new (std::nothrow_t{}) char[count * size] : nullptr) {}
   ~ScratchBlock() { delete[] data; }
   ScratchBlock(const ScratchBlock&) = delete;
   ScratchBlock& operator=(const ScratchBlock&) = delete;

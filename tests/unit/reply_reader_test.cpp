@@ -101,7 +101,8 @@ TEST(ReplyReader, FieldsAreToldByTagsOfTwoAndThreeCharacters) {
   EXPECT_EQ(KeyOf("751="), MakeTagKey("751"));
   EXPECT_EQ(KeyOf("751=5"), MakeTagKey("751"));
   EXPECT_NE(KeyOf("751=5"), MakeTagKey("75"));
-  for (const char* field : {"", "6", "68", "=68", "6=8", "68 =", "7511=5", "751", "7511"}) {
+  for (const char* field : {"", "6", "68", "=68", "6=8", "68 =", "7511=5", "751", "7511",
+                            "\xff\xff\xff\xff", "\xff\xff\xff\xff=5"}) {
     EXPECT_NE(KeyOf(field), MakeTagKey("68")) << field;
     EXPECT_NE(KeyOf(field), MakeTagKey("751")) << field;
     EXPECT_EQ(kTags.Find(KeyOf(field)), CTagTable::kNone) << field;
