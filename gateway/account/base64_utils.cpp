@@ -134,7 +134,7 @@ char* CBase64Utils::Decode(const char* text, int* length) {
   if (open != 0) {
     const int missing = 4 - open;
     WriteBytes(out, accumulator << (6 * missing));
-    count += missing;  // not the number of bytes that the group holds; kept as it is known
+    count += missing;  // not the number of bytes that the group holds: kept for who counts on it
   }
   *length = count;
   return block;

@@ -1,4 +1,5 @@
-// The life of a trading certificate. Every request and every reply takes one road:
+// The life of a trading certificate. Every reply takes one road, and so does every request but the
+// registration's, whose message has no limit:
 //
 //   request  header FUNC=code|MSG=Base64 of the certificate message[|BIRTH=birth date]|01=
 //   reply    |00=..|68=code|M2=text|01=      result: the text as it came, or "[CERT]code text"

@@ -56,7 +56,7 @@ void LogStatus(int status) {
   debuglog(line.Text());
 }
 
-// An account shorter than 7 characters is shown with 7 digits, as the host keys its screens.
+// An account shorter than 7 characters is shown with 7 digits.
 void AppendAccount(CResultText& list, std::string_view head, std::string_view tail) {
   char scratch[20];
   CTextWriter account(scratch, sizeof scratch);

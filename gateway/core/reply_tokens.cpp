@@ -1,5 +1,5 @@
-// The reply tokenizers in their buffer-copying form, for one field or record at a time. They share
-// their rules with the record reader, which the list decoders use.
+// The public methods that read a reply, or what it says, into a caller's buffer. No operation calls
+// them: decoders read slices by the same rules (reply_reader.h).
 #include "gateway/core/gateway_pub.h"
 #include "gateway/core/messages.h"
 #include "gateway/core/protocol.h"

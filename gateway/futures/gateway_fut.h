@@ -90,8 +90,8 @@ class CGatewayFut : public CGatewayPub {
                              int* status);
   char* QueryInventoryDecode(const char* reply, int* status);
 
-  // The margin account, one record of 30 fields. `queryType` selects the account's currency or
-  // view: 0 is sent as 3, 3 and 4 as 5, any other as it is.
+  // The margin account, one record of 30 fields. Of `queryType`, 0 is sent as 3, 3 and 4 as 5, any
+  // other as it is.
   char* QueryFinanceEncode(const char* branch, const char* identity, const char* password,
                            int queryType, int* status);
   char* QueryFinanceDecode(const char* reply, int* status);
