@@ -1,4 +1,5 @@
-// What calls ask of the heap: nothing for a request, at most two blocks for a list of any size.
+// What calls ask of the heap: nothing for a request, at most two blocks for a list of any size, and
+// three for the two lists of futures positions.
 
 #include <gtest/gtest.h>
 
