@@ -31,7 +31,7 @@ void Write(const std::filesystem::path& file, const FuzzCall& call) {
       .write(reinterpret_cast<const char*>(bytes), static_cast<std::streamsize>(size));
 }
 
-FuzzArgument Argument(const Argument& golden) {
+FuzzArgument AsFuzzArgument(const Argument& golden) {
   const bool null = golden.letter == 'S' && !golden.text.has_value();
   return {golden.letter, null, golden.number,
           golden.text.has_value() ? std::string_view(*golden.text) : std::string_view()};
@@ -46,14 +46,14 @@ void WriteSeeds(const char* vectors, const char* calls, const char* readers) {
     FuzzCall call;
     call.row = static_cast<size_t>(row - AllExports());
     call.moment = 54;
-    for (const Argument& argument : golden.arguments) call.Add(Argument(argument));
+    for (const Argument& argument : golden.arguments) call.Add(AsFuzzArgument(argument));
     Write(std::filesystem::path(calls) / name, call);
     if (!row->IsDecoder()) continue;
     FuzzCall reading;
     reading.Add({'b', false, -1, {}});
     reading.Add({'b', false, 1, {}});
     reading.Add({'S', false, 0, "68"});
-    reading.Add(Argument(golden.arguments.back()));
+    reading.Add(AsFuzzArgument(golden.arguments.back()));
     Write(std::filesystem::path(readers) / name, reading);
   }
 }
