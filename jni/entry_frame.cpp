@@ -1,6 +1,7 @@
 #include "jni/entry_frame.h"
 
 #include "gateway/core/log.h"
+#include "jni/modified_utf8.h"
 
 bool CEntryCall::Borrow(const jstring* strings, size_t count, jintArray status) {
   if (m_options.opening != nullptr) debuglog(m_options.opening);
@@ -33,7 +34,8 @@ void CEntryCall::FillSession(CGatewayPub& object, const HostSession& session) co
   if (m_options.loggedText < m_nTexts) debuglog(m_texts[kSessionTexts + m_options.loggedText]);
 }
 
-jstring CEntryCall::Finish(const char* result) {
+jstring CEntryCall::Finish(char* result) {
+  if (result != nullptr) MendModifiedUtf8(result);
   LogStep();
   if (m_options.logsResult) debuglog(result);
   LogStep();

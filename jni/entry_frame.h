@@ -3,7 +3,7 @@
 //
 //   1. the characters of every string, in parameter order; the status elements
 //   2. a gateway object of the operation's class, filled with the session data
-//   3. the operation's method, its result logged
+//   3. the operation's method, its result made well-formed and logged
 //   4. the strings released in the same order, then the status copied back
 //   5. the result as a new Java string, "" for a null result; last the object goes
 //
@@ -75,8 +75,9 @@ class CEntryCall {
   // Stores the session data in the object, its texts being the first two borrowed.
   void FillSession(CGatewayPub& object, const HostSession& session) const;
 
-  // Logs the result, gives everything back and makes the Java string.
-  jstring Finish(const char* result);
+  // Makes the result, in place, a text that the VM takes, logs it, gives everything back and makes
+  // the Java string.
+  jstring Finish(char* result);
 
  private:
   void Release(size_t i);
@@ -121,8 +122,8 @@ enum class StatusUse { kGiven, kNone };
 
 // Calls `method` with the Java arguments `args` converted one for one, and the status pointer last.
 template <StatusUse kStatus, class Gateway, class Method, size_t... kAt, class... Args>
-const char* CallMethod(Gateway& object, Method method, CEntryCall& call,
-                       std::index_sequence<kAt...>, Args... args) {
+char* CallMethod(Gateway& object, Method method, CEntryCall& call, std::index_sequence<kAt...>,
+                 Args... args) {
   if constexpr (kStatus == StatusUse::kNone) {
     return (object.*method)(MethodArgument(call, kSessionTexts + kAt, args)...);
   } else {

@@ -4,6 +4,7 @@
 
 #include "tests/fuzz/lent_memory.h"
 #include "tests/support/forbidden_calls.h"
+#include "tests/support/modified_utf8.h"
 
 // Of the sanitizers' runtimes; absent where there is none.
 extern "C" __attribute__((weak)) int __sanitizer_install_malloc_and_free_hooks(
@@ -120,6 +121,7 @@ struct LeanFunctions {
       return nullptr;
     }
     if (host.m_bResultMade) host.Violation("NewStringUTF: second result");
+    if (!gateway_tests::IsModifiedUtf8(characters)) host.Violation("NewStringUTF: ill-formed text");
     // That the text ends, and was not released before, is for the address sanitizer to see.
     const size_t size = std::strlen(characters);
     if (size > CLeanHost::kMaxResult) {

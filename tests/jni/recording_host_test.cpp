@@ -37,6 +37,14 @@ TEST(RecordingHost, PassesAGoodCall) {
   EXPECT_EQ(outcome.fallibleCalls, 3);
 }
 
+TEST(RecordingHost, SeesAnIllFormedResult) {
+  const Outcome outcome = CallDecoder([](JNIEnv* env, jclass, jstring reply, jintArray) {
+    env->ReleaseStringUTFChars(reply, env->GetStringUTFChars(reply, nullptr));
+    return env->NewStringUTF("12345\xE4");
+  });
+  EXPECT_EQ(outcome.violations, std::vector<std::string>{"NewStringUTF: ill-formed text"});
+}
+
 TEST(RecordingHost, SeesAStringThatIsNeverReleased) {
   const Outcome outcome = CallDecoder([](JNIEnv* env, jclass, jstring reply, jintArray) {
     env->GetStringUTFChars(reply, nullptr);

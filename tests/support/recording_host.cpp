@@ -5,6 +5,7 @@
 #include <utility>
 
 #include "tests/support/forbidden_calls.h"
+#include "tests/support/modified_utf8.h"
 
 namespace gateway_tests {
 
@@ -119,6 +120,7 @@ struct HostFunctions {
       return nullptr;
     }
     host.Note("NewStringUTF", characters);
+    if (!IsModifiedUtf8(characters)) host.Violation("NewStringUTF: ill-formed text");
     if (host.m_bExceptionPending) host.Violation("NewStringUTF: an exception is pending");
     if (host.m_pResult != nullptr) host.Violation("NewStringUTF: second result");
     if (host.MustFail("NewStringUTF")) return nullptr;
