@@ -44,14 +44,6 @@ struct FrameOptions {
   bool logsResult = true;
 };
 
-// The session of a futures encoder: the same Java value serves both markets, and above 100 the
-// request goes to futures.
-inline constexpr jint kFuturesMarketOffset = 100;
-inline HostSession FuturesSession(HostSession session) {
-  session.market = WrapAdd(session.market, kFuturesMarketOffset);
-  return session;
-}
-
 // What the VM lends for one call, and how it is given back: everything in the frame that does not
 // depend on the operation.
 class CEntryCall {
@@ -117,14 +109,12 @@ inline void Collect(jstring*& at, jstring string) {
 template <class NoString>
 void Collect(jstring*&, NoString) {}
 
-// Whether an export gives its method a status pointer.
-enum class StatusUse { kGiven, kNone };
-
-// Calls `method` with the Java arguments `args` converted one for one, and the status pointer last.
-template <StatusUse kStatus, class Gateway, class Method, size_t... kAt, class... Args>
-char* CallMethod(Gateway& object, Method method, CEntryCall& call, std::index_sequence<kAt...>,
-                 Args... args) {
-  if constexpr (kStatus == StatusUse::kNone) {
+// Calls `method` with the Java arguments `args` converted one for one and, where it has one
+// parameter more, the status pointer last.
+template <class Gateway, class... Parameters, size_t... kAt, class... Args>
+char* CallMethod(Gateway& object, char* (Gateway::*method)(Parameters...), CEntryCall& call,
+                 std::index_sequence<kAt...>, Args... args) {
+  if constexpr (sizeof...(Parameters) == sizeof...(Args)) {
     return (object.*method)(MethodArgument(call, kSessionTexts + kAt, args)...);
   } else {
     return (object.*method)(MethodArgument(call, kSessionTexts + kAt, args)..., call.Status());
@@ -132,9 +122,9 @@ char* CallMethod(Gateway& object, Method method, CEntryCall& call, std::index_se
 }
 
 // The frame of an encoder. `args` are its operation parameters in Java order, strings first.
-template <StatusUse kStatus, class Gateway, class... Parameters, class... Args>
-jstring RunEncoder(JNIEnv* env, const FrameOptions& options, const HostSession& session,
-                   char* (Gateway::*method)(Parameters...), jintArray status, Args... args) {
+template <class Gateway, class... Parameters, class... Args>
+jstring Encode(JNIEnv* env, const FrameOptions& options, const HostSession& session,
+               char* (Gateway::*method)(Parameters...), jintArray status, Args... args) {
   constexpr size_t kTexts = (kSessionTexts + ... + (std::is_same_v<Args, jstring> ? 1 : 0));
   static_assert(kTexts <= CEntryCall::kMaxTexts, "an entry point has at most kMaxTexts strings");
   jstring strings[kTexts] = {session.serialNo, session.localIP};
@@ -144,15 +134,7 @@ jstring RunEncoder(JNIEnv* env, const FrameOptions& options, const HostSession& 
   if (!call.Borrow(strings, kTexts, status)) return nullptr;
   Gateway object;
   call.FillSession(object, session);
-  return call.Finish(
-      CallMethod<kStatus>(object, method, call, std::index_sequence_for<Args...>(), args...));
-}
-
-// An encoder whose status goes into the host's array.
-template <class Gateway, class... Parameters, class... Args>
-jstring Encode(JNIEnv* env, const HostSession& session, char* (Gateway::*method)(Parameters...),
-               jintArray status, Args... args) {
-  return RunEncoder<StatusUse::kGiven>(env, FrameOptions(), session, method, status, args...);
+  return call.Finish(CallMethod(object, method, call, std::index_sequence_for<Args...>(), args...));
 }
 
 // The frame of a decoder: of the session data it has none but, in one export, the market.
@@ -169,5 +151,30 @@ jstring Decode(JNIEnv* env, char* (Gateway::*method)(const char*, int*), jstring
 // An export's linkage, return type and name.
 #define GATEWAY_EXPORT(operation) \
   extern "C" JNIEXPORT jstring JNICALL Java_com_brindlex_kernel_quorvane_gatewayjni_##operation
+
+// What every encoder takes first, and what most take next: as Java parameters, and as arguments.
+#define SESSION_PARAMETERS jint market, jint platform, jint seqNo, jstring serialNo, jstring localIP
+#define SESSION                                \
+  HostSession {                                \
+    market, platform, seqNo, serialNo, localIP \
+  }
+#define LOGIN_PARAMETERS jstring branch, jstring identity, jstring password
+#define LOGIN branch, identity, password
+
+// The export of an operation that keeps to the frame: its name, its method, its own Java parameters
+// in parentheses, and the same as arguments.
+#define ENCODER(operation, method, parameters, ...) \
+  ENCODER_OF(SESSION, operation, method, parameters, __VA_ARGS__)
+#define ENCODER_OF(session, operation, method, parameters, ...)                                  \
+  GATEWAY_EXPORT(operation)                                                                      \
+  (JNIEnv * env, jclass, SESSION_PARAMETERS, WITHOUT_PARENTHESES parameters, jintArray status) { \
+    return Encode(env, FrameOptions(), session, &method, status, __VA_ARGS__);                   \
+  }
+#define WITHOUT_PARENTHESES(...) __VA_ARGS__
+
+#define DECODER(operation, method)                                                   \
+  GATEWAY_EXPORT(operation)(JNIEnv * env, jclass, jstring reply, jintArray status) { \
+    return Decode(env, &method, reply, status);                                      \
+  }
 
 #endif  // QUORVANE_JNI_ENTRY_FRAME_H_

@@ -2,46 +2,38 @@
 #include "gateway/futures/gateway_fut.h"
 #include "jni/entry_frame.h"
 
-GATEWAY_EXPORT(FutSubmitOrderEncode)
-(JNIEnv* env, jclass, jint market, jint platform, jint seqNo, jstring serialNo, jstring localIP,
- jstring branch, jstring identity, jstring password, jstring reference, jstring orderDate,
- jstring commodity1, jstring commodity2, jstring month1, jstring month2, jstring strike1,
- jstring strike2, jstring callPut1, jstring callPut2, jbyte n6, jbyte orderKind, jbyte priceType,
- jchar function, jchar w3, jchar timeInForce, jchar unusedLetter, jchar side1, jchar side2,
- jint quantity, jint unusedNumber, jint price, jintArray status) {
-  return Encode(env, FuturesSession({market, platform, seqNo, serialNo, localIP}),
-                &CGatewayFut::SubmitOrderEncode, status, branch, identity, password, reference,
-                orderDate, commodity1, commodity2, month1, month2, strike1, strike2, callPut1,
-                callPut2, n6, orderKind, priceType, function, w3, timeInForce, unusedLetter, side1,
-                side2, quantity, unusedNumber, price);
+namespace {
+
+// The same Java value serves both markets, and above 100 the request goes to futures.
+constexpr jint kFuturesMarketOffset = 100;
+
+HostSession OnFutures(HostSession session) {
+  session.market = WrapAdd(session.market, kFuturesMarketOffset);
+  return session;
 }
 
-GATEWAY_EXPORT(FutSubmitOrderEncode1)
-(JNIEnv* env, jclass, jint market, jint platform, jint seqNo, jstring serialNo, jstring localIP,
- jstring branch, jstring identity, jstring password, jstring reference, jstring orderDate,
- jstring commodity1, jstring commodity2, jstring month1, jstring month2, jstring strike1,
- jstring strike2, jstring callPut1, jstring callPut2, jbyte n6, jbyte orderKind, jbyte priceType,
- jchar function, jchar w3, jchar timeInForce, jchar unusedLetter, jchar side1, jchar side2,
- jint quantity, jint unusedNumber, jint price, jintArray status) {
-  return Encode(env, FuturesSession({market, platform, seqNo, serialNo, localIP}),
-                &CGatewayFut::SubmitOrderEncode1, status, branch, identity, password, reference,
-                orderDate, commodity1, commodity2, month1, month2, strike1, strike2, callPut1,
-                callPut2, n6, orderKind, priceType, function, w3, timeInForce, unusedLetter, side1,
-                side2, quantity, unusedNumber, price);
-}
+}  // namespace
 
-GATEWAY_EXPORT(FutSubmitOrderDecode)(JNIEnv* env, jclass, jstring reply, jintArray status) {
-  return Decode(env, &CGatewayFut::SubmitOrderDecode, reply, status);
-}
+#define FUTURES_ENCODER(operation, method, parameters, ...) \
+  ENCODER_OF(OnFutures(SESSION), operation, method, parameters, __VA_ARGS__)
 
-GATEWAY_EXPORT(FutQueryOrderEncode)
-(JNIEnv* env, jclass, jint market, jint platform, jint seqNo, jstring serialNo, jstring localIP,
- jstring branch, jstring identity, jstring password, jstring date, jint selection,
- jintArray status) {
-  return Encode(env, FuturesSession({market, platform, seqNo, serialNo, localIP}),
-                &CGatewayFut::QueryOrderEncode, status, branch, identity, password, date,
-                selection);
-}
+#define ORDER_PARAMETERS                                                                          \
+  LOGIN_PARAMETERS, jstring reference, jstring orderDate, jstring commodity1, jstring commodity2, \
+      jstring month1, jstring month2, jstring strike1, jstring strike2, jstring callPut1,         \
+      jstring callPut2, jbyte n6, jbyte orderKind, jbyte priceType, jchar function, jchar w3,     \
+      jchar timeInForce, jchar unusedLetter, jchar side1, jchar side2, jint quantity,             \
+      jint unusedNumber, jint price
+#define ORDER                                                                                      \
+  LOGIN, reference, orderDate, commodity1, commodity2, month1, month2, strike1, strike2, callPut1, \
+      callPut2, n6, orderKind, priceType, function, w3, timeInForce, unusedLetter, side1, side2,   \
+      quantity, unusedNumber, price
+
+FUTURES_ENCODER(FutSubmitOrderEncode, CGatewayFut::SubmitOrderEncode, (ORDER_PARAMETERS), ORDER)
+FUTURES_ENCODER(FutSubmitOrderEncode1, CGatewayFut::SubmitOrderEncode1, (ORDER_PARAMETERS), ORDER)
+DECODER(FutSubmitOrderDecode, CGatewayFut::SubmitOrderDecode)
+
+FUTURES_ENCODER(FutQueryOrderEncode, CGatewayFut::QueryOrderEncode,
+                (LOGIN_PARAMETERS, jstring date, jint selection), LOGIN, date, selection)
 
 // An order book is too long and too telling for the log: the one result that does not go there.
 GATEWAY_EXPORT(FutQueryOrderDecode)(JNIEnv* env, jclass, jstring reply, jintArray status) {
@@ -50,37 +42,14 @@ GATEWAY_EXPORT(FutQueryOrderDecode)(JNIEnv* env, jclass, jstring reply, jintArra
   return Decode(env, &CGatewayFut::QueryOrderDecode, reply, status, options);
 }
 
-GATEWAY_EXPORT(FutQueryReplyEncode)
-(JNIEnv* env, jclass, jint market, jint platform, jint seqNo, jstring serialNo, jstring localIP,
- jstring branch, jstring identity, jstring password, jstring startDate, jstring endDate,
- jintArray status) {
-  return Encode(env, FuturesSession({market, platform, seqNo, serialNo, localIP}),
-                &CGatewayFut::QueryReplyEncode, status, branch, identity, password, startDate,
-                endDate);
-}
+FUTURES_ENCODER(FutQueryReplyEncode, CGatewayFut::QueryReplyEncode,
+                (LOGIN_PARAMETERS, jstring startDate, jstring endDate), LOGIN, startDate, endDate)
+DECODER(FutQueryReplyDecode, CGatewayFut::QueryReplyDecode)
 
-GATEWAY_EXPORT(FutQueryReplyDecode)(JNIEnv* env, jclass, jstring reply, jintArray status) {
-  return Decode(env, &CGatewayFut::QueryReplyDecode, reply, status);
-}
+FUTURES_ENCODER(FutQueryInventoryEncode, CGatewayFut::QueryInventoryEncode, (LOGIN_PARAMETERS),
+                LOGIN)
+DECODER(FutQueryInventoryDecode, CGatewayFut::QueryInventoryDecode)
 
-GATEWAY_EXPORT(FutQueryInventoryEncode)
-(JNIEnv* env, jclass, jint market, jint platform, jint seqNo, jstring serialNo, jstring localIP,
- jstring branch, jstring identity, jstring password, jintArray status) {
-  return Encode(env, FuturesSession({market, platform, seqNo, serialNo, localIP}),
-                &CGatewayFut::QueryInventoryEncode, status, branch, identity, password);
-}
-
-GATEWAY_EXPORT(FutQueryInventoryDecode)(JNIEnv* env, jclass, jstring reply, jintArray status) {
-  return Decode(env, &CGatewayFut::QueryInventoryDecode, reply, status);
-}
-
-GATEWAY_EXPORT(QueryFinanceEncode)
-(JNIEnv* env, jclass, jint market, jint platform, jint seqNo, jstring serialNo, jstring localIP,
- jstring branch, jstring identity, jstring password, jint queryType, jintArray status) {
-  return Encode(env, FuturesSession({market, platform, seqNo, serialNo, localIP}),
-                &CGatewayFut::QueryFinanceEncode, status, branch, identity, password, queryType);
-}
-
-GATEWAY_EXPORT(QueryFinanceDecode)(JNIEnv* env, jclass, jstring reply, jintArray status) {
-  return Decode(env, &CGatewayFut::QueryFinanceDecode, reply, status);
-}
+FUTURES_ENCODER(QueryFinanceEncode, CGatewayFut::QueryFinanceEncode,
+                (LOGIN_PARAMETERS, jint queryType), LOGIN, queryType)
+DECODER(QueryFinanceDecode, CGatewayFut::QueryFinanceDecode)
