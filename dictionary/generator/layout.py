@@ -4,6 +4,7 @@ that a change shows as the lines that it touches."""
 import json
 
 WIDTH = 100
+LONG = 220  # a row with lists in it that is longer goes on several lines
 
 
 def text(value):
@@ -22,6 +23,8 @@ def _is_scalar(value):
 def _is_row(value):
     """A row of a table: an object of plain values, or of lists and objects of them."""
     if not isinstance(value, dict):
+        return False
+    if any(isinstance(each, list) for each in value.values()) and len(_line(value)) > LONG:
         return False
     return all(
         _is_scalar(each)

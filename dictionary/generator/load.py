@@ -11,7 +11,10 @@ class DictionaryError(Exception):
 
 
 def read(folder=FOLDER):
-    """The dictionary, with each operation's arguments in full and its export named."""
+    """The dictionary, with each operation's arguments in full and its export named.
+
+    Beside them stand the names of the sets that they come from, and those that are the operation's
+    own."""
     folder = Path(folder)
     whole = _json(folder / "dictionary.json")
     for part in whole.pop("parts"):
@@ -19,6 +22,8 @@ def read(folder=FOLDER):
     whole["codes"] = whole.pop("tables")
     export = "Java_" + whole["hostClass"].replace(".", "_") + "_"
     for operation in whole["operations"]:
+        operation["sets"] = [each[1:] for each in operation["arguments"] if isinstance(each, str)]
+        operation["own"] = [each for each in operation["arguments"] if not isinstance(each, str)]
         operation["arguments"] = _expand(operation["arguments"], whole["argumentSets"])
         operation["export"] = export + operation["name"]
     _check(whole)

@@ -8,6 +8,8 @@
 #include <string_view>
 #include <vector>
 
+#include "tests/support/call_count.h"
+
 namespace gateway_tests {
 
 // Calls an entry point through a pointer of its true type.
@@ -37,9 +39,8 @@ struct Export {
 };
 
 inline constexpr std::string_view kSymbolPrefix = "Java_com_brindlex_kernel_quorvane_gatewayjni_";
-inline constexpr size_t kExportCount = 59;
 
-// All 59 native methods; the one table that vector runners, fuzz targets and thread tests share.
+// All native methods; the one table that vector runners, fuzz targets and thread tests share.
 const Export (&AllExports())[kExportCount];
 
 // The row of that name, or null.

@@ -49,7 +49,7 @@ public final class Argument {
     private static final Argument ORDER_DATE = optional(
             "orderDate", Type.TEXT, "", "date of the order, Republic of China calendar (1130115)");
     private static final Argument ORDER_REFERENCE =
-            required("orderRef", Type.TEXT, "order number and gateway number joined by '&'");
+            required("orderReference", Type.TEXT, "order number and gateway number joined by '&'");
     private static final Argument[] STOCK_TERMS = {
             required("quantity", Type.INT, "lots; shares for odd lots (trade type 2)"),
             optional("unit", Type.INT, "1000", "shares per lot"),
@@ -59,10 +59,10 @@ public final class Argument {
             optional("orderKind", Type.SMALL, "0", "order kind: 0, 1, 2, 3, 4, 5 or 8"),
             optional("priceKind", Type.SMALL, "0", "0 limit, 1 limit down, 5 flat, 9 limit up"),
             optional("tradeType", Type.SMALL, "0", "0 board lots, 2 odd lot, 3 fixed price"),
-            optional("n6", Type.SMALL, "0", "handling flag of the broker, tag N6"),
+            optional("handlingFlag", Type.SMALL, "0", "handling flag of the broker, tag N6"),
     };
     private static final Argument[] FUTURES_TERMS = {
-            optional("orderRef", Type.TEXT, "",
+            optional("orderReference", Type.TEXT, "",
                     "for changes: order number and gateway number joined by '&'"),
             ORDER_DATE,
             required("commodity1", Type.TEXT, "commodity of leg 1"),
@@ -73,19 +73,19 @@ public final class Argument {
             optional("strike2", Type.TEXT, "", "strike price of leg 2"),
             optional("callPut1", Type.TEXT, "", "C call, P put, leg 1"),
             optional("callPut2", Type.TEXT, "", "C call, P put, leg 2"),
-            optional("n6", Type.SMALL, "0", "handling flag of the broker, tag N6"),
+            optional("handlingFlag", Type.SMALL, "0", "handling flag of the broker, tag N6"),
             required("orderKind", Type.SMALL,
                     "1 futures, 2 option, 3 combination, 4 futures spread"),
             optional("priceType", Type.SMALL, "2", "1 and 3 market price, else a limit price"),
             optional("function", Type.LETTER, "I", "I new, C quantity, A price, D cancel"),
-            optional("w3", Type.LETTER, " ", "flag of the broker, tag W3"),
+            optional("flagW3", Type.LETTER, " ", "flag of the broker, tag W3"),
             optional("timeInForce", Type.LETTER, "R",
                     "R rest of day, I immediate or cancel, F fill or kill"),
-            optional("reserved1", Type.LETTER, " ", "not read"),
+            optional("unreadLetter", Type.LETTER, " ", "not read"),
             required("side1", Type.LETTER, "B buy, S sell, leg 1"),
             optional("side2", Type.LETTER, " ", "B buy, S sell, leg 2"),
             required("quantity", Type.INT, "contracts"),
-            optional("reserved2", Type.INT, "0", "not read"),
+            optional("unreadNumber", Type.INT, "0", "not read"),
             optional("price", Type.INT, "0", "price in ten-thousandths (180000000 is 18000)"),
     };
 
@@ -113,7 +113,7 @@ public final class Argument {
             account(required("newPassword", Type.TEXT, "the password to change to"));
     static final Argument[] STOCK_ORDER = join(account(STOCK, ORDER_DATE), STOCK_TERMS);
     static final Argument[] STOCK_CHANGE =
-            join(account(STOCK, ORDER_DATE, ORDER_REFERENCE), STOCK_TERMS);
+            join(account(STOCK, ORDER_DATE, ORDER_REFERENCE), changeTerms());
     static final Argument[] STOCK_NOTICE =
             account(optional("function", Type.BYTE_LETTER, "I", "I new, D cancel, C change"),
                     optional("tradeType", Type.SMALL, "0", "trade type, any"));
@@ -122,12 +122,12 @@ public final class Argument {
                     optional("tradeType", Type.INT, "0", "trade type to list"));
     static final Argument[] FUTURES_DAY =
             account(required("date", Type.TEXT, "day to list, Republic of China calendar"),
-                    optional("orderType", Type.INT, "0", "order type to list"));
+                    optional("selection", Type.INT, "0", "order type to list"));
     static final Argument[] PERIOD =
             account(required("startDate", Type.TEXT, "first day, Republic of China calendar"),
                     required("endDate", Type.TEXT, "last day, Republic of China calendar"));
     static final Argument[] SETTLEMENT_PERIOD = account(
-            required("periodOrStart", Type.TEXT, "period 1 to 6, or the first day, sent as given"),
+            required("periodOrStartDate", Type.TEXT, "period 1 to 6, or the first day, sent as given"),
             optional("endDate", Type.TEXT, "", "last day, sent as given"));
     static final Argument[] ONE_STOCK = account(STOCK);
     static final Argument[] MARGIN =
@@ -154,6 +154,17 @@ public final class Argument {
 
     private static Argument optional(String name, Type type, String initial, String meaning) {
         return new Argument(name, type, initial, meaning);
+    }
+
+    /** Terms of a new order, whose price kind a change does not read. */
+    private static Argument[] changeTerms() {
+        Argument[] terms = STOCK_TERMS.clone();
+        for (int i = 0; i < terms.length; i++) {
+            if (terms[i].name.equals("priceKind")) {
+                terms[i] = optional("unreadPriceKind", Type.SMALL, "0", "not read");
+            }
+        }
+        return terms;
     }
 
     private static Argument[] account(Argument... others) {

@@ -69,7 +69,7 @@ public final class FuturesOrderRequest extends Request {
 
     /** The order to act on, by both of its numbers. */
     public FuturesOrderRequest order(String orderNumber, String gatewayNumber) {
-        set("orderRef", orderNumber + "&" + gatewayNumber);
+        set("orderReference", orderNumber + "&" + gatewayNumber);
         return this;
     }
 
@@ -87,13 +87,13 @@ public final class FuturesOrderRequest extends Request {
 
     /** Flag of the broker, tag W3. */
     public FuturesOrderRequest flagW3(char flag) {
-        set("w3", flag);
+        set("flagW3", flag);
         return this;
     }
 
     /** Handling flag of the broker, tag N6. */
     public FuturesOrderRequest handlingFlag(int number) {
-        set("n6", number);
+        set("handlingFlag", number);
         return this;
     }
 

@@ -21,7 +21,7 @@ public final class OrderBookRequest extends Request {
     /** Trade type (stocks) or order type (futures) to list. */
     public OrderBookRequest type(int number) {
         boolean stocks = operation() == Operation.QUERY_ORDER_ENCODE;
-        set(stocks ? "tradeType" : "orderType", number);
+        set(stocks ? "tradeType" : "selection", number);
         return this;
     }
 }

@@ -8,13 +8,13 @@ public final class SettlementRequest extends Request {
 
     /** One of the broker's periods, 1 to 6, in place of days. */
     public SettlementRequest period(int selector) {
-        set("periodOrStart", selector);
+        set("periodOrStartDate", selector);
         return this;
     }
 
     /** First day, in the Republic of China calendar. */
     public SettlementRequest from(TradeDate day) {
-        set("periodOrStart", day.rocText());
+        set("periodOrStartDate", day.rocText());
         return this;
     }
 

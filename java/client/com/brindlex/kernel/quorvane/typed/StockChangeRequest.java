@@ -8,7 +8,7 @@ public final class StockChangeRequest extends Request {
 
     /** The order to act on, by both of its numbers. */
     public StockChangeRequest order(String orderNumber, String gatewayNumber) {
-        set("orderRef", orderNumber + "&" + gatewayNumber);
+        set("orderReference", orderNumber + "&" + gatewayNumber);
         return this;
     }
 
@@ -81,7 +81,7 @@ public final class StockChangeRequest extends Request {
 
     /** Handling flag of the broker, tag N6. */
     public StockChangeRequest handlingFlag(int number) {
-        set("n6", number);
+        set("handlingFlag", number);
         return this;
     }
 }

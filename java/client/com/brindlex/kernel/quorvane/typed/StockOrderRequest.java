@@ -75,7 +75,7 @@ public final class StockOrderRequest extends Request {
 
     /** Handling flag of the broker, tag N6. */
     public StockOrderRequest handlingFlag(int number) {
-        set("n6", number);
+        set("handlingFlag", number);
         return this;
     }
 

@@ -6,32 +6,6 @@ import java.util.List;
 
 /** Names the values of a signature payload. */
 final class PayloadNames {
-    private static final String KEY =
-            "branch|second part of the identity|first part|order function";
-    private static final String KEY_1 = "serial number|device address|date|"
-            + "branch and second part of the identity|first part|order function";
-    private static final String CHANGE = "side|stock code|(order kind)|trade type|(price kind)|";
-    private static final String LEG = "side, leg 1|commodity, leg 1|month, leg 1|strike, leg 1|"
-            + "call/put, leg 1";
-    private static final String LEG_2 = "side, leg 2|commodity, leg 2|month, leg 2|strike, leg 2|"
-            + "call/put, leg 2";
-
-    /** By market, function letter and sign; forms of one case differ in their number of values. */
-    private static final String[][] FORMS = {
-        {"SI_", "side|stock code|quantity|price, price kind or trade type"},
-        {"SI,", "side|stock code|order kind|trade type|price kind|quantity|price|(end)"},
-        {"SD_", "order number|side|stock code|(empty)|(empty)"},
-        {"SD,", CHANGE + "(quantity)|(price)|order number"},
-        {"SC_", "order number|side|stock code|quantity|(empty)"},
-        {"SC,", CHANGE + "quantity|(price)|order number"},
-        {"FI_", "time in force|" + LEG + "|quantity|price"},
-        {"FI_", "time in force|" + LEG + "|" + LEG_2 + "|quantity|price"},
-        {"FC_", "order number|quantity"},
-        {"F*_", "order number"},
-        {"F*,", "time in force|W3 flag|price type|" + LEG + "|" + LEG_2
-                + "|quantity|price|order number of a change"},
-    };
-
     private PayloadNames() {}
 
     /**
@@ -46,22 +20,22 @@ final class PayloadNames {
      */
     static List<Item> name(boolean stocks, char function, char sign, String payload, int offset) {
         String[] values = payload.split(String.valueOf(sign), -1);
-        for (String[] form : FORMS) {
-            boolean market = form[0].charAt(0) == (stocks ? 'S' : 'F');
-            boolean letter = form[0].charAt(1) == function || form[0].charAt(1) == '*';
-            String[] names = ((sign == '_' ? KEY : KEY_1) + "|" + form[1]).split("\\|");
-            if (market && letter && form[0].charAt(2) == sign && names.length == values.length) {
-                return items(names, values, offset);
+        String market = stocks ? "S" : "F";
+        for (String letter : new String[] {String.valueOf(function), "*"}) {
+            for (String[] form : Dictionary.PAYLOADS) {
+                if (form[0].equals(market + letter + sign) && form.length - 1 == values.length) {
+                    return items(form, values, offset);
+                }
             }
         }
         return List.of(new Item(offset, "!!", payload, "signature payload", ""));
     }
 
-    private static List<Item> items(String[] names, String[] values, int offset) {
+    private static List<Item> items(String[] form, String[] values, int offset) {
         List<Item> items = new ArrayList<>();
         int at = offset;
         for (int i = 0; i < values.length; i++) {
-            items.add(new Item(at, "!!" + (i + 1), values[i], names[i], ""));
+            items.add(new Item(at, "!!" + (i + 1), values[i], form[i + 1], ""));
             at += values[i].length() + 1;
         }
         return items;

@@ -1,5 +1,6 @@
 package com.brindlex.kernel.quorvane.console;
 
+import java.util.Arrays;
 import java.util.List;
 
 /** Which part of the business a message belongs to: a tag's meaning depends on it. */
@@ -25,31 +26,7 @@ public enum Scene {
 
     /** The scene of an operation, by the name of its native method. */
     public static Scene ofOperation(String operation) {
-        if (operation.contains("Cert")) {
-            return CERTIFICATE;
-        }
-        if (operation.startsWith("Fut")) {
-            return operation.startsWith("FutSubmit") ? FUTURES_ORDER : FUTURES_LIST;
-        }
-        switch (operation.replaceFirst("(En|De)code.*", "")) {
-            case "SubmitOrder":
-            case "CancelOrder":
-            case "ChangeOrder":
-            case "CancelChangeOrder":
-                return STOCK_ORDER;
-            case "QueryOrder":
-            case "QueryReply":
-                return STOCK_LIST;
-            case "QueryInventory":
-            case "QueryCreditInfo":
-                return STOCK_POSITION;
-            case "Payment":
-                return SETTLEMENT;
-            case "QueryFinance":
-                return MARGIN;
-            default:
-                return ACCOUNT;
-        }
+        return find(Dictionary.SCENES, operation);
     }
 
     /** The scene of a request, by its header and function code. */
@@ -57,31 +34,16 @@ public enum Scene {
         if (WireField.value(fields, "F").equals("1")) {
             return WireField.value(fields, "KIND").equals("F") ? FUTURES_ORDER : STOCK_ORDER;
         }
-        switch (WireField.value(fields, "FUNC")) {
-            case "2":
-            case "3":
-                return STOCK_LIST;
-            case "5":
-            case "8":
-                return STOCK_POSITION;
-            case "6":
-                return SETTLEMENT;
-            case "x":
-            case "O":
-                return FUTURES_LIST;
-            case "P":
-                return MARGIN;
-            case "10":
-            case "11":
-            case "13":
-            case "14":
-            case "15":
-            case "16":
-            case "17":
-            case "18":
-                return CERTIFICATE;
-            default:
-                return ACCOUNT;
+        return find(Dictionary.QUERIES, WireField.value(fields, "FUNC"));
+    }
+
+    /** The scene whose row holds a text; that of accounts when none does. */
+    private static Scene find(String[][] rows, String text) {
+        for (String[] row : rows) {
+            if (Arrays.asList(row).indexOf(text) > 0) {
+                return valueOf(row[0]);
+            }
         }
+        return ACCOUNT;
     }
 }

@@ -19,7 +19,8 @@ import picocli.CommandLine.TypeConversionException;
                 "  quorvane operations AuthEncode",
                 "  quorvane encode AuthEncode --serial-no SN1 --local-ip 10.0.0.1 \\",
                 "      --branch 9A01 --identity 'A123456789&1234567' --password pass1234",
-                "  adb logcat -s gatewayjni | quorvane explain"},
+                "  adb logcat -s gatewayjni | quorvane explain",
+                "  scripts/quorvane dictionary"},
         synopsisSubcommandLabel = "COMMAND")
 public final class Quorvane {
     /** When colours are wanted. */
@@ -44,7 +45,6 @@ public final class Quorvane {
         root.addSubcommand(new DecodeCommand());
         root.addSubcommand(new ExplainCommand());
         root.addSubcommand(new SimulateCommand());
-        root.addSubcommand(new DocumentsCommand());
         root.setCaseInsensitiveEnumValuesAllowed(true);
         root.setUsageHelpAutoWidth(true);
         root.setParameterExceptionHandler(Quorvane::badUsage);

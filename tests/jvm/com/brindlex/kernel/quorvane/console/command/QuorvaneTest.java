@@ -173,7 +173,7 @@ class QuorvaneTest {
     @Test
     void playsASession() {
         Run session = run("AuthEncode\nSubmitOrder --stock-code 2330 --quantity 2 --price 99500 "
-                        + "--side B --n6 1\nfill A0001 1000 99500\nQueryReply\nquit\nbogus\n",
+                        + "--side B --handling-flag 1\nfill A0001 1000 99500\nQueryReply\nquit\nbogus\n",
                 "simulate");
         assertEquals(0, session.code, session.err);
         assertTrue(session.out.contains("台北證券"), session.out);
