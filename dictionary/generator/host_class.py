@@ -60,7 +60,7 @@ public final class gatewayjni {
 """
 
 STATUS = ("status", "int[]", "at least one element; element 0 receives 1 for success, -1 for failure")
-LOADING = 'System.loadLibrary("quorvane")'
+LOADING = 'NativeLibrary.load()'
 
 
 # Refusals that the class tells of once.
