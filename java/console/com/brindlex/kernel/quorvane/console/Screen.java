@@ -173,7 +173,25 @@ public final class Screen {
                 || c >= 0xFFE0 && c <= 0xFFE6 || c >= 0x20000 && c <= 0x3FFFD;
     }
 
-    static String pad(String text, int columns) {
+    /** A text that takes so many columns at most; what is lost shows. */
+    public static String cut(String text, int columns) {
+        if (text.length() * 2 <= columns || width(text) <= columns) {
+            return text;
+        }
+        StringBuilder out = new StringBuilder();
+        int used = 0;
+        for (int c : text.codePoints().toArray()) {
+            used += isWide(c) ? 2 : 1;
+            if (used >= columns) {
+                break;
+            }
+            out.appendCodePoint(c);
+        }
+        return out.append('…').toString();
+    }
+
+    /** A text with blanks behind it, so that it takes so many columns. */
+    public static String pad(String text, int columns) {
         return text + " ".repeat(Math.max(0, columns - width(text)));
     }
 

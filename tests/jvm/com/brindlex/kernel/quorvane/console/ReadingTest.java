@@ -48,7 +48,7 @@ class ReadingTest {
         "CancelChangeOrderDecode, STOCK_ORDER",
         "QueryOrderDecode, STOCK_LIST",
         "QueryInventoryDecodeJZG, STOCK_POSITION",
-        "QueryCreditInfoEncode, STOCK_CREDIT",
+        "QueryCreditInfoEncode, STOCK_POSITION",
         "PaymentDecodeJZG, SETTLEMENT",
         "FutSubmitOrderEncode, FUTURES_ORDER",
         "FutQueryInventoryDecode, FUTURES_LIST",

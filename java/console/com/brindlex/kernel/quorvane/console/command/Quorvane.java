@@ -1,5 +1,6 @@
 package com.brindlex.kernel.quorvane.console.command;
 
+import com.brindlex.kernel.quorvane.console.dictionary.Dictionary;
 import com.brindlex.kernel.quorvane.typed.Operation;
 import java.util.ArrayList;
 import java.util.List;
@@ -20,6 +21,8 @@ import picocli.CommandLine.TypeConversionException;
                 "  quorvane encode AuthEncode --serial-no SN1 --local-ip 10.0.0.1 \\",
                 "      --branch 9A01 --identity 'A123456789&1234567' --password pass1234",
                 "  adb logcat -s gatewayjni | quorvane explain",
+                "  quorvane timeline log.txt --failures",
+                "  quorvane mask log.txt > log-to-send.txt",
                 "  scripts/quorvane dictionary"},
         synopsisSubcommandLabel = "COMMAND")
 public final class Quorvane {
@@ -44,6 +47,9 @@ public final class Quorvane {
         root.addSubcommand(EncodeCommand.create(root));
         root.addSubcommand(new DecodeCommand());
         root.addSubcommand(new ExplainCommand());
+        root.addSubcommand(new TimelineCommand());
+        root.addSubcommand(new CheckCommand());
+        root.addSubcommand(new MaskCommand());
         root.addSubcommand(new SimulateCommand());
         root.setCaseInsensitiveEnumValuesAllowed(true);
         root.setUsageHelpAutoWidth(true);
@@ -70,6 +76,20 @@ public final class Quorvane {
         boolean wanted = colour == Colour.ALWAYS
                 || colour == Colour.AUTO && CommandLine.Help.Ansi.AUTO.enabled();
         return new Terminal(json, wanted && !json);
+    }
+
+    /** The name of an operation as the dictionary writes it, from one in any case. */
+    static final class DictionaryOperation implements ITypeConverter<String> {
+        @Override
+        public String convert(String text) {
+            for (var operation : Dictionary.get().operations()) {
+                if (operation.name().equalsIgnoreCase(text)) {
+                    return operation.name();
+                }
+            }
+            throw new TypeConversionException("no operation '" + text
+                    + "'; see quorvane operations");
+        }
     }
 
     /** An operation by its name, whatever the case of its letters. */

@@ -1,6 +1,5 @@
 package com.brindlex.kernel.quorvane.console.command;
 
-import com.brindlex.kernel.quorvane.console.Explanation;
 import com.brindlex.kernel.quorvane.console.Screen;
 import com.brindlex.kernel.quorvane.console.Screen.Style;
 import com.brindlex.kernel.quorvane.typed.Cell;
@@ -14,11 +13,8 @@ import java.util.LinkedHashMap;
 import java.util.List;
 import java.util.Map;
 
-/** How results and explanations are shown: as tables, or as JSON values. */
+/** How results are shown: as tables, or as JSON values. */
 final class Shown {
-    /** Columns of a line that are shown around a fault. */
-    private static final int AROUND = 60;
-
     /** Columns that one row may have in a table, and that several may. */
     private static final int NARROW = 8;
     private static final int WIDE = 12;
@@ -128,75 +124,6 @@ final class Shown {
         Map<String, Object> map = new LinkedHashMap<>();
         map.put("character", offset + 1);
         map.put("text", text);
-        return map;
-    }
-
-    /** An explanation as tables, with a mark under each place where the line breaks. */
-    static void explanation(Terminal terminal, Explanation explained) {
-        Screen screen = terminal.screen();
-        screen.title(explained.summary());
-        if (!explained.operations().isEmpty()) {
-            screen.labelled("operation", Style.STRONG, names(explained));
-        }
-        for (Explanation.Group group : explained.groups()) {
-            List<List<String>> rows = new ArrayList<>();
-            for (Explanation.Item item : group.items()) {
-                rows.add(List.of(item.place(), item.value().replace("\n", "\\n"),
-                        item.name() == null ? "(unknown)" : item.name(), item.reading()));
-            }
-            screen.line("  " + screen.styled(Style.LABEL, group.title()));
-            screen.texts(List.of("at", "value", "what it is", "reads"), rows);
-        }
-        for (Explanation.Trouble trouble : explained.faults()) {
-            int from = Math.max(0, trouble.offset() - AROUND / 2);
-            int to = Math.min(explained.line().length(), from + AROUND);
-            String part = explained.line().substring(from, to).replace('\n', ' ');
-            String before = explained.line().substring(from, Math.min(to, trouble.offset()));
-            screen.line("");
-            screen.line(screen.styled(Style.BAD,
-                    "  at character " + (trouble.offset() + 1) + ": " + trouble.text()));
-            screen.line("    " + (from > 0 ? "…" : " ") + part
-                    + (to < explained.line().length() ? "…" : ""));
-            screen.line("     " + " ".repeat(Screen.width(before))
-                    + screen.styled(Style.BAD, "^"));
-        }
-    }
-
-    private static String names(Explanation explained) {
-        List<String> names = new ArrayList<>();
-        explained.operations().forEach(operation -> names.add(operation.method()));
-        return names.size() > 5 ? "any of " + names.size() + " operations"
-                                : String.join(" or ", names);
-    }
-
-    /** An explanation as JSON. */
-    static Map<String, Object> json(Explanation explained) {
-        Map<String, Object> map = new LinkedHashMap<>();
-        map.put("kind", explained.kind().name().toLowerCase());
-        map.put("operations", explained.operations());
-        map.put("summary", explained.summary());
-        map.put("line", explained.line());
-        List<Object> groups = new ArrayList<>();
-        for (Explanation.Group group : explained.groups()) {
-            List<Object> items = new ArrayList<>();
-            for (Explanation.Item item : group.items()) {
-                Map<String, Object> entry = new LinkedHashMap<>();
-                entry.put("character", item.offset() + 1);
-                entry.put("at", item.place());
-                entry.put("value", item.value());
-                entry.put("name", item.name());
-                entry.put("reads", item.reading());
-                items.add(entry);
-            }
-            Map<String, Object> entry = new LinkedHashMap<>();
-            entry.put("title", group.title());
-            entry.put("fields", items);
-            groups.add(entry);
-        }
-        map.put("groups", groups);
-        List<Object> faults = new ArrayList<>();
-        explained.faults().forEach(trouble -> faults.add(fault(trouble.offset(), trouble.text())));
-        map.put("faults", faults);
         return map;
     }
 }

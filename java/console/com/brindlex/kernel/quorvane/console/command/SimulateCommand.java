@@ -1,6 +1,9 @@
 package com.brindlex.kernel.quorvane.console.command;
 
 import com.brindlex.kernel.quorvane.console.Screen.Style;
+import com.brindlex.kernel.quorvane.console.message.Kind;
+import com.brindlex.kernel.quorvane.console.message.Message;
+import com.brindlex.kernel.quorvane.console.message.MessageReader;
 import com.brindlex.kernel.quorvane.simulator.Brokerage;
 import com.brindlex.kernel.quorvane.simulator.Gateway;
 import com.brindlex.kernel.quorvane.simulator.Line;
@@ -205,10 +208,10 @@ final class SimulateCommand implements Callable<Integer> {
 
     private boolean sendRaw(String request) {
         String reply = gateway.answer(request);
-        List<Operation> senders = com.brindlex.kernel.quorvane.console.Explainer.explain(request)
-                                          .operations();
-        Result result = senders.isEmpty() || senders.get(0).decoders().isEmpty()
-                ? null : senders.get(0).decoders().get(0).decode(1, reply);
+        Message read = MessageReader.read(request);
+        List<Operation> readers = read.kind() != Kind.REQUEST ? List.of()
+                : Operation.named(read.operation()).decoders();
+        Result result = readers.isEmpty() ? null : readers.get(0).decode(1, reply);
         return show(request, reply, result);
     }
 

@@ -49,6 +49,11 @@ final class Terminal {
         out.flush();
     }
 
+    /** Writes something beside what was asked for. */
+    void note(String text) {
+        err.println(screen.styled(Style.DIM, text));
+    }
+
     void error(String text) {
         err.println(screen.styled(Style.BAD, text));
     }

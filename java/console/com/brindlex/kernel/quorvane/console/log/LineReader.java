@@ -1,0 +1,127 @@
+package com.brindlex.kernel.quorvane.console.log;
+
+import java.io.Closeable;
+import java.io.IOException;
+import java.io.InputStream;
+import java.io.InputStreamReader;
+import java.io.PushbackInputStream;
+import java.io.Reader;
+import java.nio.charset.Charset;
+import java.nio.charset.CodingErrorAction;
+import java.nio.charset.StandardCharsets;
+
+/**
+ * Reads a stream line by line, as it comes. A byte order mark decides the charset; what is no
+ * character of it becomes U+FFFD. A line is kept up to a bound, however long it is.
+ */
+public final class LineReader implements Closeable {
+    /** The characters that are kept of a line. */
+    public static final int LONGEST = 1 << 20;
+
+    private final Reader in;
+    private final char[] buffer = new char[8192];
+    private final StringBuilder line = new StringBuilder();
+    private final Charset charset;
+    private int at;
+    private int filled;
+    private long number;
+    private boolean carriageReturns;
+
+    /**
+     * Reads from {@code stream}.
+     *
+     * @param charset of a stream without a byte order mark
+     */
+    public LineReader(InputStream stream, Charset charset) throws IOException {
+        PushbackInputStream bytes = new PushbackInputStream(stream, 3);
+        this.charset = marked(bytes, charset);
+        this.in = new InputStreamReader(bytes, this.charset.newDecoder()
+                .onMalformedInput(CodingErrorAction.REPLACE)
+                .onUnmappableCharacter(CodingErrorAction.REPLACE));
+    }
+
+    /** What a byte order mark says; the mark itself is passed over. */
+    private static Charset marked(PushbackInputStream in, Charset otherwise) throws IOException {
+        byte[] head = new byte[3];
+        int read = 0;
+        while (read < head.length) {
+            int count = in.read(head, read, head.length - read);
+            if (count < 0) {
+                break;
+            }
+            read += count;
+            // a mark is needed to go on waiting
+            if (head[0] != (byte) 0xEF && head[0] != (byte) 0xFF && head[0] != (byte) 0xFE) {
+                break;
+            }
+        }
+        boolean two = read >= 2;
+        if (read == 3 && head[0] == (byte) 0xEF && head[1] == (byte) 0xBB
+                && head[2] == (byte) 0xBF) {
+            return StandardCharsets.UTF_8;
+        }
+        if (two && head[0] == (byte) 0xFF && head[1] == (byte) 0xFE) {
+            in.unread(head, 2, read - 2);
+            return StandardCharsets.UTF_16LE;
+        }
+        if (two && head[0] == (byte) 0xFE && head[1] == (byte) 0xFF) {
+            in.unread(head, 2, read - 2);
+            return StandardCharsets.UTF_16BE;
+        }
+        in.unread(head, 0, read);
+        return otherwise;
+    }
+
+    /** The charset that the stream is read in. */
+    public Charset charset() {
+        return charset;
+    }
+
+    /** The next line; null at the end. */
+    public LogLine next() throws IOException {
+        line.setLength(0);
+        boolean cut = false;
+        while (true) {
+            if (at == filled && !fill()) {
+                return number == 0 && line.length() == 0 || line.length() == 0
+                        ? null : ended("", cut);
+            }
+            int end = at;
+            while (end < filled && buffer[end] != '\n') {
+                end++;
+            }
+            int room = LONGEST - line.length();
+            cut |= end - at > room;
+            line.append(buffer, at, Math.min(end - at, room));
+            at = end;
+            if (end < filled) {
+                at++;
+                return ended("\n", cut);
+            }
+        }
+    }
+
+    private boolean fill() throws IOException {
+        at = 0;
+        filled = Math.max(0, in.read(buffer));
+        return filled > 0;
+    }
+
+    /** The first line tells whether the log ends its lines with carriage returns. */
+    private LogLine ended(String end, boolean cut) {
+        number++;
+        int length = line.length();
+        boolean feed = length > 0 && line.charAt(length - 1) == '\r';
+        if (number == 1) {
+            carriageReturns = feed;
+        }
+        boolean drop = carriageReturns && feed;
+        return new LogLine(number, line.substring(0, drop ? length - 1 : length),
+                drop ? "\r" + end : end, cut);
+    }
+
+    @Override
+    public void close() throws IOException {
+        in.close();
+    }
+}

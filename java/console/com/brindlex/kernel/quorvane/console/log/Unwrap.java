@@ -1,0 +1,41 @@
+package com.brindlex.kernel.quorvane.console.log;
+
+import java.util.regex.Matcher;
+import java.util.regex.Pattern;
+
+/** Finds a message within a text that an app wrote around it: its own prefix, quotes. */
+final class Unwrap {
+    /** The first field of a request or a reply, with no letter or digit right before it. */
+    private static final Pattern BEGIN = Pattern.compile(
+            "(?<![A-Za-z0-9|])(?:F=[17]\\||\\|(?:F|00|68|39)=|\\[GATEWAY\\]error|\\[BROKER\\]timeout)");
+    private static final Pattern RESULT = Pattern.compile("(?<=[\"'])(?:[0-9]{1,9}|<[0-9]>)!");
+
+    private Unwrap() {}
+
+    /**
+     * Where the message stands: its begin and its end; null for a text without one. What begins
+     * like a message is one.
+     */
+    static int[] find(String text) {
+        if (text.startsWith("F=") || text.startsWith("|") || text.startsWith("[")) {
+            return new int[] {0, text.length()};
+        }
+        if (text.indexOf('|') < 0 && text.indexOf('[') < 0 && text.indexOf('!') < 0) {
+            return null;
+        }
+        Matcher begin = BEGIN.matcher(text);
+        if (!begin.find() && !(begin = RESULT.matcher(text)).find()) {
+            return null;
+        }
+        int from = begin.start();
+        int to = text.length();
+        char quote = from > 0 ? text.charAt(from - 1) : ' ';
+        if (quote == '"' || quote == '\'' || quote == '`') {
+            int close = text.lastIndexOf(quote);
+            to = close > from ? close : to;
+            boolean feed = text.startsWith("\\n", to - 2);
+            to -= feed ? 2 : 0;
+        }
+        return new int[] {from, to};
+    }
+}

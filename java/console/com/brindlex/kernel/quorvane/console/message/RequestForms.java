@@ -1,0 +1,101 @@
+package com.brindlex.kernel.quorvane.console.message;
+
+import com.brindlex.kernel.quorvane.console.dictionary.Dictionary;
+import com.brindlex.kernel.quorvane.console.dictionary.Header;
+import com.brindlex.kernel.quorvane.console.dictionary.Operation;
+import java.util.ArrayList;
+import java.util.HashMap;
+import java.util.HashSet;
+import java.util.List;
+import java.util.Map;
+import java.util.Set;
+
+/** Every form that a request can have, found by the tags of a request in their order. */
+final class RequestForms {
+    private static final Header.Identity NOBODY = new Header.Identity("any", "any", "");
+
+    private final List<Template> all = new ArrayList<>();
+    private final Map<String, List<Template>> byTags = new HashMap<>();
+    private final Set<String> headers = new HashSet<>();
+
+    private static final class Holder {
+        static final RequestForms INSTANCE = new RequestForms(Dictionary.get());
+    }
+
+    static RequestForms get() {
+        return Holder.INSTANCE;
+    }
+
+    private RequestForms(Dictionary dictionary) {
+        for (Operation operation : dictionary.operations()) {
+            for (Operation.Form form : operation.forms()) {
+                add(operation, form, dictionary.header(operation.header()));
+            }
+        }
+    }
+
+    private void add(Operation operation, Operation.Form form, Header header) {
+        List<Header.Identity> identities = header.identity().isEmpty()
+                ? List.of(NOBODY) : header.identity();
+        for (Header.Identity identity : identities) {
+            String head = header.begin() + identity.text()
+                    + (header.end() == null ? "" : header.end());
+            add(new Template(operation, form, header, identity, head + form.body()), head);
+            if (header.orderDate() != null) {
+                String dated = head + header.orderDate();
+                add(new Template(operation, form, header, identity, dated + form.body()), dated);
+            }
+        }
+    }
+
+    private void add(Template template, String head) {
+        all.add(template);
+        byTags.computeIfAbsent(template.tags, tags -> new ArrayList<>(4)).add(template);
+        headers.add(Cut.tags(Cut.request(head.replaceAll("\\{[^}]*\\}", "x"))));
+    }
+
+    /** The forms that have these tags in this order. */
+    List<Template> withTags(String tags) {
+        return byTags.getOrDefault(tags, List.of());
+    }
+
+    /** Whether these are the tags of a header, with nothing behind it. */
+    boolean isHeader(String tags) {
+        return headers.contains(tags);
+    }
+
+    /** The forms that come closest to the fields of a damaged request. */
+    List<Template> closest(List<Cut.Piece> pieces) {
+        List<Template> best = new ArrayList<>();
+        int most = Integer.MIN_VALUE;
+        for (Template template : all) {
+            int score = score(template, pieces);
+            if (score > most) {
+                best.clear();
+                most = score;
+            }
+            if (score == most) {
+                best.add(template);
+            }
+        }
+        return best;
+    }
+
+    /** Fields in common, with weight on those that tell what a request is for. */
+    private static int score(Template template, List<Cut.Piece> pieces) {
+        int score = 0;
+        for (String tag : new String[] {"F", "FUNC", "FUNC1", "14", "KIND", "15"}) {
+            String constant = template.constant(tag);
+            String value = Cut.value(pieces, tag);
+            if (constant != null && !value.isEmpty()) {
+                score += constant.equals(value) ? 12 : -12;
+            }
+        }
+        boolean futures = Cut.value(pieces, "KIND").equals("F");
+        if (Cut.value(pieces, "F").equals("1")) {
+            score += template.operation.isFutures() == futures ? 12 : -12;
+        }
+        return score + 4 * Alignment.common(template.slots, pieces)
+                - 2 * Math.abs(template.slots.size() - pieces.size());
+    }
+}
