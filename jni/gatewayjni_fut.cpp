@@ -35,7 +35,7 @@ DECODER(FutSubmitOrderDecode, CGatewayFut::SubmitOrderDecode)
 FUTURES_ENCODER(FutQueryOrderEncode, CGatewayFut::QueryOrderEncode,
                 (LOGIN_PARAMETERS, jstring date, jint selection), LOGIN, date, selection)
 
-// An order book is too long and too telling for the log: the one result that does not go there.
+// The one result that does not go into the log.
 GATEWAY_EXPORT(FutQueryOrderDecode)(JNIEnv* env, jclass, jstring reply, jintArray status) {
   FrameOptions options;
   options.logsResult = false;

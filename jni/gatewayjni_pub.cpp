@@ -8,7 +8,7 @@ DECODER(AuthDecode, CGatewayPub::AuthDecode)
 ENCODER(GetTotalAccountEncode, CGatewayPub::GetTotalAccountEncode, (LOGIN_PARAMETERS), LOGIN)
 DECODER(GetTotalAccountDecode, CGatewayPub::GetTotalAccountDecode)
 
-// Name, address and telephone stay with the VM, as the app's builds expect.
+// Name, address and telephone are never released: a few bytes a call, kept on purpose.
 GATEWAY_EXPORT(OpenAccountEncode)
 (JNIEnv* env, jclass, SESSION_PARAMETERS, jstring extra1, jstring identity, jstring extra2,
  jstring name, jstring address, jstring tel, jbyte time, jbyte item, jintArray status) {
