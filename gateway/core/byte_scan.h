@@ -14,6 +14,9 @@
 #include <arm_neon.h>
 #endif
 
+static_assert(__BYTE_ORDER__ == __ORDER_LITTLE_ENDIAN__,
+              "words are read with their first byte lowest");
+
 inline constexpr size_t kBarBlock = 64;
 
 // Bit i is set where block[i] is a '|': the rule that BarsOfBlock is held against.
@@ -50,7 +53,7 @@ inline uint64_t BarsOfBlock(const char* block) {
   const uint8x16_t pairs = vpaddq_u8(vpaddq_u8(found[0], found[1]), vpaddq_u8(found[2], found[3]));
   return vgetq_lane_u64(vreinterpretq_u64_u8(vpaddq_u8(pairs, pairs)), 0);
 }
-#elif __BYTE_ORDER__ == __ORDER_LITTLE_ENDIAN__
+#else
 inline uint64_t BarsOfBlock(const char* block) {
   constexpr uint64_t kBars = 0x7c7c7c7c7c7c7c7cU;
   constexpr uint64_t kLowBits = 0x7f7f7f7f7f7f7f7fU;
@@ -65,10 +68,6 @@ inline uint64_t BarsOfBlock(const char* block) {
     bars |= (tops * kGather >> 56) << i;
   }
   return bars;
-}
-#else
-inline uint64_t BarsOfBlock(const char* block) {
-  return BarsOfBlockPlainly(block);
 }
 #endif
 

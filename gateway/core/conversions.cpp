@@ -34,28 +34,6 @@ struct Wide {
   static Number Power(int exponent) { return PowerOfTen64(exponent); }
 };
 
-// As Scale, for the usual price: four to eight characters, no more decimals than are wanted. Its
-// digits are read as one number, as if there were no point. False, with nothing read, for any other
-// text.
-bool ScaleShort(std::string_view text, int decimals, int32_t& scaled) {
-  static constexpr int32_t kPowers[] = {1,      10,      100,      1000,     10000,
-                                        100000, 1000000, 10000000, 100000000};
-  if (text.size() - 4 > 4 || static_cast<uint32_t>(decimals) >= std::size(kPowers)) return false;
-  uint64_t word = LoadWord(text);
-  size_t count = text.size();
-  auto missing = static_cast<size_t>(decimals);
-  if (const uint64_t points = BytesEqual(word, '.'); points != 0) {
-    const auto before = static_cast<unsigned>(__builtin_ctzll(points)) & 56;  // bits, not bytes
-    word = (word & ((uint64_t{1} << before) - 1)) | (word >> before >> 8) << before;
-    --count;
-    missing -= count - before / 8;
-  }
-  word = AlignRight(word, count);
-  if (missing >= std::size(kPowers) || !AreEightDigits(word)) return false;
-  scaled = WrapMultiply(static_cast<int32_t>(ValueOfEightDigits(word)), kPowers[missing]);
-  return true;
-}
-
 // A decimal text times 10^decimals: missing fraction digits count as zeros, further ones are cut.
 template <class Arithmetic>
 typename Arithmetic::Number Scale(std::string_view text, int decimals) {
@@ -76,35 +54,13 @@ typename Arithmetic::Number Scale(std::string_view text, int decimals) {
 }  // namespace
 
 CTransDate::CTransDate(std::string_view date) : m_text(date) {
-  const size_t size = date.size();
-  if (size < 6 || size > 8) return;
-  uint32_t year;
-  memcpy(&year, date.data(), 4);
-  year = AlignRight(year, size - 4);
-  const uint32_t value = ValueOfFourDigits(year);
-  if (Rarely(!AreFourDigits(year) || value == 0 || (size == 8 && value < kRocYearZero))) {
-    ConvertUnusual();
-    return;
-  }
-  char* const monthAndDay = size == 8 ? ShortDigits(value - kRocYearZero).WriteTo(m_szDate)
-                                      : WriteDigits<4>(m_szDate, value + kRocYearZero);
-  memcpy(monthAndDay, date.data() + size - 4, 4);
-  m_text = {m_szDate, static_cast<size_t>(monthAndDay + 4 - m_szDate)};
-}
-
-// A year that is no number, or one before the calendar.
-void CTransDate::ConvertUnusual() {
-  const std::string_view date = m_text;
-  if (ReadInt32(date) == 0) return;
-  const std::string_view monthAndDay = From(date, date.size() - 4);
+  if (date.size() < 6 || date.size() > 8) return;
   const int year = ReadInt32(UpTo(date, date.size() - 4));
-  CTextWriter text(m_szDate, sizeof m_szDate);
-  if (date.size() == 8) {
-    text.Append(WIRE("%d%s"), year - kRocYearZero, monthAndDay);
-  } else {
-    text.Append(WIRE("%04d%s"), year + kRocYearZero, monthAndDay);
-  }
-  m_text = {text.Text(), text.Length()};
+  if (year == 0 && ReadInt32(date) == 0) return;
+  char* const monthAndDay = date.size() == 8 ? WriteNumber<0>(m_szDate, year - kRocYearZero)
+                                             : WriteNumber<4>(m_szDate, year + kRocYearZero);
+  memcpy(monthAndDay, From(date, date.size() - 4).data(), 4);
+  m_text = {m_szDate, static_cast<size_t>(monthAndDay + 4 - m_szDate)};
 }
 
 int32_t RocToWesternDate(int32_t rocDate) {
@@ -116,8 +72,6 @@ int32_t RocToWesternDate(std::string_view rocDate) {
 }
 
 int32_t ScalePrice(std::string_view text, int decimals) {
-  int32_t scaled;
-  if (Mostly(ScaleShort(text, decimals, scaled))) return scaled;
   if (text.empty() || text.front() != '-') return Scale<Narrow>(text, decimals);
   const std::string_view magnitude = UpTo(From(text, 1), kNegativePriceChars);
   return WrapSubtract(0, Scale<Narrow>(magnitude, decimals));

@@ -17,8 +17,6 @@ class CTransDate {
   std::string_view Text() const { return m_text; }
 
  private:
-  __attribute__((noinline, cold)) void ConvertUnusual();
-
   char m_szDate[20];
   std::string_view m_text;
 };

@@ -86,15 +86,6 @@ size_t DecimalSize(int64_t value, size_t width) {
   return size < width ? width : size;
 }
 
-char* WriteNumber(char* at, int64_t value) {
-  if (value < 0 || value >= 100000000) return WriteDecimal(at, value, 0);
-  const uint64_t digits = EightDigits(static_cast<uint32_t>(value));
-  const int zeros = __builtin_ctzll((digits ^ kEightZeros) | uint64_t{1} << 56) & 56;
-  const uint64_t text = digits >> zeros;
-  memcpy(at, &text, sizeof text);
-  return at + 8 - zeros / 8;
-}
-
 char* WriteDecimal(char* at, int64_t value, size_t width) {
   const size_t size = DecimalSize(value, width);
   char* const start = value < 0 ? at + 1 : at;

@@ -192,6 +192,9 @@ class CGatewayPub {
   CTextWriter StartQuery(const char* branch, const char* identity, const char* password,
                          int* status);
 
+  // What an order is named by; reads the clock.
+  OrderKey KeyOf(OrderHead head, char function, const OrderOrigin& origin);
+
   // Writes the header of an order. False leaves a message alone in `line`; an overflow is no
   // failure here either.
   bool WriteOrderHead(CTextWriter& line, const OrderKey& key);
@@ -203,8 +206,7 @@ class CGatewayPub {
   static char* FinishEscaped(CTextWriter& line, int* status, const char* overflow);
 
   // Ends an encoder with `message` in place of the request and status -1.
-  __attribute__((noinline, cold)) static char* Fail(CTextWriter& line, int* status,
-                                                    const char* message);
+  static char* Fail(CTextWriter& line, int* status, const char* message);
 
   // Ends a decoder with a short result that lies in m_szBuffer.
   char* Answer(std::string_view text);
@@ -233,13 +235,9 @@ class CGatewayPub {
   void LogReply(const char* name, std::string_view reply);
 
  private:
-  friend struct OrderKey;
-
   // Reads the clock and reduces m_nSeqNo modulo 100.
-  void TakeStamp(Stamp& stamp);
-  PaddedText SerialNo(std::string_view address, SerialScratch& scratch) const;
-  std::string_view LocalIP() const;
-  PaddedText PlatformName() const;
+  Stamp TakeStamp();
+  Device TheDevice() const;
   char RequestKind() const;
 
   bool WriteQueryHead(CTextWriter& line, const char* branch, const char* identity,

@@ -2,30 +2,18 @@
 #include <ctime>
 #include <iterator>
 
+#include "gateway/core/decimal.h"
 #include "gateway/core/gateway_pub.h"
 #include "gateway/core/log.h"
 
 namespace {
 
-// A client edition; kEditions goes by the host's platform number.
-struct Edition {
-  char name[PaddedText::kReadable];
-  size_t size;
-};
-
-template <size_t kSize>
-constexpr Edition Named(const char (&name)[kSize]) {
-  Edition edition = {{}, kSize - 1};
-  for (size_t i = 0; i < kSize; ++i) edition.name[i] = name[i];
-  return edition;
-}
-
-constexpr Edition kNoEdition = Named("NO DEFINE");
-
-constexpr Edition kEditions[] = {
-    kNoEdition,       kNoEdition,        kNoEdition,        kNoEdition,       kNoEdition,
-    Named("QVPHONE"), kNoEdition,        Named("QVTAB"),    kNoEdition,       Named("QVLITE"),
-    Named("QVPRO"),   Named("QVFUTURE"), Named("QVOPTION"), Named("QVWATCH"), Named("QVPRO")};
+// Client editions; the row is the host's platform number.
+constexpr char kNoEdition[] = "NO DEFINE";
+constexpr char kEditions[][sizeof kNoEdition] = {"NO DEFINE", "NO DEFINE", "NO DEFINE", "NO DEFINE",
+                                                 "NO DEFINE", "QVPHONE",   "NO DEFINE", "QVTAB",
+                                                 "NO DEFINE", "QVLITE",    "QVPRO",     "QVFUTURE",
+                                                 "QVOPTION",  "QVWATCH",   "QVPRO"};
 
 // Keeps at most as many characters as the field has; one that they fill has no terminator.
 template <size_t kSize>
@@ -70,23 +58,13 @@ void CGatewayPub::debuglog(const char* text) {
   ::debuglog(text);
 }
 
-std::string_view CGatewayPub::LocalIP() const {
-  return TextOf(m_szLocalIP);
-}
-
-// A full serial number has no terminator, so the gateway knows it with the address run onto it.
-PaddedText CGatewayPub::SerialNo(std::string_view address, SerialScratch& scratch) const {
-  const std::string_view own = TextOf(m_szSerialNo);
-  if (own.size() < sizeof m_szSerialNo) return {own};
-  memcpy(scratch, m_szSerialNo, sizeof m_szSerialNo);
-  memcpy(scratch + sizeof m_szSerialNo, address.data(), address.size());
-  return {{scratch, sizeof m_szSerialNo + address.size()}};
-}
-
-PaddedText CGatewayPub::PlatformName() const {
+Device CGatewayPub::TheDevice() const {
   const auto row = static_cast<uint32_t>(m_nPlatform);
-  const Edition& edition = row < std::size(kEditions) ? kEditions[row] : kNoEdition;
-  return {{edition.name, edition.size}};
+  const std::string_view address = TextOf(m_szLocalIP);
+  const std::string_view serialNo = TextOf(m_szSerialNo);
+  const bool full = serialNo.size() == sizeof m_szSerialNo;
+  return {row < std::size(kEditions) ? kEditions[row] : kNoEdition, address, serialNo,
+          full ? address : std::string_view()};
 }
 
 // Securities or futures; the host's number is compared unsigned, so a negative one means futures.
@@ -94,16 +72,13 @@ char CGatewayPub::RequestKind() const {
   return static_cast<uint32_t>(m_nMarket) <= 100 ? 'S' : 'F';
 }
 
-void CGatewayPub::TakeStamp(Stamp& stamp) {
+Stamp CGatewayPub::TakeStamp() {
   const time_t now = time(nullptr);
   struct tm local;
   if (localtime_r(&now, &local) == nullptr) local = {};
-  const uint32_t sequence = static_cast<uint32_t>(m_nSeqNo) % 100;
-  m_nSeqNo = static_cast<int32_t>(sequence);
-  const auto clock =
-      static_cast<uint32_t>(local.tm_hour * 10000 + local.tm_min * 100 + local.tm_sec);
-  stamp.year = WrapAdd(local.tm_year, 1900);
-  stamp.month = local.tm_mon + 1;
-  stamp.day = local.tm_mday;
-  WriteEightDigits(stamp.requestId.chars, clock * 100 + sequence);
+  m_nSeqNo = static_cast<int32_t>(static_cast<uint32_t>(m_nSeqNo) % 100);
+  const int clock = local.tm_hour * 10000 + local.tm_min * 100 + local.tm_sec;
+  Stamp stamp = {WrapAdd(local.tm_year, 1900), local.tm_mon + 1, local.tm_mday, {}};
+  WriteDecimal(stamp.digits, clock * 100 + m_nSeqNo, sizeof stamp.digits);
+  return stamp;
 }

@@ -5,8 +5,8 @@
 //   end      a record whose sequence is the end mark, or no further complete record: a reply that
 //            was cut short ends its list with what there is
 //
-// In most lists the first record's code speaks for the reply: data, no data, or a refusal. The lists
-// of accounts, and those of futures fills and positions, ask the reply as a whole.
+// In most lists the first record's code speaks for the reply: data, no data, or a refusal. The
+// lists of accounts, and those of futures fills and positions, ask the reply as a whole.
 #ifndef QUORVANE_GATEWAY_CORE_LIST_FRAME_H_
 #define QUORVANE_GATEWAY_CORE_LIST_FRAME_H_
 

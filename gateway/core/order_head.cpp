@@ -19,37 +19,13 @@ IdentityParts SplitIdentity(std::string_view identity) {
   return {first, second.empty() ? first : second};
 }
 
-// The brief header goes without.
-bool HasAddress(const OrderKey& key) {
-  return key.head == OrderHead::kBrief || !key.address.text.empty();
-}
-
-// The pieces of the usual header.
-ALWAYS_INLINE inline auto Origin(const OrderKey& key) {
-  return MakePiece(WIRE("F=1|KIND=%c|BHNO=%s|CB=1|IP=%s|11=%s|VER=%s|SN=%s|65=00%s|14=%c"),
-                   key.market, key.origin.branch, key.address, key.edition, kProtocolVersion,
-                   key.serialNo, key.stamp.requestId, key.function);
-}
-ALWAYS_INLINE inline auto Account(const OrderKey& key) {
-  return MakePiece(WIRE("|15=0|IDNO=%s|ACNO=%s|PWD=%s"), key.identity.first, key.identity.second,
-                   key.origin.password);
-}
-ALWAYS_INLINE inline auto Stamps(const OrderKey& key) {
-  return MakePiece(WIRE("|21=%04d%02d%02d|22=%s|23=%s|24=5|V4="), key.stamp.year, key.stamp.month,
-                   key.stamp.day, key.stamp.Clock(), key.stamp.requestId);
-}
-
-bool NamesAccount(const OrderKey& key) {
-  return IsAccountLength(key.identity.second.size());
-}
-
 // The second part decides. The blocks "15=1" open without a bar in the plain header, its tag 14
 // running straight into "15=1". They end with a bar and the next field opens with one: the doubled
 // '|' is the wire's.
 bool WriteIdentity(CTextWriter& line, const OrderKey& key) {
   const auto [first, second] = key.identity;
-  if (NamesAccount(key)) {
-    line.AppendPieces(Account(key));
+  if (IsAccountLength(second.size())) {
+    line.Append(WIRE("|15=0|IDNO=%s|ACNO=%s|PWD=%s"), first, second, key.origin.password);
     return true;
   }
   if (!IsIdNumberLength(second.size())) return false;
@@ -60,16 +36,26 @@ bool WriteIdentity(CTextWriter& line, const OrderKey& key) {
   return true;
 }
 
-// Any other origin than an account behind the usual header.
-__attribute__((noinline, cold)) bool WriteUnusualOrigin(CTextWriter& line, const OrderKey& key) {
+void WriteOrigin(CTextWriter& line, const OrderKey& key) {
+  const Device& device = key.device;
   if (key.head == OrderHead::kBrief) {
-    line.Append(WIRE("F=1|KIND=%c|CB=1|BHNO=%s|VER=%s|SN=%s|11=%s|65=00%s|14=%c"), key.market,
-                key.origin.branch, kProtocolVersion, key.serialNo, key.edition, key.stamp.requestId,
-                key.function);
+    line.Append(WIRE("F=1|KIND=%c|CB=1|BHNO=%s|VER=%s|SN=%s%s|11=%s|65=00%s|14=%c"), key.market,
+                key.origin.branch, kProtocolVersion, device.serialNo, device.serialTail,
+                device.edition, key.stamp.RequestId(), key.function);
   } else {
-    line.AppendPieces(Origin(key));
+    line.Append(WIRE("F=1|KIND=%c|BHNO=%s|CB=1|IP=%s|11=%s|VER=%s|SN=%s%s|65=00%s|14=%c"),
+                key.market, key.origin.branch, device.address, device.edition, kProtocolVersion,
+                device.serialNo, device.serialTail, key.stamp.RequestId(), key.function);
   }
-  return WriteIdentity(line, key);
+}
+
+void WriteStamps(CTextWriter& line, const OrderKey& key) {
+  const Stamp& stamp = key.stamp;
+  line.Append(WIRE("|21=%04d%02d%02d|22=%s|23=%s|24=5|V4="), stamp.year, stamp.month, stamp.day,
+              stamp.Clock(), stamp.RequestId());
+  if (key.head == OrderHead::kPlain && !key.origin.rocDate.empty()) {
+    line.Append(WIRE("|44=%08d"), RocToWesternDate(key.origin.rocDate));
+  }
 }
 
 }  // namespace
@@ -97,10 +83,9 @@ int CGatewayPub::initOrderHead2(char function, const char* branch, const char* i
 int CGatewayPub::WritePublicHead(OrderHead head, char function, const OrderOrigin& origin,
                                  char* out, char* orderKey) {
   CTextWriter line = CTextWriter::Continue(out, kBufferSize);
-  KeyStore store;
-  const OrderKey key(*this, head, function, origin, store);
+  const OrderKey key = KeyOf(head, function, origin);
   const bool written = WriteOrderHead(line, key);
-  if (orderKey != nullptr && HasAddress(key)) {
+  if (orderKey != nullptr && key.HasAddress()) {
     CTextWriter text(orderKey, kBufferSize);
     key.AppendTo(text);
     text.Text();
@@ -109,41 +94,31 @@ int CGatewayPub::WritePublicHead(OrderHead head, char function, const OrderOrigi
 }
 
 bool CGatewayPub::WriteOrderHead(CTextWriter& line, const OrderKey& key) {
-  if (!HasAddress(key)) {
+  if (!key.HasAddress()) {
     line.Replace(kNoAddress);
     return false;
   }
-  if (Mostly(key.head != OrderHead::kBrief && NamesAccount(key))) {
-    line.AppendPieces(Origin(key), Account(key));
-  } else if (!WriteUnusualOrigin(line, key)) {
+  WriteOrigin(line, key);
+  if (!WriteIdentity(line, key)) {
     line.Replace(kIdentityLengths);
     return false;
   }
-  if (key.head == OrderHead::kPlain && Mostly(!key.origin.rocDate.empty())) {
-    line.AppendPieces(Stamps(key),
-                      MakePiece(WIRE("|44=%08d"), RocToWesternDate(key.origin.rocDate)));
-  } else if (key.head != OrderHead::kBrief) {
-    line.AppendPieces(Stamps(key));
-  }
+  if (key.head != OrderHead::kBrief) WriteStamps(line, key);
   if (!line.Overflowed()) debuglog(line.Text());
   return true;
 }
 
-OrderKey::OrderKey(CGatewayPub& session, OrderHead orderHead, char orderFunction,
-                   const OrderOrigin& name, KeyStore& store)
-    : head(orderHead),
-      function(orderFunction),
-      origin(name),
-      market(session.RequestKind()),
-      edition(session.PlatformName()),
-      address{session.LocalIP()},
-      serialNo(session.SerialNo(address.text, store.serialNo)),
-      identity(SplitIdentity(name.identity)),
-      stamp(store.stamp) {
-  session.TakeStamp(store.stamp);
+OrderKey CGatewayPub::KeyOf(OrderHead head, char function, const OrderOrigin& origin) {
+  return {head,        function,   RequestKind(), origin, SplitIdentity(origin.identity),
+          TheDevice(), TakeStamp()};
 }
 
 void OrderKey::AppendTo(CTextWriter& text) const {
-  if (head == OrderHead::kPlain) text.AppendPieces(Plain());
-  if (head == OrderHead::kSigned) text.AppendPieces(Signed());
+  if (head == OrderHead::kPlain) {
+    text.Append(WIRE("%s_%s_%s_%c"), origin.branch, identity.second, identity.first, function);
+  } else if (head == OrderHead::kSigned) {
+    text.Append(WIRE("%s%s,%s,%04d%02d%02d,%s-%s,%s,%c"), device.serialNo, device.serialTail,
+                device.address, stamp.year, stamp.month, stamp.day, origin.branch, identity.second,
+                identity.first, function);
+  }
 }

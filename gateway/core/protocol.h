@@ -8,7 +8,7 @@
 #include "gateway/core/messages.h"
 #include "gateway/core/text_writer.h"
 
-inline constexpr FixedText<5> kProtocolVersion = {{'2', '4', '3', '6', '9'}};
+inline constexpr std::string_view kProtocolVersion = "24369";
 
 // Buffer of one part of an identity field; a longer part is dropped.
 inline constexpr size_t kIdentityPartSize = 40;
@@ -30,16 +30,9 @@ inline void CopyIfFits(std::string_view text, char* out, int size) {
   out[text.size()] = '\0';
 }
 
-// As text.find(c): a short text is looked at as one word.
-inline size_t FindChar(std::string_view text, char c) {
-  if (text.size() - 4 > 4) return text.find(c);
-  const uint64_t found = BytesEqual(LoadWord(text), c);
-  return found != 0 ? static_cast<size_t>(__builtin_ctzll(found)) / 8 : std::string_view::npos;
-}
-
 // The text before the next `separator`, which is passed over, or all the rest.
 inline std::string_view TakePiece(std::string_view& rest, char separator) {
-  const size_t end = FindChar(rest, separator);
+  const size_t end = rest.find(separator);
   const bool found = end != std::string_view::npos;
   const std::string_view piece(rest.data(), found ? end : rest.size());
   rest.remove_prefix(found ? end + 1 : rest.size());

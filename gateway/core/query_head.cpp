@@ -54,8 +54,8 @@ CTextWriter CGatewayPub::StartQuery(const char* branch, const char* identity, co
 
 bool CGatewayPub::WriteQueryHead(CTextWriter& line, const char* branch, const char* identity,
                                  const char* password) {
-  Stamp stamp;
-  TakeStamp(stamp);
+  const Stamp stamp = TakeStamp();
+  const Device device = TheDevice();
   char first[kIdentityPartSize] = "";
   char second[kIdentityPartSize] = "";
   if (!AsText(identity).empty() &&
@@ -65,16 +65,14 @@ bool CGatewayPub::WriteQueryHead(CTextWriter& line, const char* branch, const ch
   }
   debuglog(first);
   debuglog(second);
-  const std::string_view address = LocalIP();
-  if (address.empty()) {
+  if (device.address.empty()) {
     line.Replace(kNoAddress);
     return false;
   }
 
-  SerialScratch scratch;
-  line.Append(WIRE("F=7|KIND=%c|BHNO=%s|CB=1|IP=%s|11=%s|VER=%s|65=00%s|SN=%s|"), RequestKind(),
-              branch, PaddedText{address}, PlatformName(), kProtocolVersion, stamp.requestId,
-              SerialNo(address, scratch));
+  line.Append(WIRE("F=7|KIND=%c|BHNO=%s|CB=1|IP=%s|11=%s|VER=%s|65=00%s|SN=%s%s|"), RequestKind(),
+              branch, device.address, device.edition, kProtocolVersion, stamp.RequestId(),
+              device.serialNo, device.serialTail);
   if (first[0] == '\0') return true;
   if (!WriteIdentity(line, first, second, password)) {
     line.Replace(kIdentityLengths);

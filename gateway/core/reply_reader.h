@@ -86,9 +86,6 @@ constexpr TagKey MakeTagKey(const char* tag) {
 inline TagKey LoadTagKey(const char* chars) {
   TagKey key;
   memcpy(&key, chars, sizeof key);
-#if __BYTE_ORDER__ != __ORDER_LITTLE_ENDIAN__
-  key = __builtin_bswap32(key);
-#endif
   return key;
 }
 
@@ -151,7 +148,7 @@ class CTagTable {
   }
 
   // The row of the tag with this key, or kNone.
-  ALWAYS_INLINE constexpr int Find(TagKey key) const {
+  constexpr int Find(TagKey key) const {
     const int row = m_rows[PlaceOf(key)];
     return m_keys[row] == key ? row : kNone;
   }

@@ -11,15 +11,22 @@
 inline constexpr size_t kSerialNoSize = 20;
 inline constexpr size_t kLocalIPSize = 64;
 
-// Room for a full serial number with the address run onto it.
-using SerialScratch = char[kSerialNoSize + kLocalIPSize];
-
 // The local time of one call and the request id made of it.
 struct Stamp {
   int year, month, day;
-  FixedText<8> requestId;  // HHMMSS and two digits of the sequence number
+  char digits[8];  // HHMMSS and two digits of the sequence number
 
-  FixedValue<6> Clock() const { return {requestId.chars}; }
+  std::string_view RequestId() const { return {digits, sizeof digits}; }
+  std::string_view Clock() const { return {digits, 6}; }
+};
+
+// The device as headers name it; the texts lie in the session. A serial number that fills its field
+// has no terminator there, so the gateway knows it with the address run onto it: `serialTail`.
+struct Device {
+  std::string_view edition;
+  std::string_view address;
+  std::string_view serialNo;
+  std::string_view serialTail;
 };
 
 // The three order headers: what each sends is in order_head.cpp.
@@ -38,46 +45,22 @@ struct IdentityParts {
   std::string_view second;  // the same where there is but one
 };
 
-class CGatewayPub;
-
-// The parts of an order key that are made for it.
-struct KeyStore {
-  Stamp stamp;
-  SerialScratch serialNo;
-};
-
 // What one order is named by, in its header and, as the order key, at the start of its signature
-// payload. The parts lie in the host's texts, the session and the store, and are copied from there
-// alone: a copy of what was just written in other sizes would wait for it.
+// payload. Its texts are the host's and the session's.
 struct OrderKey {
-  // Reads the clock. The session, `name` and `store` outlive the key.
-  OrderKey(CGatewayPub& session, OrderHead orderHead, char orderFunction, const OrderOrigin& name,
-           KeyStore& store);
-  OrderKey(const OrderKey&) = delete;
-  OrderKey& operator=(const OrderKey&) = delete;
+  OrderHead head;
+  char function;
+  char market;  // securities or futures
+  OrderOrigin origin;
+  IdentityParts identity;
+  Device device;
+  Stamp stamp;
 
-  // The key as a piece, behind a plain header and behind a signed one.
-  ALWAYS_INLINE auto Plain() const {
-    return MakePiece(WIRE("%s_%s_%s_%c"), origin.branch, identity.second, identity.first, function);
-  }
-  ALWAYS_INLINE auto Signed() const {
-    return MakePiece(WIRE("%s,%s,%04d%02d%02d,%s-%s,%s,%c"), serialNo, address, stamp.year,
-                     stamp.month, stamp.day, origin.branch, identity.second, identity.first,
-                     function);
-  }
+  // The brief header goes without an address.
+  bool HasAddress() const { return head == OrderHead::kBrief || !device.address.empty(); }
 
-  // The key of its header; nothing where the header has none.
+  // Appends the key of its header; nothing where the header has none.
   void AppendTo(CTextWriter& text) const;
-
-  const OrderHead head;
-  const char function;
-  const OrderOrigin& origin;
-  const char market;  // securities or futures
-  const PaddedText edition;
-  const PaddedText address;
-  const PaddedText serialNo;
-  const IdentityParts identity;
-  const Stamp& stamp;
 };
 
 #endif  // QUORVANE_GATEWAY_CORE_REQUEST_HEAD_H_

@@ -22,9 +22,8 @@ char* RenewHeapText(const HeapText& owner, size_t length);
 
 // Writes the records of one list into an object's heap text. A list that memory cannot hold fails
 // once, for good.
-class CResultText : public CWireText<CResultText> {
+class CResultText : public CWireText {
  public:
-  static constexpr bool kGrows = true;
   static constexpr size_t kOpeningRoom = 20;  // kept before the records for what opens the list
 
   // `owner`'s text is replaced. `expected` is a fair guess of the list's size: a first allocation
@@ -44,8 +43,7 @@ class CResultText : public CWireText<CResultText> {
   char* Finish(std::string_view opening, int count);
 
  private:
-  friend class CWireText<CResultText>;
-  __attribute__((noinline, cold)) bool MakeRoom(size_t count);
+  bool MakeRoom(size_t count) override;
 
   HeapText m_owner;
   size_t m_nExpected;

@@ -1,5 +1,7 @@
 #include "gateway/core/text_writer.h"
 
+#include <cstring>
+
 namespace {
 
 size_t CountBlanks(const char* at, const char* end) {

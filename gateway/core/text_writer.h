@@ -6,10 +6,8 @@
 
 // Never writes outside its buffer. What does not fit sets one sticky overflow and is not written,
 // nor is anything after it; the writer's user asks once, at the end.
-class CTextWriter : public CWireText<CTextWriter> {
+class CTextWriter : public CWireText {
  public:
-  static constexpr bool kGrows = false;
-
   // Starts an empty text in `buffer`, which has `size` >= 1 bytes, terminator included, and
   // outlives the writer. Nothing is cleared but the text's own end.
   CTextWriter(char* buffer, size_t size)
@@ -35,8 +33,7 @@ class CTextWriter : public CWireText<CTextWriter> {
   void EscapeBlanks();
 
  private:
-  friend class CWireText<CTextWriter>;
-  __attribute__((noinline, cold)) bool MakeRoom(size_t count);
+  bool MakeRoom(size_t count) override;
 
   char* m_pBegin;
   char* m_pLimit;  // the buffer's last byte

@@ -1,63 +1,87 @@
 // The wire's own format texts, read by the compiler: a wrong value type does not build, and at run
-// time nothing is interpreted.
+// time nothing is looked for.
 //
-// Marks: "%s" (a C text, null read as empty, a std::string_view, a PaddedText or a FixedText), "%c"
-// (char), "%d" (int, a byte of the host's or a RepeatedNumber), "%ld" (any integer) and the
-// zero-padded "%0Nd" (int).
+// Marks: "%s" (a C text, null read as empty, or a std::string_view), "%c" (char), "%d" (int, or a
+// byte of the host's), "%ld" (any integer) and the zero-padded "%0Nd" (int).
 #ifndef QUORVANE_GATEWAY_CORE_WIRE_FORMAT_H_
 #define QUORVANE_GATEWAY_CORE_WIRE_FORMAT_H_
 
+#include <array>
 #include <cstddef>
+#include <cstdint>
+#include <string_view>
+#include <type_traits>
 
 // A format text as a type, so that its marks are known while compiling.
-#define WIRE(text)                                                  \
-  ([] {                                                             \
-    struct Format {                                                 \
-      static constexpr const char* Chars() { return text; }         \
-      static constexpr size_t Length() { return sizeof(text) - 1; } \
-    };                                                              \
-    return Format{};                                                \
+#define WIRE(text)                                              \
+  ([] {                                                         \
+    struct Format {                                             \
+      static constexpr std::string_view Text() { return text; } \
+    };                                                          \
+    return Format{};                                            \
   }())
 
-// One mark of a format, with the literal text before it.
+// One mark of a format and the literal text before it. Behind the last mark of a format stands one
+// more, of kind 0, for the rest of the literal text.
 struct WireMark {
-  size_t literalAt;
-  size_t literalSize;
-  char kind;  // 's', 'c', 'd', or 'l' for "%ld"; 0 behind the last mark
-  size_t width;
+  uint8_t literalAt;
+  uint8_t literalSize;
+  char kind;  // 's', 'c', 'd', or 'l' for "%ld"
+  uint8_t width;
 };
 
-// A format taken apart: its marks, then one entry for the literal text behind the last of them.
-struct WirePlan {
-  static constexpr size_t kMaxMarks = 24;
+constexpr size_t CountMarks(std::string_view format) {
+  size_t count = 0;
+  for (char c : format) count += c == '%';
+  return count;
+}
 
-  WireMark marks[kMaxMarks + 1] = {};
-  size_t count = 0;         // of the marks
-  size_t literalChars = 0;  // of all literal texts together
-};
-
-template <class Format>
-constexpr WirePlan PlanWire() {
-  const char* const chars = Format::Chars();
-  WirePlan plan;
+template <size_t kCount>
+constexpr std::array<WireMark, kCount + 1> ReadMarks(std::string_view format) {
+  std::array<WireMark, kCount + 1> marks = {};
   size_t at = 0;
-  for (;;) {
-    WireMark& mark = plan.marks[plan.count];
-    mark.literalAt = at;
-    while (at < Format::Length() && chars[at] != '%') ++at;
-    mark.literalSize = at - mark.literalAt;
-    plan.literalChars += mark.literalSize;
-    if (at == Format::Length()) return plan;
-    for (++at; chars[at] >= '0' && chars[at] <= '9'; ++at) {
-      mark.width = mark.width * 10 + static_cast<size_t>(chars[at] - '0');
+  for (WireMark& mark : marks) {
+    mark.literalAt = static_cast<uint8_t>(at);
+    while (at < format.size() && format[at] != '%') ++at;
+    mark.literalSize = static_cast<uint8_t>(at - mark.literalAt);
+    if (at == format.size()) break;
+    for (++at; format[at] >= '0' && format[at] <= '9'; ++at) {
+      mark.width = static_cast<uint8_t>(mark.width * 10 + (format[at] - '0'));
     }
-    mark.kind = chars[at];
-    at += chars[at] == 'l' ? 2 : 1;
-    ++plan.count;
+    mark.kind = format[at];
+    at += mark.kind == 'l' ? 2 : 1;
   }
+  return marks;
 }
 
 template <class Format>
-inline constexpr WirePlan kWirePlan = PlanWire<Format>();
+inline constexpr auto kWireMarks = ReadMarks<CountMarks(Format::Text())>(Format::Text());
+
+// A value as the writer takes it, of a text the characters and their number.
+struct WireValue {
+  int64_t number;
+  const char* text = nullptr;
+};
+
+inline std::string_view AsText(const char* text) {
+  return text == nullptr ? std::string_view() : std::string_view(text);
+}
+inline std::string_view AsText(std::string_view text) {
+  return text;
+}
+
+template <char kKind, class Value>
+WireValue MakeWireValue(const Value& value) {
+  if constexpr (kKind == 's') {
+    const std::string_view text = AsText(value);
+    return {static_cast<int64_t>(text.size()), text.data()};
+  } else {
+    static_assert(kKind != 'c' || std::is_same_v<Value, char>, "%c takes a char");
+    static_assert(kKind != 'd' || std::is_same_v<Value, int> || std::is_same_v<Value, uint8_t>,
+                  "%d takes an int or a byte");
+    static_assert(std::is_integral_v<Value>, "%ld takes an integer");
+    return {static_cast<int64_t>(value)};
+  }
+}
 
 #endif  // QUORVANE_GATEWAY_CORE_WIRE_FORMAT_H_

@@ -208,8 +208,7 @@ char* CGatewayFut::EncodeOrder(OrderHead head, const OrderOrigin& origin, const 
                                int* status) {
   *status = 1;
   CTextWriter line = StartRequest();
-  KeyStore store;
-  const OrderKey key(*this, head, order.function, origin, store);
+  const OrderKey key = KeyOf(head, order.function, origin);
   if (!WriteOrderHead(line, key)) {
     *status = -1;
     return line.Text();

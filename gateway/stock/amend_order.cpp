@@ -49,7 +49,7 @@ void WriteCancel(CTextWriter& line, const StockOrder& order, const OrderKey& key
   const OrderReference reference = SplitReference(order);
   WriteBody(line, WIRE("|10=%08d|36=%s|46=%s|28=%d|29=%s|31=%d|32=%c|N6=%d|27=%d|UT=1000|13=%c"),
             order, reference, order.n6, order.kind, order.flag13);
-  line.AppendPieces(OpenBare(), key.Plain());
+  OpenPayload(line, key);
   line.Append(WIRE("_%s_%c_%s__"), reference.orderNumber, order.side, order.stockCode);
 }
 
@@ -58,7 +58,7 @@ void WriteChange(CTextWriter& line, const StockOrder& order, const OrderKey& key
   WriteBody(line,
             WIRE("|10=%08d|36=%s|46=%s|28=%d|29=%s|31=%d|32=%c|37=%d|N6=%d|27=%d|UT=%d|13=%c"),
             order, reference, SentQuantity(order), order.n6, order.kind, order.unit, order.flag13);
-  line.AppendPieces(OpenBare(), key.Plain());
+  OpenPayload(line, key);
   line.Append(WIRE("_%s_%c_%s_%d_"), reference.orderNumber, order.side, order.stockCode,
               SentQuantity(order));
 }
@@ -73,7 +73,7 @@ void WriteTaggedBody(CTextWriter& line, const StockOrder& order, const OrderRefe
 void WriteTaggedCancel(CTextWriter& line, const StockOrder& order, const OrderKey& key) {
   const OrderReference reference = SplitReference(order);
   WriteTaggedBody(line, order, reference);
-  line.AppendPieces(OpenTagged(), key.Signed());
+  OpenPayload(line, key);
   line.Append(WIRE(",%c,%s,,%d,,,,%s"), order.side, order.stockCode, order.tradeType,
               reference.orderNumber);
 }
@@ -81,7 +81,7 @@ void WriteTaggedCancel(CTextWriter& line, const StockOrder& order, const OrderKe
 void WriteTaggedChange(CTextWriter& line, const StockOrder& order, const OrderKey& key) {
   const OrderReference reference = SplitReference(order);
   WriteTaggedBody(line, order, reference);
-  line.AppendPieces(OpenTagged(), key.Signed());
+  OpenPayload(line, key);
   line.Append(WIRE(",%c,%s,,%d,,%d,,%s"), order.side, order.stockCode, order.tradeType,
               SentQuantity(order), reference.orderNumber);
 }

@@ -36,11 +36,9 @@ constexpr TagRow kRows[] = {
     {kTime51, "51", 50}};
 constexpr CListTable kTags(kRows, kStockList);
 
-constexpr COrderTypes kOrderTypes(kOrderTypeRows, kLiveOrderTypeRows);
-
 int TypeCodeOf(const CRecord& record) {
-  return kOrderTypes.Find(record.Number(kOrderKind), record.Number(kTradeType),
-                          record.Text(kSide) == "B");
+  return FindOrderType(record.Number(kOrderKind), record.Number(kTradeType),
+                       record.Text(kSide) == "B", kOrderTypeRows, kLiveOrderTypeRows);
 }
 
 void AppendFill(CResultText& list, const CRecord& record, int typeCode) {

@@ -30,17 +30,12 @@ int Hundredths(const StockOrder& order) {
   return order.price % 100;
 }
 
-ALWAYS_INLINE inline auto Body(const StockOrder& order, const RepeatedNumber& quantity) {
-  return MakePiece(WIRE("|27=%d|28=%d|29=%s|30=%d|UT=%d|13=%c|N6=%d"), order.kind, order.tradeType,
-                   order.stockCode, quantity, order.unit, order.flag13, order.n6);
-}
-
-// The price group, with a limit and without.
-ALWAYS_INLINE inline auto Limit(const StockOrder& order, const RepeatedNumber& whole) {
-  return MakePiece(WIRE("|31=%d.%02d|M8=0|32=%c|33="), whole, Hundredths(order), order.side);
-}
-void WriteNoLimit(CTextWriter& line, const StockOrder& order) {
-  if (order.tradeType == kFixedPrice) {
+void WriteBody(CTextWriter& line, const StockOrder& order) {
+  line.Append(WIRE("|27=%d|28=%d|29=%s|30=%d|UT=%d|13=%c|N6=%d"), order.kind, order.tradeType,
+              order.stockCode, SentQuantity(order), order.unit, order.flag13, order.n6);
+  if (HasLimit(order)) {
+    line.Append(WIRE("|31=%d.%02d|M8=0|32=%c|33="), Whole(order), Hundredths(order), order.side);
+  } else if (order.tradeType == kFixedPrice) {
     line.Append(WIRE("|31=|M8=|32=%c|33="), order.side);
   } else {
     line.Append(WIRE("|31=0|M8=%d|32=%c|33="), order.priceKind, order.side);
@@ -49,37 +44,28 @@ void WriteNoLimit(CTextWriter& line, const StockOrder& order) {
 
 // Names one value for the price: the limit, the price kind or the trade type, whichever decides.
 void WriteBare(CTextWriter& line, const StockOrder& order, const OrderKey& key) {
-  const RepeatedNumber quantity(SentQuantity(order));
-  if (Mostly(HasLimit(order))) {
-    const RepeatedNumber whole(Whole(order));
-    line.AppendPieces(Body(order, quantity), Limit(order, whole), OpenBare(), key.Plain(),
-                      MakePiece(WIRE("_%c_%s_%d_%d.%02d"), order.side, order.stockCode, quantity,
-                                whole, Hundredths(order)));
+  WriteBody(line, order);
+  OpenPayload(line, key);
+  if (HasLimit(order)) {
+    line.Append(WIRE("_%c_%s_%d_%d.%02d"), order.side, order.stockCode, SentQuantity(order),
+                Whole(order), Hundredths(order));
   } else {
-    line.AppendPieces(Body(order, quantity));
-    WriteNoLimit(line, order);
-    line.AppendPieces(
-        OpenBare(), key.Plain(),
-        MakePiece(WIRE("_%c_%s_%d_%d"), order.side, order.stockCode, quantity,
-                  order.tradeType == kFixedPrice ? order.tradeType : order.priceKind));
+    line.Append(WIRE("_%c_%s_%d_%d"), order.side, order.stockCode, SentQuantity(order),
+                order.tradeType == kFixedPrice ? order.tradeType : order.priceKind);
   }
 }
 
 // Names them all, with 0 for the price where no limit applies.
 void WriteTagged(CTextWriter& line, const StockOrder& order, const OrderKey& key) {
-  const RepeatedNumber quantity(SentQuantity(order));
-  if (Mostly(HasLimit(order))) {
-    const RepeatedNumber whole(Whole(order));
-    line.AppendPieces(
-        Body(order, quantity), Limit(order, whole), OpenTagged(), key.Signed(),
-        MakePiece(WIRE(",%c,%s,%d,%d,%d,%d,%d.%02d,"), order.side, order.stockCode, order.kind,
-                  order.tradeType, order.priceKind, quantity, whole, Hundredths(order)));
+  WriteBody(line, order);
+  OpenPayload(line, key);
+  if (HasLimit(order)) {
+    line.Append(WIRE(",%c,%s,%d,%d,%d,%d,%d.%02d,"), order.side, order.stockCode, order.kind,
+                order.tradeType, order.priceKind, SentQuantity(order), Whole(order),
+                Hundredths(order));
   } else {
-    line.AppendPieces(Body(order, quantity));
-    WriteNoLimit(line, order);
-    line.AppendPieces(OpenTagged(), key.Signed(),
-                      MakePiece(WIRE(",%c,%s,%d,%d,%d,%d,0,"), order.side, order.stockCode,
-                                order.kind, order.tradeType, order.priceKind, quantity));
+    line.Append(WIRE(",%c,%s,%d,%d,%d,%d,0,"), order.side, order.stockCode, order.kind,
+                order.tradeType, order.priceKind, SentQuantity(order));
   }
 }
 
@@ -88,12 +74,10 @@ constexpr OrderForm kTaggedOrder = {'I', OrderHead::kSigned, FindFault, WriteTag
 
 }  // namespace
 
-IN_ONE_PIECE char* CGatewayStk::SubmitOrderEncode(const char* branch, const char* identity,
-                                                  const char* password, const char* stockCode,
-                                                  const char* date, long quantity, long unit,
-                                                  long price, char side, char flag13,
-                                                  char orderKind, char priceKind, char tradeType,
-                                                  char n6, int* status) {
+char* CGatewayStk::SubmitOrderEncode(const char* branch, const char* identity, const char* password,
+                                     const char* stockCode, const char* date, long quantity,
+                                     long unit, long price, char side, char flag13, char orderKind,
+                                     char priceKind, char tradeType, char n6, int* status) {
   const StockOrder order(branch, identity, password, stockCode, date, nullptr, quantity, unit,
                          price, side, flag13, orderKind, priceKind, tradeType, n6);
   return EncodeOrder(kBareOrder, order, status);

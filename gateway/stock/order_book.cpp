@@ -62,11 +62,9 @@ constexpr OrderTypeRow kBookRows[] = {
     {SetOf(7), kEveryNumber, 31, 31},
 };
 
-constexpr COrderTypes kOrderTypes(kOrderTypeRows, kLiveOrderTypeRows, kBookRows);
-
 int TypeCodeOf(const CRecord& record) {
-  return kOrderTypes.Find(record.Number(kOrderKind), record.Number(kTradeType),
-                          record.Text(kSide) == "B");
+  return FindOrderType(record.Number(kOrderKind), record.Number(kTradeType),
+                       record.Text(kSide) == "B", kOrderTypeRows, kLiveOrderTypeRows, kBookRows);
 }
 
 // What the gateway says of a failed order, with no '!' that would end the record; empty for any
@@ -151,7 +149,7 @@ char* CGatewayStk::QueryOrderEncode(const char* branch, const char* identity, co
   return FinishEscaped(line, status, kBadParameters);
 }
 
-IN_ONE_PIECE char* CGatewayStk::QueryOrderDecode(const char* reply, int* status) {
+char* CGatewayStk::QueryOrderDecode(const char* reply, int* status) {
   const std::string_view text = AsText(reply);
   LogReply("QueryOrderDecode", text);
   if (TransportFailed(text, status)) return m_szBuffer;

@@ -73,14 +73,12 @@ struct KindRange {
 
 constexpr KindRange kKindRanges[] = {{5, 17, 19}, {20, 25, 32}, {26, 26, 39}};
 
-constexpr COrderTypes kOrderTypes(kOrderTypeRows);
-
 int TypeCodeOf(const CRecord& record) {
   const int kind = record.Number(kOrderKind);
   for (const KindRange& range : kKindRanges) {
     if (kind >= range.first && kind <= range.last) return range.code + (kind - range.first);
   }
-  return kOrderTypes.Find(kind, record.Number(kTradeType), record.Text(kSide) == "B");
+  return FindOrderType(kind, record.Number(kTradeType), record.Text(kSide) == "B", kOrderTypeRows);
 }
 
 // The two amounts that records of these kinds or types show.

@@ -1,15 +1,33 @@
-// The brief order, which is a header and its trade type.
+// The road that every stock order takes, and the brief order, which is a header and its trade type.
 #include "gateway/stock/stock_order.h"
 
 #include "gateway/stock/gateway_stk.h"
+
+void OpenPayload(CTextWriter& line, const OrderKey& key) {
+  line.AppendText(key.head == OrderHead::kSigned ? "|PL=S!!" : "!!");
+  key.AppendTo(line);
+}
+
+char* CGatewayStk::EncodeOrder(const OrderForm& form, const StockOrder& order, int* status) {
+  *status = 1;
+  CTextWriter line = StartRequest();
+  const OrderKey key = KeyOf(form.head, form.function, order.origin);
+  if (!WriteOrderHead(line, key)) {
+    *status = -1;
+    return line.Text();
+  }
+  const char* const fault = form.fault(order);
+  if (fault != nullptr) return Fail(line, status, fault);
+  form.write(line, order, key);
+  return Finish(line, status, kBadParameters);
+}
 
 // The trade type follows whatever the header left, its message too.
 char* CGatewayStk::SubmitOrderEncode2(const char* branch, const char* identity,
                                       const char* password, char function, char tradeType) {
   CTextWriter line = StartRequest();
   const OrderOrigin origin = {AsText(branch), AsText(identity), AsText(password), {}};
-  KeyStore store;
-  WriteOrderHead(line, OrderKey(*this, OrderHead::kBrief, function, origin, store));
+  WriteOrderHead(line, KeyOf(OrderHead::kBrief, function, origin));
   line.Append(WIRE("|28=%d"), StockOrder::NumberOf(tradeType));
   int unusedStatus = 1;
   return Finish(line, &unusedStatus, kBadParameters);

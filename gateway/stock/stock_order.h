@@ -2,7 +2,7 @@
 #ifndef QUORVANE_GATEWAY_STOCK_STOCK_ORDER_H_
 #define QUORVANE_GATEWAY_STOCK_STOCK_ORDER_H_
 
-#include "gateway/core/branch_hints.h"
+#include "gateway/core/decimal.h"
 #include "gateway/core/number_set.h"
 #include "gateway/core/request_head.h"
 #include "gateway/stock/gateway_stk.h"
@@ -70,14 +70,8 @@ inline bool IsStockCodeTooLong(const StockOrder& order) {
   return order.stockCode.size() > kStockCodeChars;
 }
 
-// What opens a payload, in front of the order's key: it stands bare behind the last field, or in
-// tag PL.
-ALWAYS_INLINE inline auto OpenBare() {
-  return MakePiece(WIRE("!!"));
-}
-ALWAYS_INLINE inline auto OpenTagged() {
-  return MakePiece(WIRE("|PL=S!!"));
-}
+// Appends what opens a payload: it stands bare behind the last field, or in tag PL.
+void OpenPayload(CTextWriter& line, const OrderKey& key);
 
 // What one encoder sends: behind the plain header a bare payload, behind the signed one a payload
 // in tag PL. `fault` tells what keeps an order from being sent, null for nothing; `write` appends
@@ -88,22 +82,5 @@ struct OrderForm {
   const char* (*fault)(const StockOrder& order);
   void (*write)(CTextWriter& line, const StockOrder& order, const OrderKey& key);
 };
-
-// The road that every stock order takes; `form` is a constant, so that its functions are known.
-ALWAYS_INLINE inline char* CGatewayStk::EncodeOrder(const OrderForm& form, const StockOrder& order,
-                                                    int* status) {
-  *status = 1;
-  CTextWriter line = StartRequest();
-  KeyStore store;
-  const OrderKey key(*this, form.head, form.function, order.origin, store);
-  if (!WriteOrderHead(line, key)) {
-    *status = -1;
-    return line.Text();
-  }
-  const char* const fault = form.fault(order);
-  if (fault != nullptr) return Fail(line, status, fault);
-  form.write(line, order, key);
-  return Finish(line, status, kBadParameters);
-}
 
 #endif  // QUORVANE_GATEWAY_STOCK_STOCK_ORDER_H_

@@ -120,37 +120,6 @@ TEST(Decimal, ReadingTouchesNothingOutsideTheSlice) {
   }
 }
 
-TEST(Decimal, FourDigitsAreToldAndRead) {
-  for (uint32_t number = 0; number <= 9999; ++number) {
-    char text[8];
-    snprintf(text, sizeof text, "%04u", number);
-    uint32_t word;
-    memcpy(&word, text, sizeof word);
-    ASSERT_TRUE(AreFourDigits(word));
-    ASSERT_EQ(ValueOfFourDigits(word), number);
-    for (int at = 0; at < 4; ++at) {
-      for (char c : {'/', ':', '@', ' ', '\xb0', '\0', '\xff'}) {
-        char changed[4];
-        memcpy(changed, text, sizeof changed);
-        changed[at] = c;
-        memcpy(&word, changed, sizeof word);
-        ASSERT_FALSE(AreFourDigits(word)) << number << ", " << at << ", " << int{c};
-      }
-    }
-  }
-}
-
-TEST(Decimal, CharactersAreFoundInAWord) {
-  const std::string text = "a.b..\xae.\x2f";
-  for (size_t size = 4; size <= text.size(); ++size) {
-    const uint64_t found = BytesEqual(LoadWord({text.data(), size}), '.');
-    for (size_t at = 0; at < 8; ++at) {
-      const bool expected = at < size && text[at] == '.';
-      EXPECT_EQ(found >> 8 * at & 0xff, expected ? 0x80U : 0U) << size << ", " << at;
-    }
-  }
-}
-
 TEST(Decimal, ReadingStopsAtTheEndOfTheSlice) {
   EXPECT_EQ(ReadInt64(std::string_view("12345", 3)), 123);
   EXPECT_EQ(ReadInt64(std::string_view("-5", 1)), 0);
@@ -204,16 +173,6 @@ TEST(Decimal, GeneratedNumbersArePrintedAsTheCLibraryPrintsThem) {
   }
 }
 
-TEST(Decimal, EightDigitsArePrintedAsTheCLibraryPrintsThem) {
-  for (uint32_t value = 0; value < 100000000; value += value < 120000 ? 1 : 997) {
-    char expected[12];
-    char digits[8];
-    snprintf(expected, sizeof expected, "%08u", value);
-    WriteEightDigits(digits, value);
-    ASSERT_EQ(std::string_view(digits, sizeof digits), expected);
-  }
-}
-
 TEST(Decimal, PowersOfTenSaturate) {
   int64_t power = 1;
   for (int exponent = 0; exponent <= 18; ++exponent, power = exponent <= 18 ? power * 10 : power) {
@@ -244,27 +203,6 @@ TEST(Decimal, ArithmeticWraps) {
   EXPECT_EQ(WrapAdd(int64_t{INT64_MAX}, int64_t{1}), INT64_MIN);
   EXPECT_EQ(WrapMultiply(int64_t{INT64_MAX}, int64_t{2}), -2);
   EXPECT_EQ(WrapMultiply(int64_t{INT64_MIN}, int64_t{-1}), INT64_MIN);
-}
-
-TEST(Decimal, ShortDigitsHaveNoZerosBefore) {
-  for (uint32_t number = 0; number < kShortNumberEnd; ++number) {
-    char text[4];
-    EXPECT_EQ(std::string(text, ShortDigits(number).WriteTo(text)), std::to_string(number));
-  }
-}
-
-TEST(Decimal, NumbersOfEveryLengthHaveNoZerosBefore) {
-  for (int64_t power = 1; power <= INT64_MAX / 10; power *= 10) {
-    for (int64_t number : {power - 1, power, power + 1, 7 * power, -power}) {
-      char text[20];
-      EXPECT_EQ(std::string(text, WriteNumber(text, number)), std::to_string(number));
-    }
-  }
-  for (int64_t number :
-       {int64_t{INT32_MAX}, int64_t{INT32_MIN}, int64_t{INT64_MAX}, int64_t{INT64_MIN}}) {
-    char text[20];
-    EXPECT_EQ(std::string(text, WriteNumber(text, number)), std::to_string(number));
-  }
 }
 
 }  // namespace

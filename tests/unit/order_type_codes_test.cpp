@@ -1,4 +1,4 @@
-// The codes of order types: what the tables hold beforehand, against the rows searched one by one.
+// The codes of order types: the first row that names an order, in lists of rows joined.
 
 #include "gateway/stock/order_type_codes.h"
 
@@ -24,30 +24,30 @@ std::vector<int> Numbers() {
 }
 
 template <class... Lists>
-void ExpectRowsInOrder(const COrderTypes& types, const Lists&... lists) {
+void ExpectRowsInOrder(const Lists&... lists) {
   std::vector<OrderTypeRow> rows;
   (rows.insert(rows.end(), std::begin(lists), std::end(lists)), ...);
   for (int kind : Numbers()) {
     for (int tradeType : Numbers()) {
       for (bool buys : {false, true}) {
-        EXPECT_EQ(types.Find(kind, tradeType, buys), SearchRows(rows, kind, tradeType, buys))
+        EXPECT_EQ(FindOrderType(kind, tradeType, buys, lists...),
+                  SearchRows(rows, kind, tradeType, buys))
             << kind << ", " << tradeType << ", " << buys;
       }
     }
   }
 }
 
-TEST(OrderTypeCodes, TablesHoldTheFirstRowThatNamesAnOrder) {
-  ExpectRowsInOrder(COrderTypes(kOrderTypeRows), kOrderTypeRows);
-  ExpectRowsInOrder(COrderTypes(kOrderTypeRows, kLiveOrderTypeRows), kOrderTypeRows,
-                    kLiveOrderTypeRows);
+TEST(OrderTypeCodes, TheFirstRowThatNamesAnOrderHoldsItsCode) {
+  ExpectRowsInOrder(kOrderTypeRows);
+  ExpectRowsInOrder(kOrderTypeRows, kLiveOrderTypeRows);
 }
 
 TEST(OrderTypeCodes, EarlierRowsHideLaterOnes) {
   constexpr OrderTypeRow kFirst[] = {{SetOf(1), SetOf(2), 1, 2}};
   constexpr OrderTypeRow kSecond[] = {{SetOf(1), kEveryNumber, 3, 4},
                                       {SetOf(1, 8), SetOf(3), 5, 6}};
-  ExpectRowsInOrder(COrderTypes(kFirst, kSecond), kFirst, kSecond);
+  ExpectRowsInOrder(kFirst, kSecond);
 }
 
 }  // namespace
