@@ -53,8 +53,5 @@ void CEntryCall::Release(size_t i) {
 }
 
 void CEntryCall::WriteStep() {
-  char scratch[64];
-  CTextWriter line(scratch, sizeof scratch);
-  line.Append(WIRE("%s%d"), m_options.stepLabel, m_nStep++);
-  debuglog(line.Text());
+  LogLine(WIRE("%s%d"), m_options.stepLabel, m_nStep++);
 }

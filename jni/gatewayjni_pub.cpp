@@ -1,5 +1,6 @@
 // Entry points of login, account maintenance and the trading certificate.
 #include "gateway/core/gateway_pub.h"
+#include "gateway/core/log.h"
 #include "jni/entry_frame.h"
 
 ENCODER(AuthEncode, CGatewayPub::AuthEncode, (LOGIN_PARAMETERS), LOGIN)
@@ -46,7 +47,7 @@ GATEWAY_EXPORT(RevokeCertEncode)
 (JNIEnv* env, jclass, SESSION_PARAMETERS, OWNER_PARAMETERS, jintArray status) {
   FrameOptions options;
   // A call for good is in the log before anything can fail, and then whose certificate it is.
-  options.opening = "Java_com_brindlex_kernel_quorvane_gatewayjni_RevokeCertEncode";
+  options.opening = LOG_TEXT("Java_com_brindlex_kernel_quorvane_gatewayjni_RevokeCertEncode");
   options.loggedText = 1;
   return Encode(env, options, SESSION, &CGatewayPub::RevokeCertEncode, status, OWNER);
 }
@@ -60,7 +61,7 @@ GATEWAY_EXPORT(GetCertEncode2)
 (JNIEnv* env, jclass, SESSION_PARAMETERS, jstring certMsg, jintArray status) {
   FrameOptions options;
   // The messages are long: the log shows how far a call came, to its last release.
-  options.stepLabel = "gatewayjni_GetCertEncode2_";
+  options.stepLabel = LOG_TEXT("gatewayjni_GetCertEncode2_");
   return Encode(env, options, SESSION, &CGatewayPub::GetCertEncode2, status, certMsg);
 }
 DECODER(GetCertDecode, CGatewayPub::GetCertDecode)

@@ -26,20 +26,14 @@ struct CertSteps {
 };
 
 constexpr CertSteps kNoSteps;
-constexpr CertSteps kRevokeSteps = {nullptr, {"test1"}, {}};
-constexpr CertSteps kGetCert2Steps = {"GetCertEncode2_1",
-                                      {"GetCertEncode2_3", "GetCertEncode2_4", "GetCertEncode2_5"},
-                                      {"GetCertEncode2__6", "GetCertEncode2__7"}};
+constexpr CertSteps kRevokeSteps = {nullptr, {LOG_TEXT("test1")}, {}};
+constexpr CertSteps kGetCert2Steps = {
+    LOG_TEXT("GetCertEncode2_1"),
+    {LOG_TEXT("GetCertEncode2_3"), LOG_TEXT("GetCertEncode2_4"), LOG_TEXT("GetCertEncode2_5")},
+    {LOG_TEXT("GetCertEncode2__6"), LOG_TEXT("GetCertEncode2__7")}};
 
 void LogStep(const char* step) {
   if (step != nullptr) debuglog(step);
-}
-
-void LogLength(const char* label, std::string_view message) {
-  char scratch[64];
-  CTextWriter line(scratch, sizeof scratch);
-  line.Append(WIRE("%s Len:%ld"), label, message.size());
-  debuglog(line.Text());
 }
 
 // What tells one request from another.
@@ -85,7 +79,7 @@ char* EncodeCert(CGatewayPub& gateway, const CertRequest& request, const CertOwn
 // The first record alone is read, whatever its length; without one, code and text are empty.
 char* DecodeCert(CGatewayPub& gateway, const char* label, const char* reply, int* status) {
   const std::string_view text = AsText(reply);
-  gateway.LogReply(label, text);
+  LogReply(label, text);
   if (gateway.TransportFailed(text, status)) return gateway.m_szBuffer;
   CRecord record(kTags);
   CRecordWalker walker(text, kUnbounded);
@@ -131,7 +125,7 @@ char* CGatewayPub::GetCertEncode(const char* certMsg, int* status) {
 }
 
 char* CGatewayPub::GetCertEncode2(const char* certMsg, int* status) {
-  LogLength("regMsg", AsText(certMsg));
+  LogLine(WIRE("regMsg Len:%ld"), AsText(certMsg).size());
   return EncodeCert(*this, {"11", kGetCertParameters, false, kGetCert2Steps}, {}, certMsg, status);
 }
 
@@ -151,7 +145,7 @@ char* CGatewayPub::OpenCertEncode(const char* certMsg, int* status) {
 char* CGatewayPub::RegisterCertEncode(const char* certMsg, int* status) {
   constexpr CertRequest kRequest = {"10", kRegisterCertParameters};
   const std::string_view message = AsText(certMsg);
-  LogLength("RegisterCertEncode:", message);
+  LogLine(WIRE("RegisterCertEncode: Len:%ld"), message.size());
   debuglog(certMsg);
   if (message.empty()) return Fail(kRequest.parameterError, status);
   CTextWriter head = StartQuery("", "", "", status);
@@ -168,34 +162,34 @@ char* CGatewayPub::RegisterCertEncode(const char* certMsg, int* status) {
 }
 
 char* CGatewayPub::ApplyCertDecode(const char* reply, int* status) {
-  return DecodeCert(*this, "ApplyCertDecode", reply, status);
+  return DecodeCert(*this, LOG_TEXT("ApplyCertDecode"), reply, status);
 }
 
 char* CGatewayPub::ReNewCertDecode(const char* reply, int* status) {
-  return DecodeCert(*this, "ReNewCertDecode", reply, status);
+  return DecodeCert(*this, LOG_TEXT("ReNewCertDecode"), reply, status);
 }
 
 char* CGatewayPub::RevokeCertDecode(const char* reply, int* status) {
-  return DecodeCert(*this, "RevokeCertDecode", reply, status);
+  return DecodeCert(*this, LOG_TEXT("RevokeCertDecode"), reply, status);
 }
 
 char* CGatewayPub::GetCertDecode(const char* reply, int* status) {
-  return DecodeCert(*this, "GetCertDecode", reply, status);
+  return DecodeCert(*this, LOG_TEXT("GetCertDecode"), reply, status);
 }
 
 char* CGatewayPub::GetCertStatusDecode(const char* reply, int* status) {
-  return DecodeCert(*this, "GetCertStatusDecode", reply, status);
+  return DecodeCert(*this, LOG_TEXT("GetCertStatusDecode"), reply, status);
 }
 
 char* CGatewayPub::InstallCertOKDecode(const char* reply, int* status) {
-  return DecodeCert(*this, "InstallCertOKDecode", reply, status);
+  return DecodeCert(*this, LOG_TEXT("InstallCertOKDecode"), reply, status);
 }
 
 // Logs under the name of the status reply.
 char* CGatewayPub::OpenCertDecode(const char* reply, int* status) {
-  return DecodeCert(*this, "GetCertStatusDecode", reply, status);
+  return DecodeCert(*this, LOG_TEXT("GetCertStatusDecode"), reply, status);
 }
 
 char* CGatewayPub::RegisterCertDecode(const char* reply, int* status) {
-  return DecodeCert(*this, "RegisterCertDecode", reply, status);
+  return DecodeCert(*this, LOG_TEXT("RegisterCertDecode"), reply, status);
 }

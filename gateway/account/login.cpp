@@ -42,20 +42,6 @@ constexpr TagRow kRows[] = {{kSequence, "67", 20},
 // The end mark is above 900000 here, and a record without content ends the list too.
 constexpr CListTable kTags(kRows, {200, true, 900001});
 
-void LogText(const char* label, std::string_view text) {
-  char scratch[kNotice.bound + 20];
-  CTextWriter line(scratch, sizeof scratch);
-  line.Append(WIRE("%s%s"), label, text);
-  debuglog(line.Text());
-}
-
-void LogStatus(int status) {
-  char scratch[32];
-  CTextWriter line(scratch, sizeof scratch);
-  line.Append(WIRE("[status]%d"), status);
-  debuglog(line.Text());
-}
-
 // An account shorter than 7 characters is shown with 7 digits.
 void AppendAccount(CResultText& list, std::string_view head, std::string_view tail) {
   char scratch[20];
@@ -87,7 +73,7 @@ int AppendAccountLines(CResultText& list, std::string_view reply) {
 // without accounts shows none.
 int AppendNotice(CResultText& list, std::string_view reply) {
   const std::string_view notice = ReadField(reply, kNotice);
-  LogText("[strResult2]", notice);
+  LogLine(WIRE("[strResult2]%s"), notice);
   if (notice.empty()) return 0;
   list.Append(WIRE("<M>@%s!"), notice);
   return 1;
@@ -104,14 +90,14 @@ char* EncodeFunction(CGatewayPub& gateway, const char* branch, const char* ident
 char* ListAccounts(CGatewayPub& gateway, std::string_view reply, bool login, int* status) {
   if (gateway.TransportFailed(reply, status)) return gateway.m_szBuffer;
   const std::string_view code = ReadField(reply, kReplyCode);
-  if (login) LogText("[strResult]", code);
+  if (login) LogLine(WIRE("[strResult]%s"), code);
   if (code != kDoneCode) return gateway.Fail(ReadField(reply, kRefusal), status);
   CResultText list({gateway.m_pData, gateway.m_nDataSize, gateway.m_nDataLen}, reply.size());
   int count = AppendAccountLines(list, reply);
   if (count == 0) return gateway.Answer("0!");
   if (login) count += AppendNotice(list, reply);
   char* const result = CGatewayPub::FinishList(list, count, status);
-  if (login) LogStatus(*status);
+  if (login) LogLine(WIRE("[status]%d"), *status);
   return result;
 }
 

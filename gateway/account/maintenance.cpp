@@ -7,6 +7,7 @@
 //   reply    |68=code|M2=refusal                               opening, password: result is empty
 //            |00=..|PN=balance|01=                             balance: result 1!@@@@balance@!
 #include "gateway/core/gateway_pub.h"
+#include "gateway/core/log.h"
 #include "gateway/core/messages.h"
 
 namespace {

@@ -70,11 +70,3 @@ bool CGatewayPub::TransportFailed(std::string_view reply, int* status) {
   Fail(TransportMessage(transport), status);
   return true;
 }
-
-void CGatewayPub::LogReply(const char* name, std::string_view reply) {
-  char scratch[64];
-  CTextWriter line(scratch, sizeof scratch);
-  line.Append(WIRE("%s: Len:%ld"), name, reply.size());
-  debuglog(line.Text());
-  debuglog(reply.data());
-}

@@ -231,9 +231,6 @@ class CGatewayPub {
   // it.
   bool TransportFailed(std::string_view reply, int* status);
 
-  // Logs "<name>: Len:<length>" and then the reply itself.
-  void LogReply(const char* name, std::string_view reply);
-
  private:
   // Reads the clock and reduces m_nSeqNo modulo 100.
   Stamp TakeStamp();

@@ -72,6 +72,8 @@ char CGatewayPub::RequestKind() const {
   return static_cast<uint32_t>(m_nMarket) <= 100 ? 'S' : 'F';
 }
 
+// On Android localtime_r reads the zone anew at each call, as localtime does; elsewhere a process
+// keeps the zone of its first call.
 Stamp CGatewayPub::TakeStamp() {
   const time_t now = time(nullptr);
   struct tm local;

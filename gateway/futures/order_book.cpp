@@ -220,13 +220,6 @@ void AppendStateAndQuantities(CResultText& list, const CRecord& record, const St
   list.Append(WIRE("@%d@%d"), filled, cancelled);
 }
 
-void LogNumber(std::string_view number) {
-  char scratch[kRecord];
-  CTextWriter line(scratch, sizeof scratch);
-  line.AppendText(number);
-  debuglog(line.Text());
-}
-
 // Appends the record; false when it is no kind of order.
 bool AppendOrder(CResultText& list, const CRecord& record, int32_t market, Standing& standing) {
   const std::string_view callPut = record.Text(kCallPut1);
@@ -281,7 +274,7 @@ char* CGatewayFut::QueryOrderDecode(const char* reply, int* status) {
     UpdateTimeInForce(record, standing);
     if (orders.Code() != kDoneCode) continue;
     UpdateQuantities(record, standing);
-    LogNumber(record.Text(kGatewayNumber));
+    LogLine(WIRE("%s"), record.Text(kGatewayNumber));
     if (!AppendOrder(list, record, m_nMarket, standing)) return Fail(kLegKindError, status);
     ++count;
   }

@@ -10,6 +10,7 @@
 #include <algorithm>
 
 #include "gateway/core/conversions.h"
+#include "gateway/core/log.h"
 #include "gateway/orders/order_state.h"
 #include "gateway/stock/gateway_stk.h"
 #include "gateway/stock/messages.h"

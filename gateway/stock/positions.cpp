@@ -10,6 +10,7 @@
 #include <new>
 
 #include "gateway/core/decimal.h"
+#include "gateway/core/log.h"
 #include "gateway/core/messages.h"
 #include "gateway/stock/gateway_stk.h"
 #include "gateway/stock/stock_list.h"

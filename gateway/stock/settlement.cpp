@@ -13,6 +13,7 @@
 
 #include "gateway/core/conversions.h"
 #include "gateway/core/decimal.h"
+#include "gateway/core/log.h"
 #include "gateway/stock/gateway_stk.h"
 #include "gateway/stock/messages.h"
 #include "gateway/stock/order_type_codes.h"
