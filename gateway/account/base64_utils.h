@@ -16,6 +16,14 @@ class CBase64Utils {
   CBase64Utils() = default;
   ~CBase64Utils() = default;
 
+  // Number of characters of the text of `length` bytes, without a terminator.
+  static size_t EncodedSize(size_t length);
+
+  // Writes those EncodedSize(length) characters to `out`, without a terminator.
+  static void EncodeTo(const char* data, size_t length, char* out);
+
+  // What the class offers beside; no operation calls it.
+
   // The terminated text of the first `length` bytes at `data`; a negative length counts as 0.
   // Reads nothing beyond them.
   char* Encode(const char* data, int length);
@@ -29,12 +37,6 @@ class CBase64Utils {
   // flag; 'r' is taken for one of them. One that stands last is not skipped but read as 43, as is
   // the place behind the text when nothing else is left. Reads nothing beyond the text.
   char* Decode(const char* text, int* length);
-
-  // Number of characters of the text of `length` bytes, without a terminator.
-  static size_t EncodedSize(size_t length);
-
-  // Writes those EncodedSize(length) characters to `out`, without a terminator.
-  static void EncodeTo(const char* data, size_t length, char* out);
 
   int32_t m_nError = 0;  // 1 once Decode skipped a foreign character
 };

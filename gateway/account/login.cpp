@@ -92,7 +92,7 @@ char* ListAccounts(CGatewayPub& gateway, std::string_view reply, bool login, int
   const std::string_view code = ReadField(reply, kReplyCode);
   if (login) LogLine(WIRE("[strResult]%s"), code);
   if (code != kDoneCode) return gateway.Fail(ReadField(reply, kRefusal), status);
-  CResultText list({gateway.m_pData, gateway.m_nDataSize, gateway.m_nDataLen}, reply.size());
+  CResultText list(gateway.DataText(), reply.size());
   int count = AppendAccountLines(list, reply);
   if (count == 0) return gateway.Answer("0!");
   if (login) count += AppendNotice(list, reply);

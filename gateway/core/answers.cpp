@@ -58,7 +58,7 @@ char* CGatewayPub::FinishList(CResultText& records, int count, int* status) {
 }
 
 char* CGatewayPub::RenewResult(size_t length, int* status) {
-  char* const room = RenewHeapText({m_pData, m_nDataSize, m_nDataLen}, length);
+  char* const room = RenewHeapText(DataText(), length);
   if (room == nullptr) *status = -1;
   return room;
 }

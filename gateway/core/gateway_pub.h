@@ -36,88 +36,18 @@ class CGatewayPub {
   // The device's address in text form: at most 64 characters are kept. Null clears the field.
   void setLocalIP(const char* ip);
 
-  // Appends the header of a query to the terminated text in `out`, a buffer of kBufferSize bytes.
-  // `identity` is the user's ID number and account joined by '&', in either order, one of them
-  // optional. Returns 1, or 0 with a "[CLIENT]" message alone in `out`.
-  int initQueryHead(const char* branch, const char* identity, const char* password, char* out);
-
-  // Append the header of an order likewise. `function` is 'I' (new), 'D' (cancel), 'C' (change) or
-  // a futures function letter; `rocDate` a date such as 1130115 or empty. `orderKey`, a buffer of
-  // kBufferSize bytes, receives the text that opens the order's signature payload; it stays as it
-  // was where the device's address is missing.
-  int initOrderHead(char function, const char* branch, const char* identity, const char* password,
-                    const char* rocDate, char* out, char* orderKey);
-  int initOrderHead1(char function, const char* branch, const char* identity, const char* password,
-                     const char* rocDate, char* out, char* orderKey);
-  int initOrderHead2(char function, const char* branch, const char* identity, const char* password,
-                     char* out);
-
   // Splits an identity field at its first '&'. A part of 1 to size - 1 characters is copied with a
   // terminator; any other leaves its buffer (which may be null) as it was. Returns 0 when `field`
   // is null or has no '&', else 1.
   int SeparateDataFromUiField(const char* field, char* first, int firstSize, char* second,
                               int secondSize);
 
-  // Copies the value of the first field `tag` of `reply` into `out` (cleared before, `outSize`
-  // bytes) if it fits with its terminator. `skipBlank` passes over empty and single-blank values
-  // that a '|' closes. Returns the value's length, 0 when there is none, even if it did not fit. A
-  // null reply or tag finds nothing.
-  int GetToken(const char* tag, const char* reply, char* out, int outSize, bool skipBlank);
-
-  // Copies the next record, from "|00=" to before "|01=", into `out` (cleared before) if it fits,
-  // and moves `pos` behind that last bar; moves `pos` to the end when no complete record is left.
-  void GetSubString(const char* reply, int& pos, char* out, int outSize);
-
-  // Copies the text from `*cursor` to before `separator` into `out` (not cleared before; may be
-  // null) if it fits and is not empty, and moves `*cursor` behind the separator, or to the end of
-  // the text when there is none and `out` is not null. An empty separator is forbidden: the cursor
-  // would stand still.
-  void GetFieldString(char** cursor, const char* separator, char* out, int outSize);
-
-  // Sets `*status` to -1 and `message` (cleared before) to what to tell the user when the reply is
-  // a transport failure; leaves `*status` alone otherwise.
-  void CheckError(const char* reply, int* status, char* message, int messageSize);
-
-  // Puts "[GATEWAY]" before a message that names no source; `message` has room for 9 more bytes.
-  void MakeErrorMsg(char* message);
-
-  // Joins `data` to the end of the text in m_pData and adds `length`, its length, to m_nDataLen;
-  // `reset` empties both first. A wrong length is booked as it is told, the text is joined whole
-  // all the same. Grows by what is needed plus 4096 zeroed bytes where the text would reach the
-  // capacity; when memory runs out the text stays as it was. Null, an empty text and a length of 0
-  // do nothing. `data` must not lie in m_pData, which may move.
-  void AppendData(const char* data, int length, bool reset);
-
   // As the free function of the same name.
   void debuglog(const char* text);
 
-  // Dates, between the Republic of China calendar (year - 1911) and the western one, and prices,
-  // between decimal text and integers scaled by 10^decimals.
-
-  // Converts in place, by length: 1130115 and 990115 become western, 20240115 becomes 1130115; any
-  // other text, and one whose number is 0, stays. `date` has room for at least 10 bytes: a year
-  // before 912 becomes a negative one of four digits.
-  void TransDate(char* date);
-
-  // 1130115 to 20240115; 0 stays 0.
-  int RocDateToStandardDate(int rocDate);
-  int RocDateToStandardDate(const char* rocDate);
-
-  // Writes 12345 with 2 decimals as "123.45" into `out` of `outSize` bytes; -150 becomes "-1.-50".
-  // A text that does not fit leaves `out` empty.
+  // Writes a price, an integer scaled by 10^decimals: 12345 with 2 decimals as "123.45", -150 as
+  // "-1.-50", into `out` of `outSize` bytes. A text that does not fit leaves `out` empty.
   void SetPriceString(int value, int decimals, char* out, int outSize);
-
-  // Reads "12.5" with 2 decimals as 1250; further decimals are cut. GetPriceString2 is for amounts
-  // above 32 bits and reads no leading '-' of its own.
-  int32_t GetPriceString(const char* text, int decimals);
-  int64_t GetPriceString2(const char* text, int decimals);
-
-  // Appends `src` to `dst`, zero-filled and three times as long, with every blank as "%20". The two
-  // must not overlap: `src` would be overwritten unread, and never end.
-  void fctRep(const char* src, char* dst);
-
-  // Replaces every `from` in `text` by `to`, both characters; a `to` of 0 cuts the text.
-  void StringReplaceAll(char* text, int from, int to);
 
   // Login and the list of the user's accounts.
   char* AuthEncode(const char* branch, const char* identity, const char* password, int* status);
@@ -172,6 +102,77 @@ class CGatewayPub {
   char* OpenCertDecode(const char* reply, int* status);
   char* RegisterCertDecode(const char* reply, int* status);
 
+  // What the class offers beside its operations, none of which calls it: headers, tokenizers, dates
+  // and prices in the caller's buffers, by the rules that the operations go by.
+
+  // Appends the header of a query to the terminated text in `out`, a buffer of kBufferSize bytes.
+  // `identity` is the user's ID number and account joined by '&', in either order, one of them
+  // optional. Returns 1, or 0 with a "[CLIENT]" message alone in `out`.
+  int initQueryHead(const char* branch, const char* identity, const char* password, char* out);
+
+  // Append the header of an order likewise. `function` is 'I' (new), 'D' (cancel), 'C' (change) or
+  // a futures function letter; `rocDate` a date such as 1130115 or empty. `orderKey`, a buffer of
+  // kBufferSize bytes, receives the text that opens the order's signature payload; it stays as it
+  // was where the device's address is missing.
+  int initOrderHead(char function, const char* branch, const char* identity, const char* password,
+                    const char* rocDate, char* out, char* orderKey);
+  int initOrderHead1(char function, const char* branch, const char* identity, const char* password,
+                     const char* rocDate, char* out, char* orderKey);
+  int initOrderHead2(char function, const char* branch, const char* identity, const char* password,
+                     char* out);
+
+  // Copies the value of the first field `tag` of `reply` into `out` (cleared before, `outSize`
+  // bytes) if it fits with its terminator. `skipBlank` passes over empty and single-blank values
+  // that a '|' closes. Returns the value's length, 0 when there is none, even if it did not fit. A
+  // null reply or tag finds nothing.
+  int GetToken(const char* tag, const char* reply, char* out, int outSize, bool skipBlank);
+
+  // Copies the next record, from "|00=" to before "|01=", into `out` (cleared before) if it fits,
+  // and moves `pos` behind that last bar; moves `pos` to the end when no complete record is left.
+  void GetSubString(const char* reply, int& pos, char* out, int outSize);
+
+  // Copies the text from `*cursor` to before `separator` into `out` (not cleared before; may be
+  // null) if it fits and is not empty, and moves `*cursor` behind the separator, or to the end of
+  // the text when there is none and `out` is not null. An empty separator is forbidden: the cursor
+  // would stand still.
+  void GetFieldString(char** cursor, const char* separator, char* out, int outSize);
+
+  // Sets `*status` to -1 and `message` (cleared before) to what to tell the user when the reply is
+  // a transport failure; leaves `*status` alone otherwise.
+  void CheckError(const char* reply, int* status, char* message, int messageSize);
+
+  // Puts "[GATEWAY]" before a message that names no source; `message` has room for 9 more bytes.
+  void MakeErrorMsg(char* message);
+
+  // Joins `data` to the end of the text in m_pData and adds `length`, its length, to m_nDataLen;
+  // `reset` empties both first. A wrong length is booked as it is told, the text is joined whole
+  // all the same. Grows by what is needed plus 4096 zeroed bytes where the text would reach the
+  // capacity; when memory runs out the text stays as it was. Null, an empty text and a length of 0
+  // do nothing. `data` must not lie in m_pData, which may move.
+  void AppendData(const char* data, int length, bool reset);
+
+  // Converts a date between the Republic of China calendar (year - 1911) and the western one, in
+  // place and by length: 1130115 and 990115 become western, 20240115 becomes 1130115; any other
+  // text, and one whose number is 0, stays. `date` has room for at least 10 bytes: a year before
+  // 912 becomes a negative one of four digits.
+  void TransDate(char* date);
+
+  // 1130115 to 20240115; 0 stays 0.
+  int RocDateToStandardDate(int rocDate);
+  int RocDateToStandardDate(const char* rocDate);
+
+  // Reads "12.5" with 2 decimals as 1250; further decimals are cut. GetPriceString2 is for amounts
+  // above 32 bits and reads no leading '-' of its own.
+  int32_t GetPriceString(const char* text, int decimals);
+  int64_t GetPriceString2(const char* text, int decimals);
+
+  // Appends `src` to `dst`, zero-filled and three times as long, with every blank as "%20". The two
+  // must not overlap: `src` would be overwritten unread, and never end.
+  void fctRep(const char* src, char* dst);
+
+  // Replaces every `from` in `text` by `to`, both characters; a `to` of 0 cuts the text.
+  void StringReplaceAll(char* text, int from, int to);
+
   int32_t m_nDataSize;  // capacity of m_pData
   int32_t m_nDataLen;   // characters in m_pData
   char m_szBuffer[kBufferSize];
@@ -183,6 +184,9 @@ class CGatewayPub {
   char m_szLocalIP[kLocalIPSize];    // no terminator when full
 
   // What operations are made of.
+
+  // m_pData, as what writes long results takes it.
+  HeapText DataText() { return {m_pData, m_nDataSize, m_nDataLen}; }
 
   // An empty request or short result in m_szBuffer.
   CTextWriter StartRequest() { return CTextWriter(m_szBuffer, sizeof m_szBuffer); }

@@ -64,5 +64,5 @@ void CGatewayPub::MakeErrorMsg(char* message) {
 }
 
 void CGatewayPub::AppendData(const char* data, int length, bool reset) {
-  AppendHeapText({m_pData, m_nDataSize, m_nDataLen}, data, length, reset);
+  AppendHeapText(DataText(), data, length, reset);
 }

@@ -6,14 +6,12 @@
 //            @ 44&50 !
 #include "gateway/core/conversions.h"
 #include "gateway/core/messages.h"
+#include "gateway/futures/futures_list.h"
 #include "gateway/futures/gateway_fut.h"
 #include "gateway/futures/leg_code.h"
 #include "gateway/futures/messages.h"
-#include "gateway/futures/reply_code.h"
 
 namespace {
-
-constexpr int kPriceDecimals = 4;
 
 // Of the fields that are named by their tags no more is known than where the result shows them.
 enum Field {
@@ -70,10 +68,6 @@ constexpr TagRow kRows[] = {{kSequence, "67", kRecord},
                             {kOrderDate, "44", 16}};
 constexpr CListTable kTags(kRows, kFuturesList);
 
-int32_t Price(const CRecord& record, int field) {
-  return ScalePrice(record.Text(field), kPriceDecimals);
-}
-
 // A leg whose side is neither buying nor selling has no code; an unusual W3 is taken as none.
 void AppendLegCodes(CResultText& list, const CRecord& record) {
   const LegPair* const known = FindLegPair(record.Text(kFlagW3));
@@ -92,10 +86,11 @@ void AppendContract(CResultText& list, const CRecord& record) {
   const std::string_view callPut = record.Text(kCallPut1);
   if (record.Has(kCommodity2)) {
     list.Append(WIRE("TAIMEX&X&%s&%s|%s&%s|%s&%ld|%ld"), commodity, month, record.Text(kMonth2),
-                callPut, record.Text(kCallPut2), Price(record, kStrike1), Price(record, kStrike2));
+                callPut, record.Text(kCallPut2), PriceOf(record, kStrike1),
+                PriceOf(record, kStrike2));
   } else {
     list.Append(WIRE("TAIMEX&%s&%s&%s&%s&%ld"), IsBlank(callPut) ? "F" : "O", commodity, month,
-                callPut, Price(record, kStrike1));
+                callPut, PriceOf(record, kStrike1));
   }
 }
 
@@ -108,7 +103,7 @@ void AppendFill(CResultText& list, const CRecord& record) {
   list.AppendChar('@');
   AppendContract(list, record);
   list.Append(WIRE("@%d&%d@%ld&%ld@@@%s&%s@%c@%s&%s!"), remaining, record.Number(kFilledQuantity),
-              Price(record, kPrice), Price(record, kPrice48), record.Text(kEntryTime),
+              PriceOf(record, kPrice), PriceOf(record, kPrice48), record.Text(kEntryTime),
               FirstSix(record.Text(kTime51)), mt.empty() ? ' ' : mt.front(),
               record.Text(kOrderDate), record.Text(kDate50));
 }
@@ -120,8 +115,8 @@ char* CGatewayFut::QueryReplyEncode(const char* branch, const char* identity, co
   for (const char* const text : {branch, identity, password, startDate, endDate}) {
     if (AsText(text).empty()) return Fail(kBadParameters, status);
   }
-  const int start = RocDateToStandardDate(startDate);
-  const int end = RocDateToStandardDate(endDate);
+  const int start = RocToWesternDate(AsText(startDate));
+  const int end = RocToWesternDate(AsText(endDate));
   if (start == 0 || end == 0) return Fail(kBadDateRange, status);
   CTextWriter line = StartQuery(branch, identity, password, status);
   if (*status != 1) return line.Text();
@@ -134,7 +129,7 @@ char* CGatewayFut::QueryReplyDecode(const char* reply, int* status) {
   if (char* const answer = AnswerWithoutRecords(text, "0!", status)) return answer;
 
   CReplyList fills(text, kTags);
-  CResultText list({m_pData, m_nDataSize, m_nDataLen}, text.size());
+  CResultText list(DataText(), text.size());
   int count = 0;
   for (; fills.NextData(); ++count) AppendFill(list, fills.Record());
   return FinishList(list, count, status);

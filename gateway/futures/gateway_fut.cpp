@@ -3,8 +3,8 @@
 
 #include "gateway/core/messages.h"
 #include "gateway/core/protocol.h"
+#include "gateway/futures/futures_list.h"
 #include "gateway/futures/messages.h"
-#include "gateway/futures/reply_code.h"
 
 CGatewayFut::CGatewayFut()
     : m_nFutDataSize(0),

@@ -52,24 +52,6 @@ class CGatewayFut : public CGatewayPub {
                            char function, char w3, char timeInForce, char unusedLetter, char side1,
                            char side2, int quantity, int unusedNumber, int price, int* status);
 
-  // Append the order's own tags to the terminated text in `body`, a buffer of kBodySize bytes, and
-  // turn the order key in `signature`, a buffer of kBufferSize bytes, into the signature payload.
-  // Return 1, or 0 with the parameter error alone in `body`.
-  int EncodeSubmitOrderRecord(const char* reference, const char* orderDate, const char* commodity1,
-                              const char* commodity2, const char* month1, const char* month2,
-                              const char* strike1, const char* strike2, const char* callPut1,
-                              const char* callPut2, char n6, char orderKind, char priceType,
-                              char function, char w3, char timeInForce, char unusedLetter,
-                              char side1, char side2, int quantity, int unusedNumber, int price,
-                              char* body, char* signature);
-  int EncodeSubmitOrderRecord1(const char* reference, const char* orderDate, const char* commodity1,
-                               const char* commodity2, const char* month1, const char* month2,
-                               const char* strike1, const char* strike2, const char* callPut1,
-                               const char* callPut2, char n6, char orderKind, char priceType,
-                               char function, char w3, char timeInForce, char unusedLetter,
-                               char side1, char side2, int quantity, int unusedNumber, int price,
-                               char* body, char* signature);
-
   // The gateway's answer to an order: "number@date@@accepted@flag@!", or its message with status
   // -1. An empty reply means that the order is under way: status 1.
   char* SubmitOrderDecode(const char* reply, int* status);
@@ -95,6 +77,26 @@ class CGatewayFut : public CGatewayPub {
   char* QueryFinanceEncode(const char* branch, const char* identity, const char* password,
                            int queryType, int* status);
   char* QueryFinanceDecode(const char* reply, int* status);
+
+  // What the class offers beside its operations, none of which calls it.
+
+  // Append the order's own tags to the terminated text in `body`, a buffer of kBodySize bytes, and
+  // turn the order key in `signature`, a buffer of kBufferSize bytes, into the signature payload.
+  // Return 1, or 0 with the parameter error alone in `body`.
+  int EncodeSubmitOrderRecord(const char* reference, const char* orderDate, const char* commodity1,
+                              const char* commodity2, const char* month1, const char* month2,
+                              const char* strike1, const char* strike2, const char* callPut1,
+                              const char* callPut2, char n6, char orderKind, char priceType,
+                              char function, char w3, char timeInForce, char unusedLetter,
+                              char side1, char side2, int quantity, int unusedNumber, int price,
+                              char* body, char* signature);
+  int EncodeSubmitOrderRecord1(const char* reference, const char* orderDate, const char* commodity1,
+                               const char* commodity2, const char* month1, const char* month2,
+                               const char* strike1, const char* strike2, const char* callPut1,
+                               const char* callPut2, char n6, char orderKind, char priceType,
+                               char function, char w3, char timeInForce, char unusedLetter,
+                               char side1, char side2, int quantity, int unusedNumber, int price,
+                               char* body, char* signature);
 
   // Writes what a reply or record says of itself into `out` (cleared before, `size` bytes): "0000",
   // "5001" (no data), else "message(code)"; nothing when that does not fit. Returns `out`.

@@ -11,16 +11,14 @@
 #include "gateway/core/conversions.h"
 #include "gateway/core/log.h"
 #include "gateway/core/messages.h"
+#include "gateway/futures/futures_list.h"
 #include "gateway/futures/gateway_fut.h"
 #include "gateway/futures/leg_code.h"
 #include "gateway/futures/messages.h"
-#include "gateway/futures/reply_code.h"
 #include "gateway/orders/messages.h"
 #include "gateway/orders/order_state.h"
 
 namespace {
-
-constexpr int kPriceDecimals = 4;
 
 enum Field {
   kFillOrKill = kOwnFields,
@@ -162,14 +160,13 @@ bool StrikesInTenths(std::string_view commodity) {
 }
 
 void AppendStrikes(CResultText& list, const CRecord& record) {
-  const int32_t strike1 = ScalePrice(record.Text(kStrike1), kPriceDecimals);
-  const std::string_view second = record.Text(kStrike2);
-  if (IsBlank(second)) {
+  const int32_t strike1 = PriceOf(record, kStrike1);
+  if (IsBlank(record.Text(kStrike2))) {
     list.Append(WIRE("%d"), strike1);
     return;
   }
   const int unit = StrikesInTenths(record.Text(kCommodity1)) ? 10 : 1;
-  list.Append(WIRE("%ld|%ld"), strike1 / unit, ScalePrice(second, kPriceDecimals) / unit);
+  list.Append(WIRE("%ld|%ld"), strike1 / unit, PriceOf(record, kStrike2) / unit);
 }
 
 // Futures spreads show their first commodity alone.
@@ -191,14 +188,8 @@ void AppendPrice(CResultText& list, const CRecord& record) {
   } else if (type == 3) {
     list.Append(WIRE("@%s"), kRangeMarketPrice);
   } else {
-    list.Append(WIRE("@%d"), ScalePrice(record.Text(kPrice), kPriceDecimals));
+    list.Append(WIRE("@%d"), PriceOf(record, kPrice));
   }
-}
-
-const char* JVFlag(std::string_view jv, bool hasMessage) {
-  if (jv == "N") return "2";
-  if (jv == "Y") return "1";
-  return hasMessage ? "2" : "";
 }
 
 // The order's state; only a failed order has a message, which keeps its '!' as the gateway sent it.
@@ -238,7 +229,7 @@ bool AppendOrder(CResultText& list, const CRecord& record, int32_t market, Stand
   list.Append(WIRE("@%s@%s@%s@%s"), FirstSix(record.Text(kEntryTime)), date.Text(),
               orderDate.Text(), record.Text(kHandlingFlag));
   const std::string_view mt = record.Text(kFlagMT);
-  list.Append(WIRE("@%s@%c"), JVFlag(record.Text(kChangeable), !message.empty()),
+  list.Append(WIRE("@%s@%c"), ChangeFlag(record.Text(kChangeable), !message.empty()),
               standing.timeInForce);
   list.Append(WIRE("@%s!"), mt.empty() ? " " : mt);
   return true;
@@ -266,7 +257,7 @@ char* CGatewayFut::QueryOrderDecode(const char* reply, int* status) {
   if (orders.Code().empty()) return Fail("", status);
   if (char* const answer = AnswerWithoutData(orders, "0!", status)) return answer;
 
-  CResultText list({m_pData, m_nDataSize, m_nDataLen}, text.size());
+  CResultText list(DataText(), text.size());
   Standing standing;
   int count = 0;
   while (orders.Next()) {

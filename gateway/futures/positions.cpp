@@ -8,13 +8,11 @@
 //   pair     32|EL @ TIMEX&X&33|V9&month|month&V8|W1&strike|strike @ R8 @ 48|W5 @ 50 !
 #include "gateway/core/conversions.h"
 #include "gateway/core/messages.h"
+#include "gateway/futures/futures_list.h"
 #include "gateway/futures/gateway_fut.h"
 #include "gateway/futures/messages.h"
-#include "gateway/futures/reply_code.h"
 
 namespace {
-
-constexpr int kPriceDecimals = 4;
 
 // A section is never longer than twice its reply: the shortest record, 16 characters, gives 19, and
 // a price gives less than its field.
@@ -48,35 +46,13 @@ constexpr TagRow kRows[] = {
     {kQuantityR8, "R8", kRecord}, {kDate50, "50", kRecord},     {kCurrency, "28", kRecord}};
 constexpr CListTable kTags(kRows, kFuturesList);
 
-// One record with its values read.
-struct Position {
-  explicit Position(const CRecord& record)
-      : commodity1(record.Text(kCommodity1)),
-        commodity2(record.Text(kCommodity2)),
-        month1(record.Text(kMonth1)),
-        month2(record.Text(kMonth2)),
-        callPut1(record.Text(kCallPut1)),
-        callPut2(record.Text(kCallPut2)),
-        side1(record.Text(kSide1)),
-        side2(record.Text(kSide2)),
-        w5(record.Text(kPriceW5)),
-        date50(record.Text(kDate50)),
-        currency(record.Text(kCurrency)),
-        strike1(ScalePrice(record.Text(kStrike1), kPriceDecimals)),
-        strike2(ScalePrice(record.Text(kStrike2), kPriceDecimals)),
-        price48(ScalePrice(record.Text(kPrice48), kPriceDecimals)),
-        priceW5(ScalePrice(w5, kPriceDecimals)),
-        quantityR8(record.Number(kQuantityR8)) {}
+bool IsOption(const CRecord& record) {
+  const std::string_view callPut = record.Text(kCallPut1);
+  return callPut == "P" || callPut == "C";
+}
 
-  bool IsOption() const { return callPut1 == "P" || callPut1 == "C"; }
-  bool HasTwoLegs() const { return !commodity2.empty(); }
-
-  std::string_view commodity1, commodity2, month1, month2, callPut1, callPut2, side1, side2, w5,
-      date50, currency;
-  int32_t strike1, strike2, price48, priceW5, quantityR8;
-};
-
-const char* CurrencyName(std::string_view code) {
+const char* CurrencyName(const CRecord& record) {
+  const std::string_view code = record.Text(kCurrency);
   switch (code.empty() ? '\0' : code.front()) {
     case '1':
       return "TWD";
@@ -90,32 +66,35 @@ const char* CurrencyName(std::string_view code) {
 }
 
 // Each month travels with "00" behind it.
-void AppendFutures(CResultText& list, const Position& position) {
-  const char* const currency = CurrencyName(position.currency);
-  if (position.HasTwoLegs()) {
-    list.Append(WIRE("%s|%s@TIMEX&Y&%s&%s00|%s00@%d@%ld|%ld@%s@%s!"), position.side1,
-                position.side2, position.commodity1, position.month1, position.month2,
-                position.quantityR8, position.price48, position.priceW5, position.date50, currency);
+void AppendFutures(CResultText& list, const CRecord& record) {
+  if (record.Has(kCommodity2)) {
+    list.Append(WIRE("%s|%s@TIMEX&Y&%s&%s00|%s00@%d@%ld|%ld@%s@%s!"), record.Text(kSide1),
+                record.Text(kSide2), record.Text(kCommodity1), record.Text(kMonth1),
+                record.Text(kMonth2), record.Number(kQuantityR8), PriceOf(record, kPrice48),
+                PriceOf(record, kPriceW5), record.Text(kDate50), CurrencyName(record));
   } else {
-    list.Append(WIRE("%s@TIMEX&F&%s&%s00@%d@%ld@%s@%s!"), position.side1, position.commodity1,
-                position.month1, position.quantityR8, position.price48, position.date50, currency);
+    list.Append(WIRE("%s@TIMEX&F&%s&%s00@%d@%ld@%s@%s!"), record.Text(kSide1),
+                record.Text(kCommodity1), record.Text(kMonth1), record.Number(kQuantityR8),
+                PriceOf(record, kPrice48), record.Text(kDate50), CurrencyName(record));
   }
 }
 
 // Options show no currency. A pair without W5 shows that field empty.
-void AppendOption(CResultText& list, const Position& position) {
-  if (!position.HasTwoLegs()) {
-    list.Append(WIRE("%s@TIMEX&O&%s&%s00&%s&%ld@%d@%ld@%s!"), position.side1, position.commodity1,
-                position.month1, position.callPut1, position.strike1, position.quantityR8,
-                position.price48, position.date50);
+void AppendOption(CResultText& list, const CRecord& record) {
+  if (!record.Has(kCommodity2)) {
+    list.Append(WIRE("%s@TIMEX&O&%s&%s00&%s&%ld@%d@%ld@%s!"), record.Text(kSide1),
+                record.Text(kCommodity1), record.Text(kMonth1), record.Text(kCallPut1),
+                PriceOf(record, kStrike1), record.Number(kQuantityR8), PriceOf(record, kPrice48),
+                record.Text(kDate50));
     return;
   }
-  list.Append(WIRE("%s|%s@TIMEX&X&%s|%s&%s00|%s00&%s|%s&%ld|%ld@%d@%ld|"), position.side1,
-              position.side2, position.commodity1, position.commodity2, position.month1,
-              position.month2, position.callPut1, position.callPut2, position.strike1,
-              position.strike2, position.quantityR8, position.price48);
-  if (!position.w5.empty()) list.Append(WIRE("%ld"), position.priceW5);
-  list.Append(WIRE("@%s!"), position.date50);
+  list.Append(WIRE("%s|%s@TIMEX&X&%s|%s&%s00|%s00&%s|%s&%ld|%ld@%d@%ld|"), record.Text(kSide1),
+              record.Text(kSide2), record.Text(kCommodity1), record.Text(kCommodity2),
+              record.Text(kMonth1), record.Text(kMonth2), record.Text(kCallPut1),
+              record.Text(kCallPut2), PriceOf(record, kStrike1), PriceOf(record, kStrike2),
+              record.Number(kQuantityR8), PriceOf(record, kPrice48));
+  if (record.Has(kPriceW5)) list.Append(WIRE("%ld"), PriceOf(record, kPriceW5));
+  list.Append(WIRE("@%s!"), record.Text(kDate50));
 }
 
 }  // namespace
@@ -142,12 +121,12 @@ char* CGatewayFut::QueryInventoryDecode(const char* reply, int* status) {
   int futuresCount = 0;
   int optionsCount = 0;
   while (positions.NextData()) {
-    const Position position(positions.Record());
-    if (position.IsOption()) {
-      AppendOption(options, position);
+    const CRecord& record = positions.Record();
+    if (IsOption(record)) {
+      AppendOption(options, record);
       ++optionsCount;
     } else {
-      AppendFutures(futures, position);
+      AppendFutures(futures, record);
       ++futuresCount;
     }
   }

@@ -23,6 +23,12 @@ inline bool IsFailed(std::string_view state) {
 }
 
 // The text of the state, for the user.
-std::string_view OrderStateText(const OrderState& state);
+std::string_view OrderStateText(const OrderState& order);
+
+// How a list shows tag JV: Y, N, and N for an order with a message where there is neither.
+inline const char* ChangeFlag(std::string_view changeable, bool hasMessage) {
+  if (changeable == "Y") return "1";
+  return changeable == "N" || hasMessage ? "2" : "";
+}
 
 #endif  // QUORVANE_GATEWAY_ORDERS_ORDER_STATE_H_

@@ -66,7 +66,7 @@ char* CGatewayStk::QueryReplyDecode(const char* reply, int* status) {
   if (TransportFailed(text, status)) return m_szBuffer;
   CReplyList fills(text, kTags);
   if (char* const answer = AnswerWithoutData(fills, "0!", status)) return answer;
-  CResultText list({m_pData, m_nDataSize, m_nDataLen}, text.size());
+  CResultText list(DataText(), text.size());
   int count = 0;
   while (fills.NextData()) {
     const CRecord& record = fills.Record();

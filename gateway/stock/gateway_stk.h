@@ -94,13 +94,6 @@ class CGatewayStk : public CGatewayPub {
  private:
   // The one road of the encoders that have a status.
   char* EncodeOrder(const OrderForm& form, const StockOrder& order, int* status);
-
-  // What differs between the brokerages' layouts of positions and of settlement, and the lists.
-  struct PositionLayout;
-  struct PaymentLayout;
-  char* ListPositions(const char* reply, const PositionLayout& layout, int* status);
-  static bool AppendPayment(CResultText& list, const CRecord& record, const PaymentLayout& layout);
-  char* ListPayments(const char* reply, const PaymentLayout& layout, int* status);
 };
 
 #endif  // QUORVANE_GATEWAY_STOCK_GATEWAY_STK_H_

@@ -68,24 +68,14 @@ int TypeCodeOf(const CRecord& record) {
                        record.Text(kSide) == "B", kOrderTypeRows, kLiveOrderTypeRows, kBookRows);
 }
 
-// What the gateway says of a failed order, with no '!' that would end the record; empty for any
-// other order.
-class CFailure {
- public:
-  explicit CFailure(const CRecord& record) : m_bFailed(IsFailed(record.Text(kOrderState))) {
-    if (!m_bFailed) return;
-    m_nLength = record.Text(kGatewayText).copy(m_szText, sizeof m_szText);
-    std::replace(m_szText, m_szText + m_nLength, '!', ' ');
-  }
+constexpr size_t kTextSize = kRows[kGatewayText].bound;
 
-  bool Failed() const { return m_bFailed; }
-  std::string_view Text() const { return {m_szText, m_nLength}; }
-
- private:
-  bool m_bFailed;
-  size_t m_nLength = 0;
-  char m_szText[kRows[kGatewayText].bound];
-};
+// The gateway's text with no '!' that would end the record.
+std::string_view WithoutMarks(std::string_view text, char (&scratch)[kTextSize]) {
+  const size_t length = text.copy(scratch, kTextSize);
+  std::replace(scratch, scratch + length, '!', ' ');
+  return {scratch, length};
+}
 
 void AppendFailure(CResultText& list, std::string_view text, int market) {
   if (market == kWaitingMarket && text == kWaitingText) return list.AppendText(kWaitingState);
@@ -107,13 +97,6 @@ void AppendPrice(CResultText& list, const CRecord& record) {
   }
 }
 
-// 1: the order can be changed, 2: it cannot, empty: nothing is known.
-std::string_view ChangeFlagOf(const CRecord& record, const CFailure& failure) {
-  const std::string_view flag = record.Text(kChangeable);
-  if (flag == "Y") return "1";
-  return flag == "N" || !failure.Text().empty() ? "2" : "";
-}
-
 void AppendOrder(CResultText& list, const CRecord& record, int typeCode, int market) {
   const OrderState order = {record.Number(kOrderedQuantity),
                             WrapAdd(record.Number(kReduced37), record.Number(kCancelled41)),
@@ -123,11 +106,14 @@ void AppendOrder(CResultText& list, const CRecord& record, int typeCode, int mar
                             record.Text(kHandlingFlag),
                             record.Text(kGatewayText),
                             market};
-  const CFailure failure(record);
+  const bool failed = IsFailed(order.state);
+  char scratch[kTextSize];
+  const std::string_view message =
+      failed ? WithoutMarks(order.gatewayText, scratch) : std::string_view();
   list.Append(WIRE("%s@%s@%d@%s@%d@"), record.Text(kGatewayNumber), record.Text(kOrderNumber),
               typeCode, record.Text(kStockCode), order.quantity);
-  if (failure.Failed()) {
-    AppendFailure(list, failure.Text(), market);
+  if (failed) {
+    AppendFailure(list, message, market);
   } else {
     list.AppendText(OrderStateText(order));
   }
@@ -136,7 +122,7 @@ void AppendOrder(CResultText& list, const CRecord& record, int typeCode, int mar
   list.Append(WIRE("@%s@%s@%s@%s@%s!"), FirstSix(record.Text(kEntryTime)),
               CTransDate(record.Text(kEntryDate)).Text(),
               CTransDate(record.Text(kOrderDate)).Text(), order.handlingFlag,
-              ChangeFlagOf(record, failure));
+              ChangeFlag(record.Text(kChangeable), !message.empty()));
 }
 
 }  // namespace
@@ -156,7 +142,7 @@ char* CGatewayStk::QueryOrderDecode(const char* reply, int* status) {
   if (TransportFailed(text, status)) return m_szBuffer;
   CReplyList orders(text, kTags);
   if (char* const answer = AnswerWithoutData(orders, "0!", status)) return answer;
-  CResultText list({m_pData, m_nDataSize, m_nDataLen}, text.size());
+  CResultText list(DataText(), text.size());
   int count = 0;
   for (; orders.NextData(); ++count) {
     const int typeCode = TypeCodeOf(orders.Record());

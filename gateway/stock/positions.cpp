@@ -116,13 +116,39 @@ struct ScratchBlock {
   char* const data;
 };
 
-}  // namespace
-
 // What tells the two brokerages' replies apart.
-struct CGatewayStk::PositionLayout {
+struct PositionLayout {
   SectionShapes sections;
   const char* noData;
 };
+
+// Both layouts log under one name.
+char* ListPositions(CGatewayStk& gateway, const char* reply, const PositionLayout& layout,
+                    int* status) {
+  const std::string_view text = AsText(reply);
+  LogReply("QueryInventoryDecode", text);
+  if (gateway.TransportFailed(text, status)) return gateway.m_szBuffer;
+  CReplyList positions(text, kTags);
+  if (char* const answer = gateway.AnswerWithoutData(positions, layout.noData, status))
+    return answer;
+
+  const ScratchBlock scratch(kMaxSections, text.size());
+  if (scratch.data == nullptr) {
+    *status = -1;
+    return nullptr;
+  }
+  CSections sections(scratch.data, text.size());
+  while (positions.NextData()) sections.Add(layout.sections, positions.Record());
+
+  const size_t length = sections.Length(layout.sections);
+  char* const room = gateway.RenewResult(length, status);
+  if (room == nullptr) return nullptr;
+  CTextWriter result(room, length + 1);
+  sections.WriteTo(result, layout.sections);
+  return result.Text();
+}
+
+}  // namespace
 
 char* CGatewayStk::QueryInventoryEncode(const char* branch, const char* identity,
                                         const char* password, int* status) {
@@ -138,7 +164,7 @@ char* CGatewayStk::QueryInventoryDecode(const char* reply, int* status) {
                                               {2, {kQuantity77, kQuantity771}, "@@@@!"},
                                               {1, {kQuantityPS}, "|0|0!"}},
                                              "<0>!0!<1>!0!<2>!0!<3>!0!"};
-  return ListPositions(reply, kLayout, status);
+  return ListPositions(*this, reply, kLayout, status);
 }
 
 char* CGatewayStk::QueryInventoryDecodeJZG(const char* reply, int* status) {
@@ -147,29 +173,5 @@ char* CGatewayStk::QueryInventoryDecodeJZG(const char* reply, int* status) {
        {3, {kQuantity76, kQuantity761, kQuantity762}, "@@@@@!"},
        {3, {kQuantity77, kQuantity771, kQuantity772}, "@@@@!"}},
       "<0>!0!<1>!0!<2>!0!"};
-  return ListPositions(reply, kLayout, status);
-}
-
-// Both layouts log under one name.
-char* CGatewayStk::ListPositions(const char* reply, const PositionLayout& layout, int* status) {
-  const std::string_view text = AsText(reply);
-  LogReply("QueryInventoryDecode", text);
-  if (TransportFailed(text, status)) return m_szBuffer;
-  CReplyList positions(text, kTags);
-  if (char* const answer = AnswerWithoutData(positions, layout.noData, status)) return answer;
-
-  const ScratchBlock scratch(kMaxSections, text.size());
-  if (scratch.data == nullptr) {
-    *status = -1;
-    return nullptr;
-  }
-  CSections sections(scratch.data, text.size());
-  while (positions.NextData()) sections.Add(layout.sections, positions.Record());
-
-  const size_t length = sections.Length(layout.sections);
-  char* const room = RenewResult(length, status);
-  if (room == nullptr) return nullptr;
-  CTextWriter result(room, length + 1);
-  sections.WriteTo(result, layout.sections);
-  return result.Text();
+  return ListPositions(*this, reply, kLayout, status);
 }

@@ -101,14 +101,54 @@ std::string_view TextOrZero(const CRecord& record, int field) {
   return record.Has(field) ? record.Text(field) : "0";
 }
 
-}  // namespace
-
 // What tells the two brokerages' replies apart.
-struct CGatewayStk::PaymentLayout {
+struct PaymentLayout {
   bool hasTypeText;  // KT is the type, else a code is made
   int selector;      // the field that selects the pair
   PairRow pairs[2];
 };
+
+// False when the record's type has no code. Between date and type stands an empty field; a sign
+// other than a minus is none.
+bool AppendPayment(CResultText& list, const CRecord& record, const PaymentLayout& layout) {
+  list.Append(WIRE("%s@@"), CTransDate(record.Text(kDate50)).Text());
+  if (layout.hasTypeText) {
+    list.AppendText(record.Text(kTypeText));
+  } else {
+    const int typeCode = TypeCodeOf(record);
+    if (typeCode == kNoOrderType) return false;
+    list.Append(WIRE("%d"), typeCode);
+  }
+  list.Append(WIRE("@%s@%s@%d@%s@%s@%s@%s@"), record.Text(kStockCode), record.Text(kQuantity47),
+              ScalePrice(record.Text(kPrice48), 2), record.Text(kAmount49), record.Text(kAmount79),
+              record.Text(kAmount78), record.Text(kAmount84));
+  AppendPair(list, record, layout.pairs, record.Number(layout.selector));
+  list.Append(WIRE("%s@%s@%s@%s@%s!"), TextOrZero(record, kAmount86), TextOrZero(record, kAmount89),
+              TextOrZero(record, kAmount88), record.Text(kSign) == "-" ? "-" : "",
+              record.Text(kAmount97));
+  return true;
+}
+
+// Both layouts log under one name.
+char* ListPayments(CGatewayStk& gateway, const char* reply, const PaymentLayout& layout,
+                   int* status) {
+  const std::string_view text = AsText(reply);
+  LogReply("PaymentDecode", text);
+  if (gateway.TransportFailed(text, status)) return gateway.m_szBuffer;
+  CReplyList payments(text, kTags);
+  if (char* const answer = gateway.AnswerWithoutData(payments, "0!", status)) return answer;
+  CResultText list(gateway.DataText(), text.size());
+  int count = 0;
+  while (payments.NextData()) {
+    const CRecord& record = payments.Record();
+    if (!record.Has(kStockCode)) continue;
+    if (!AppendPayment(list, record, layout)) return gateway.Fail(kOrderKindError, status);
+    ++count;
+  }
+  return CGatewayStk::FinishList(list, count, status);
+}
+
+}  // namespace
 
 char* CGatewayStk::PaymentEncode(const char* branch, const char* identity, const char* password,
                                  const char* period, const char* endDate, int* status) {
@@ -130,7 +170,7 @@ char* CGatewayStk::PaymentDecode(const char* reply, int* status) {
       false,
       kOrderKind,
       {{SetOf(1, 3), kAmount81, kAmount82}, {SetOf(2, 4), kAmount85, kAmount87}}};
-  return ListPayments(reply, kLayout, status);
+  return ListPayments(*this, reply, kLayout, status);
 }
 
 char* CGatewayStk::PaymentDecodeJZG(const char* reply, int* status) {
@@ -138,45 +178,5 @@ char* CGatewayStk::PaymentDecodeJZG(const char* reply, int* status) {
       true,
       kTypeText,
       {{SetOf(1, 12, 13), kAmount81, kAmount82}, {SetOf(2, 21, 22), kAmount85, kAmount87}}};
-  return ListPayments(reply, kLayout, status);
-}
-
-// False when the record's type has no code. Between date and type stands an empty field; a sign
-// other than a minus is none.
-bool CGatewayStk::AppendPayment(CResultText& list, const CRecord& record,
-                                const PaymentLayout& layout) {
-  list.Append(WIRE("%s@@"), CTransDate(record.Text(kDate50)).Text());
-  if (layout.hasTypeText) {
-    list.AppendText(record.Text(kTypeText));
-  } else {
-    const int typeCode = TypeCodeOf(record);
-    if (typeCode == kNoOrderType) return false;
-    list.Append(WIRE("%d"), typeCode);
-  }
-  list.Append(WIRE("@%s@%s@%d@%s@%s@%s@%s@"), record.Text(kStockCode), record.Text(kQuantity47),
-              ScalePrice(record.Text(kPrice48), 2), record.Text(kAmount49), record.Text(kAmount79),
-              record.Text(kAmount78), record.Text(kAmount84));
-  AppendPair(list, record, layout.pairs, record.Number(layout.selector));
-  list.Append(WIRE("%s@%s@%s@%s@%s!"), TextOrZero(record, kAmount86), TextOrZero(record, kAmount89),
-              TextOrZero(record, kAmount88), record.Text(kSign) == "-" ? "-" : "",
-              record.Text(kAmount97));
-  return true;
-}
-
-// Both layouts log under one name.
-char* CGatewayStk::ListPayments(const char* reply, const PaymentLayout& layout, int* status) {
-  const std::string_view text = AsText(reply);
-  LogReply("PaymentDecode", text);
-  if (TransportFailed(text, status)) return m_szBuffer;
-  CReplyList payments(text, kTags);
-  if (char* const answer = AnswerWithoutData(payments, "0!", status)) return answer;
-  CResultText list({m_pData, m_nDataSize, m_nDataLen}, text.size());
-  int count = 0;
-  while (payments.NextData()) {
-    const CRecord& record = payments.Record();
-    if (!record.Has(kStockCode)) continue;
-    if (!AppendPayment(list, record, layout)) return Fail(kOrderKindError, status);
-    ++count;
-  }
-  return FinishList(list, count, status);
+  return ListPayments(*this, reply, kLayout, status);
 }

@@ -1,10 +1,11 @@
-// What a fill or position reply, or one of its records, says of itself.
-#ifndef QUORVANE_GATEWAY_FUTURES_REPLY_CODE_H_
-#define QUORVANE_GATEWAY_FUTURES_REPLY_CODE_H_
+// What the lists of futures and options have in common.
+#ifndef QUORVANE_GATEWAY_FUTURES_FUTURES_LIST_H_
+#define QUORVANE_GATEWAY_FUTURES_FUTURES_LIST_H_
 
 #include <cstddef>
 #include <string_view>
 
+#include "gateway/core/conversions.h"
 #include "gateway/core/list_frame.h"
 #include "gateway/core/text_writer.h"
 
@@ -17,6 +18,11 @@ inline constexpr ListShape kFuturesList = {kRecord, true};
 // What the reply as a whole says; a record's own code and message have the same bounds.
 inline constexpr ReplyField kReplyCode = {"68", 8};
 inline constexpr ReplyField kRefusal = {"M2", 512};
+
+// A price or strike of a record, with four implied decimals.
+inline int32_t PriceOf(const CRecord& record, int field) {
+  return ScalePrice(record.Text(field), 4);
+}
 
 inline std::string_view ReplyCode(std::string_view reply) {
   return ReadField(reply, kReplyCode);
@@ -32,4 +38,4 @@ inline void WriteReplyCode(std::string_view code, std::string_view reply, CTextW
   }
 }
 
-#endif  // QUORVANE_GATEWAY_FUTURES_REPLY_CODE_H_
+#endif  // QUORVANE_GATEWAY_FUTURES_FUTURES_LIST_H_
