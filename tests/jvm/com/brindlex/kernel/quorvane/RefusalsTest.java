@@ -3,7 +3,7 @@ package com.brindlex.kernel.quorvane;
 import static org.junit.jupiter.api.Assertions.assertEquals;
 
 import com.brindlex.kernel.quorvane.console.Refusals;
-import com.brindlex.kernel.quorvane.typed.Operation;
+import com.brindlex.kernel.quorvane.client.Operation;
 import java.io.IOException;
 import java.nio.file.Path;
 import java.util.ArrayList;

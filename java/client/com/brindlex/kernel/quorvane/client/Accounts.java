@@ -21,7 +21,7 @@ public final class Accounts extends Rows<Account> {
     }
 
     /** Where the notice begins: it is the last of the records that are announced. */
-    private static int noticeAt(String result) {
+    static int noticeAt(String result) {
         int at = result.indexOf('!');
         String count = at < 0 ? "" : result.substring(0, at);
         int before = Numbers.isDigits(count) && count.length() < 10 ? Integer.parseInt(count) : 0;

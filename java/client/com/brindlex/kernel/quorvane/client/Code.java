@@ -45,10 +45,15 @@ public final class Code<E extends Enum<E> & Coded> {
         return value == other;
     }
 
+    /** Whether the code has a name. */
+    public boolean isKnown() {
+        return value.code().equals(code) && !code.isEmpty();
+    }
+
     /** The name of the value in English; the code itself when it has none. */
     @NotNull
     public String label() {
-        return value.code().equals(code) ? value.label() : code;
+        return isKnown() ? value.label() : code;
     }
 
     @Override

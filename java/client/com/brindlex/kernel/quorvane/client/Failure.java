@@ -28,8 +28,9 @@ public final class Failure {
         this.text = text;
     }
 
-    /** Takes the message of a decoder apart; its text may turn out empty. */
-    static Failure of(String message) {
+    /** A message as a decoder returns it, taken apart: its text is empty when it says nothing. */
+    @NotNull
+    public static Failure of(@NotNull String message) {
         for (Source source : Source.values()) {
             String mark = "[" + source + "]";
             if (source != Source.UNKNOWN && message.startsWith(mark)) {
@@ -69,7 +70,7 @@ public final class Failure {
         return code;
     }
 
-    /** What to tell the user, in Traditional Chinese; never empty. */
+    /** What to tell the user, in Traditional Chinese; never empty in a reply. */
     @NotNull
     public String text() {
         return text;

@@ -20,10 +20,12 @@ abstract class ReplyType<T> {
     }
 
     private final Operation decoder;
+    private final Layout layout;
     private final Judge judge;
 
-    ReplyType(Operation decoder, Judge judge) {
+    ReplyType(Operation decoder, Layout layout, Judge judge) {
         this.decoder = decoder;
+        this.layout = layout;
         this.judge = judge;
     }
 
@@ -34,7 +36,18 @@ abstract class ReplyType<T> {
         return decoder;
     }
 
+    Layout layout() {
+        return layout;
+    }
+
     Reply<T> read(Market market, String reply) {
+        int[] status = {0};
+        String text = Natives.decode(decoder, market.code(), reply, status);
+        return judge(reply, status[0], text);
+    }
+
+    /** What a reply means of which the decoder made this. */
+    Reply<T> judge(String reply, int status, String text) {
         if (judge == Judge.DECODER_OF_ORDERS && reply.isEmpty()) {
             return Reply.onItsWay();
         }
@@ -42,9 +55,7 @@ abstract class ReplyType<T> {
         if (failure != null) {
             return Reply.failure(failure);
         }
-        int[] status = {0};
-        String text = Natives.decode(decoder, market.code(), reply, status);
-        return status[0] == 1 ? Reply.result(result(text)) : Reply.<T>failure(told(text, reply));
+        return status == 1 ? Reply.result(result(text)) : Reply.<T>failure(told(text, reply));
     }
 
     /** The failure that a decoder tells; its code and speaker, too, where the reply has them. */

@@ -91,13 +91,17 @@ public abstract class Row<R extends Row<R>> {
         return bounds[2 * place];
     }
 
+    /** The value of a column, by its place; null when there is none that can be read. */
+    @Nullable
+    public final Object peek(int place) {
+        return shape.columns().get(place).form().peek(this, textAt(place));
+    }
+
     /** The text of a column for people: names for codes, points for implied decimals. */
     @NotNull
     public final String label(int place) {
-        Column<?, ?> column = shape.columns().get(place);
-        String text = textAt(place);
-        Object value = column.form().peek(this, text);
-        return value == null ? text
+        Object value = peek(place);
+        return value == null ? textAt(place)
                 : value instanceof BigDecimal ? ((BigDecimal) value).toPlainString()
                 : value.toString();
     }
@@ -110,7 +114,7 @@ public abstract class Row<R extends Row<R>> {
 
     /** Whether nothing stands in any column. */
     public final boolean isBlank() {
-        for (int i = 0; i < bounds.length - 1; i += 2) {
+        for (int i = 0; i < bounds.length - 2; i += 2) {
             if (bounds[i] < bounds[i + 1]) {
                 return false;
             }
@@ -120,23 +124,28 @@ public abstract class Row<R extends Row<R>> {
 
     /** What in the record is not as it should be; empty for what the library makes of a reply. */
     @NotNull
-    public final List<String> faults() {
+    public final List<Fault> faults() {
         if (surplus() != 0) {
-            return Collections.singletonList("a record of " + (shape.fields() - surplus())
-                    + " fields; " + shape + " has " + shape.fields());
+            return Collections.singletonList(new Fault(start, "a record of "
+                    + (shape.fields() - surplus()) + " fields; " + shape + " has " + shape.fields(),
+                    true));
         }
-        List<String> faults = new ArrayList<String>();
+        List<Fault> faults = new ArrayList<Fault>();
         for (Column<?, ?> column : shape.columns()) {
-            String text = textAt(column.index());
-            if (!column.form().accepts(text)) {
-                faults.add(column + ": '" + text + "' is no " + column.form());
+            int place = column.index();
+            if (!column.form().accepts(textAt(place))) {
+                faults.add(new Fault(offset(place), column + " is no " + column.form(), false));
             }
+        }
+        int stray = bounds[bounds.length - 1];
+        if (stray >= 0) {
+            faults.add(new Fault(stray, "a text where the field is always empty", false));
         }
         return Collections.unmodifiableList(faults);
     }
 
     private int surplus() {
-        return bounds[bounds.length - 1];
+        return bounds[bounds.length - 2];
     }
 
     @Override

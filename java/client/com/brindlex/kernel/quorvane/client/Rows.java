@@ -17,6 +17,9 @@ import org.jetbrains.annotations.NotNull;
 public class Rows<R extends Row<R>> extends AbstractList<R> implements RandomAccess {
     private final Shape<R> shape;
     private final String result;
+    private final int from;
+    private final int end;
+    private final int apart;
     private final int announced;
     private final int[] starts;
 
@@ -30,6 +33,9 @@ public class Rows<R extends Row<R>> extends AbstractList<R> implements RandomAcc
     Rows(Shape<R> shape, String result, int from, int end, int apart) {
         this.shape = shape;
         this.result = result;
+        this.from = from;
+        this.end = end;
+        this.apart = apart;
         int at = result.indexOf('!', from);
         String count = at < 0 || at >= end ? "" : result.substring(from, at);
         this.announced = Numbers.isDigits(count) && count.length() < 10
@@ -75,15 +81,19 @@ public class Rows<R extends Row<R>> extends AbstractList<R> implements RandomAcc
 
     /** What in the list is not as it should be; empty for what the library makes of a reply. */
     @NotNull
-    public final List<String> faults() {
-        List<String> faults = new ArrayList<String>();
-        if (announced != size()) {
-            faults.add(announced + " records announced, " + size() + " there");
+    public final List<Fault> faults() {
+        List<Fault> faults = new ArrayList<Fault>();
+        if (announced < 0) {
+            faults.add(new Fault(from, "no count", true));
+        } else if (announced != size()) {
+            faults.add(new Fault(from, (announced + apart) + " records announced, "
+                    + (size() + apart) + " there", true));
         }
-        for (int i = 0; i < size(); i++) {
-            for (String fault : get(i).faults()) {
-                faults.add("record " + i + ": " + fault);
-            }
+        for (R row : this) {
+            faults.addAll(row.faults());
+        }
+        if (size() > 0 && starts[size()] > end) {
+            faults.add(new Fault(end, "the last record is not closed by '!'", true));
         }
         return Collections.unmodifiableList(faults);
     }

@@ -16,7 +16,7 @@ final class Sections {
     }
 
     /** Where a mark stands at the beginning of a record. */
-    private int at(String mark) {
+    int at(String mark) {
         if (result.startsWith(mark + "!")) {
             return 0;
         }

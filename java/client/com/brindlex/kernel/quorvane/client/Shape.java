@@ -11,7 +11,8 @@ import org.jetbrains.annotations.NotNull;
  *
  * <p>A shape is written as a record is, with the number of a column where its text stands: fields
  * are separated by {@code @}, their parts by {@code &}, and what stands within these by bars. An
- * empty place is always empty; a field that opens with {@code ?} may be missing altogether.
+ * empty place is always empty; a field that opens with {@code ?} may be missing altogether, one that
+ * opens with {@code *} takes all that is left.
  *
  * @param <R> the rows
  */
@@ -22,6 +23,7 @@ public abstract class Shape<R extends Row<R>> {
     private final List<Column<?, ?>> columns;
     private final int[][][] fields;
     private final boolean[] mayMiss;
+    private final int rest;
     private final boolean anyMayMiss;
 
     Shape(String name, String pattern, Column<?, ?>... columns) {
@@ -31,9 +33,10 @@ public abstract class Shape<R extends Row<R>> {
         this.anyMayMiss = pattern.indexOf('?') >= 0;
         this.fields = new int[texts.size()][][];
         this.mayMiss = new boolean[texts.size()];
+        this.rest = pattern.indexOf('*') < 0 ? NONE : texts.size() - 1;
         for (int i = 0; i < fields.length; i++) {
             mayMiss[i] = texts.get(i).startsWith("?");
-            fields[i] = parts(mayMiss[i] ? texts.get(i).substring(1) : texts.get(i));
+            fields[i] = parts(mayMiss[i] || i == rest ? texts.get(i).substring(1) : texts.get(i));
         }
     }
 
@@ -77,6 +80,35 @@ public abstract class Shape<R extends Row<R>> {
         return columns;
     }
 
+    /** The columns at a field of the record, in order; none where it is always empty. */
+    @NotNull
+    public final List<Column<?, ?>> at(int field) {
+        List<Column<?, ?>> here = new ArrayList<Column<?, ?>>();
+        for (int[] part : fields[field]) {
+            for (int number : part) {
+                if (number != NONE) {
+                    here.add(columns.get(number));
+                }
+            }
+        }
+        return Collections.unmodifiableList(here);
+    }
+
+    /** The sign before a column within its field: {@code &} or {@code |}, or the empty text. */
+    @NotNull
+    public final String separatorBefore(@NotNull Column<?, ?> column) {
+        for (int[][] field : fields) {
+            for (int part = 0; part < field.length; part++) {
+                for (int i = 0; i < field[part].length; i++) {
+                    if (field[part][i] == column.index()) {
+                        return i > 0 ? "|" : part > 0 ? "&" : "";
+                    }
+                }
+            }
+        }
+        return "";
+    }
+
     /** How many fields a record has when none is missing. */
     public final int fields() {
         return fields.length;
@@ -84,16 +116,17 @@ public abstract class Shape<R extends Row<R>> {
 
     /**
      * Finds the columns of a record: for each two numbers, where its text begins and ends; -1 when
-     * it is not there. Behind them stands how many fields the record has too many or too few.
+     * it is not there. Behind them stand how many fields the record has too few, or below 0 too
+     * many, and where a text stands that belongs to no column, or -1.
      */
     final int[] cut(String text, int start, int end) {
-        int[] bounds = new int[2 * columns.size() + 1];
+        int[] bounds = new int[2 * columns.size() + 2];
         Arrays.fill(bounds, NONE);
         int missing = anyMayMiss ? fields.length - count(text, start, end) : 0;
         int at = start;
         int field = 0;
         for (; field < fields.length && at <= end; field++) {
-            int stop = next(text, '@', at, end);
+            int stop = field == rest ? end : next(text, '@', at, end);
             if (missing > 0 && mayMiss[field] && isNotHere(field, text, at, stop)) {
                 missing--;
                 continue;
@@ -101,7 +134,7 @@ public abstract class Shape<R extends Row<R>> {
             cutField(fields[field], text, at, stop, bounds);
             at = stop + 1;
         }
-        bounds[bounds.length - 1] = anyMayMiss ? missing
+        bounds[bounds.length - 2] = anyMayMiss ? missing
                 : at <= end ? -count(text, at, end) : fields.length - field;
         return bounds;
     }
@@ -130,6 +163,8 @@ public abstract class Shape<R extends Row<R>> {
                 if (numbers[k] != NONE) {
                     bounds[2 * numbers[k]] = at;
                     bounds[2 * numbers[k] + 1] = bar;
+                } else if (bar > at) {
+                    bounds[bounds.length - 1] = at;
                 }
                 at = bar + 1;
             }

@@ -1,5 +1,6 @@
 package com.brindlex.kernel.quorvane.console;
 
+import com.brindlex.kernel.quorvane.client.ReplyException;
 import java.io.PrintStream;
 import java.nio.charset.StandardCharsets;
 import java.time.Clock;
@@ -35,12 +36,16 @@ public final class Demo {
      */
     public static boolean play(PrintStream out, boolean colours, Clock clock) {
         Stage stage = new Stage(new Screen(out, colours), clock);
-        DemoLogin.play(stage);
-        DemoStocks.play(stage);
-        DemoStockLists.play(stage);
-        DemoFutures.play(stage);
-        DemoAccount.play(stage);
-        DemoCertificates.play(stage);
+        try {
+            DemoLogin.play(stage);
+            DemoStocks.play(stage);
+            DemoStockLists.play(stage);
+            DemoFutures.play(stage);
+            DemoAccount.play(stage);
+            DemoCertificates.play(stage);
+        } catch (ReplyException noResult) {
+            // what went wrong is shown where it did; nothing behind it can be played
+        }
         return stage.close();
     }
 }

@@ -1,52 +1,45 @@
 package com.brindlex.kernel.quorvane.console;
 
-import static com.brindlex.kernel.quorvane.console.DemoLogin.ADDRESS;
-import static com.brindlex.kernel.quorvane.console.DemoLogin.BRANCH;
-import static com.brindlex.kernel.quorvane.console.DemoLogin.IDENTITY;
-import static com.brindlex.kernel.quorvane.console.DemoLogin.PASSWORD;
-import static com.brindlex.kernel.quorvane.console.Stage.MARKET;
-import static com.brindlex.kernel.quorvane.console.Stage.PLATFORM;
-import static com.brindlex.kernel.quorvane.console.Stage.SERIAL;
+import static com.brindlex.kernel.quorvane.console.DemoLogin.USER;
 
-import com.brindlex.kernel.quorvane.gatewayjni;
-import com.brindlex.kernel.quorvane.typed.BankBalance;
-import com.brindlex.kernel.quorvane.typed.Operation;
-import com.brindlex.kernel.quorvane.typed.Result;
+import com.brindlex.kernel.quorvane.client.AccountItem;
+import com.brindlex.kernel.quorvane.client.BankBalance;
+import com.brindlex.kernel.quorvane.client.Confirmation;
+import com.brindlex.kernel.quorvane.client.ContactTime;
+import com.brindlex.kernel.quorvane.client.Credentials;
+import com.brindlex.kernel.quorvane.client.Request;
+import java.math.BigDecimal;
 
 /** Bank balance, password change and account opening. */
 final class DemoAccount {
-    static final String NEW_PASSWORD = "better 5678";
+    static final Credentials NEW_USER = USER.withPassword("better 5678");
 
     private DemoAccount() {}
 
     static void play(Stage stage) {
         stage.screen.title("Account maintenance");
-        Result balance = stage.ask("Balance of the linked bank account",
-                (sequence, status) -> gatewayjni.QueryBankRemainEncode(
-                        MARKET, PLATFORM, sequence, SERIAL, ADDRESS, BRANCH, IDENTITY, PASSWORD, status),
-                Operation.QUERY_BANK_REMAIN_DECODE, 1);
-        stage.record(balance.rows());
-        stage.field(balance.rows(), 0, BankBalance.BALANCE, "1250000");
-        stage.ask("Change the password to one that is too short", change("abc"),
-                Operation.CHANGE_PASSWORD_DECODE, -1, "[GATEWAY]新密碼不符規定(E007)");
-        stage.ask("Change the password to one with a blank", change(NEW_PASSWORD),
-                Operation.CHANGE_PASSWORD_DECODE, 1, "");
-        stage.ask("Log in with the old password", DemoLogin.login(IDENTITY, PASSWORD, ADDRESS),
-                Operation.AUTH_DECODE, -1, "密碼錯誤");
-        stage.ask("Log in with the new one", DemoLogin.login(IDENTITY, NEW_PASSWORD, ADDRESS),
-                Operation.AUTH_DECODE, 1);
-        stage.ask("Apply for an account", open("C211112222&"), Operation.OPEN_ACCOUNT_DECODE, 1, "");
-        stage.ask("Apply for an account that exists", open("A123456789&"),
-                Operation.OPEN_ACCOUNT_DECODE, -1, "[GATEWAY]客戶已開戶(E007)");
+        BankBalance balance = stage.ask(
+                "Balance of the linked bank account", () -> stage.as(USER).bankBalance());
+        stage.record(balance);
+        stage.value("balance", new BigDecimal("1250000"), balance.bankBalance());
+        stage.fails("Ask for the balance with a wrong password",
+                () -> stage.as(USER.withPassword("letmein1")).bankBalance(),
+                "[GATEWAY]密碼錯誤(E002)");
+        stage.fails("Change the password to one that is too short",
+                () -> stage.as(USER).changePassword("abc"), "[GATEWAY]新密碼不符規定(E007)");
+        stage.ask("Change the password to one with a blank",
+                () -> stage.as(USER).changePassword(NEW_USER.password()), "");
+        stage.fails("Log in with the old password", () -> stage.as(USER).login(),
+                "[GATEWAY]密碼錯誤(E002)");
+        stage.ask("Log in with the new one", () -> stage.as(NEW_USER).login());
+        stage.ask("Apply for an account", () -> open(stage, "C211112222"), "");
+        stage.fails("Apply for an account that exists", () -> open(stage, USER.idNumber()),
+                "[GATEWAY]客戶已開戶(E007)");
     }
 
-    private static Stage.Encoder change(String wanted) {
-        return (sequence, status) -> gatewayjni.ChangePasswordEncode(
-                MARKET, PLATFORM, sequence, SERIAL, ADDRESS, BRANCH, IDENTITY, PASSWORD, wanted, status);
-    }
-
-    private static Stage.Encoder open(String identity) {
-        return (sequence, status) -> gatewayjni.OpenAccountEncode(MARKET, PLATFORM, sequence, SERIAL, ADDRESS, "",
-                identity, "", "林大同", "台北市中正區1號", "02-12345678", (byte) 2, (byte) 1, status);
+    private static Request<Confirmation> open(Stage stage, String idNumber) {
+        return stage.as(Credentials.ofIdNumber("", idNumber, ""))
+                .openAccount("林大同", "台北市中正區1號", "02-12345678", ContactTime.of(2),
+                        AccountItem.of(1));
     }
 }

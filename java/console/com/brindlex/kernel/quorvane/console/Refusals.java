@@ -1,6 +1,6 @@
 package com.brindlex.kernel.quorvane.console;
 
-import com.brindlex.kernel.quorvane.typed.Operation;
+import com.brindlex.kernel.quorvane.client.Operation;
 import java.util.Arrays;
 import java.util.List;
 

@@ -1,12 +1,21 @@
 package com.brindlex.kernel.quorvane.console;
 
+import com.brindlex.kernel.quorvane.client.Brokerage;
+import com.brindlex.kernel.quorvane.client.Column;
+import com.brindlex.kernel.quorvane.client.Credentials;
+import com.brindlex.kernel.quorvane.client.InvalidRequestException;
+import com.brindlex.kernel.quorvane.client.Market;
+import com.brindlex.kernel.quorvane.client.Operation;
+import com.brindlex.kernel.quorvane.client.Problem;
+import com.brindlex.kernel.quorvane.client.RawReply;
+import com.brindlex.kernel.quorvane.client.Reply;
+import com.brindlex.kernel.quorvane.client.ReplyException;
+import com.brindlex.kernel.quorvane.client.Request;
+import com.brindlex.kernel.quorvane.client.Requests;
+import com.brindlex.kernel.quorvane.client.Row;
+import com.brindlex.kernel.quorvane.client.Session;
+import com.brindlex.kernel.quorvane.client.TradeDate;
 import com.brindlex.kernel.quorvane.simulator.Gateway;
-import com.brindlex.kernel.quorvane.typed.Cell;
-import com.brindlex.kernel.quorvane.typed.Column;
-import com.brindlex.kernel.quorvane.typed.Operation;
-import com.brindlex.kernel.quorvane.typed.Result;
-import com.brindlex.kernel.quorvane.typed.Row;
-import com.brindlex.kernel.quorvane.typed.Section;
 import java.math.BigDecimal;
 import java.time.Clock;
 import java.time.LocalDate;
@@ -14,30 +23,21 @@ import java.util.ArrayList;
 import java.util.List;
 import java.util.Locale;
 import java.util.Set;
+import java.util.function.Supplier;
 
 /** Where the demonstration is played: a device, its gateway, the screen, and what was expected. */
 final class Stage {
-    /** Market code of the securities side; the futures side adds 100 to it. */
-    static final int MARKET = 1;
-
-    /** Row of the client edition. */
-    static final int PLATFORM = 0;
-
-    static final String SERIAL = "R58M30ABCDE";
+    static final Session SESSION = Session.of("R58M30ABCDE", "192.168.1.20");
 
     private static final Set<String> HEADER_TAGS =
             Set.of("F", "KIND", "BHNO", "CB", "IP", "11", "VER", "65", "SN", "15", "IDNO", "ACNO",
                     "PWD", "21", "22", "23", "24", "V4", "44", "FUNC", "FUNC1", "01");
 
-    /** Builds a request. */
-    interface Encoder {
-        String encode(int sequence, int[] status);
-    }
-
     final Screen screen;
     final Clock clock;
     private Gateway gateway;
-    private int sequence;
+    private Session session = SESSION;
+    private int asked;
     private int steps;
     private int failures;
     private boolean wholeHeader;
@@ -52,9 +52,15 @@ final class Stage {
         return gateway;
     }
 
-    /** Moves the session to another gateway. */
-    void use(Gateway other) {
+    /** Moves the session to another gateway and its brokerage. */
+    void use(Gateway other, Brokerage brokerage) {
         gateway = other;
+        session = session.withBrokerage(brokerage);
+    }
+
+    /** The requests of a user, numbered on from the last one. */
+    Requests as(Credentials user) {
+        return Requests.of(session.withSequence(asked++), user);
     }
 
     /** Whether the header's fields are named too, or only those of the operation. */
@@ -62,56 +68,80 @@ final class Stage {
         wholeHeader = whole;
     }
 
-    /** Today in the Republic of China calendar, as the app's date fields hold it. */
-    String today() {
-        return rocDate(LocalDate.now(clock));
+    /** Today as the gateway has it. */
+    TradeDate today() {
+        LocalDate now = LocalDate.now(clock);
+        return TradeDate.of(now.getYear(), now.getMonthValue(), now.getDayOfMonth());
     }
 
-    static String rocDate(LocalDate date) {
-        return String.format(
-                "%03d%02d%02d", date.getYear() - 1911, date.getMonthValue(), date.getDayOfMonth());
+    /**
+     * Sends a request, shows everything on its way there and back, and gives the result.
+     *
+     * @throws ReplyException when there is none: nothing can go on then
+     */
+    <T> T ask(String title, Supplier<Request<T>> building) {
+        return ask(title, building, null);
     }
 
-    /** Sends a request that must be built, and shows everything on its way there and back. */
-    Result ask(String title, Encoder encoder, Operation decoder, int wanted) {
+    /** As {@link #ask}, and holds the text of the result against what it must be. */
+    <T> T ask(String title, Supplier<Request<T>> building, String result) {
+        Reply<T> reply = send(title, building.get(), result);
+        expect(reply.isResult(), "a result", reply.toString());
+        return reply.orThrow();
+    }
+
+    /** Sends a request that is not shown. */
+    <T> T quietly(Request<T> request) {
+        return request.read(gateway.answer(request.text())).orThrow();
+    }
+
+    /** Sends a request that must fail, with this said. */
+    void fails(String title, Supplier<? extends Request<?>> building, String wanted) {
+        String said = send(title, building.get(), null).toString();
+        expect(said.equals(wanted), wanted, said);
+    }
+
+    private <T> Reply<T> send(String title, Request<T> request, String wanted) {
         steps++;
         screen.step(title);
-        int[] status = {0};
-        String request = encoder.encode(sequence++, status);
-        screen.labelled("request", Screen.Style.PLAIN, request);
-        if (status[0] != 1) {
-            expect(false, "a request", request);
-            return Result.of(decoder, status[0], request);
+        screen.labelled("request", Screen.Style.PLAIN, request.text());
+        showFields(request.text());
+        String text = gateway.answer(request.text());
+        screen.labelled("reply", Screen.Style.DIM, text);
+        checkNames(Scene.ofRequest(WireField.cut(request.text())), WireField.cut(text));
+        List<Operation> decoders = request.operation().decoders();
+        boolean own = session.brokerage() == Brokerage.JZG;
+        RawReply read = RawReply.of(
+                decoders.get(own ? decoders.size() - 1 : 0), Market.SECURITIES, text);
+        Reply<T> reply = request.read(text);
+        Screen.Style style = reply.isResult() ? Screen.Style.GOOD : Screen.Style.BAD;
+        screen.labelled("result", reply.isResult() ? Screen.Style.PLAIN : style, read.text());
+        screen.labelled("status", style, read.status() + "");
+        if (wanted != null) {
+            expect(read.text().equals(wanted), wanted, read.text());
         }
-        showFields(request);
-        String reply = gateway.answer(request);
-        screen.labelled("reply", Screen.Style.DIM, reply);
-        checkNames(Scene.ofRequest(WireField.cut(request)), WireField.cut(reply));
-        Result result = decoder.decode(MARKET, reply);
-        Screen.Style style = result.isSuccess() ? Screen.Style.GOOD : Screen.Style.BAD;
-        screen.labelled("result", result.isSuccess() ? Screen.Style.PLAIN : style, result.text());
-        screen.labelled("status", style, result.status() + "");
-        expect(result.status() == wanted, "status " + wanted, "status " + result.status());
-        expect(result.faults().isEmpty(), "a sound result", result.faults().toString());
-        return result;
+        if (reply.isResult()) {
+            expect(read.result().faults().isEmpty(), "a sound result",
+                    read.result().faults().toString());
+        }
+        return reply;
     }
 
-    /** As {@link #ask}, and holds the result against the text that it must be. */
-    void ask(String title, Encoder encoder, Operation decoder, int wanted, String result) {
-        String actual = ask(title, encoder, decoder, wanted).text();
-        expect(actual.equals(result), result, actual);
-    }
-
-    /** Asks for a request that the library must refuse to build, with this text. */
-    void refusedHere(String title, Encoder encoder, String message) {
+    /** Asks for a request that must be refused before it is sent, for these arguments. */
+    void refusedHere(String title, Supplier<? extends Request<?>> building, String... arguments) {
         steps++;
         screen.step(title);
-        int[] status = {0};
-        String text = encoder.encode(sequence++, status);
-        screen.labelled("result", Screen.Style.BAD, text);
-        screen.labelled("status", Screen.Style.BAD, status[0] + "  (nothing is sent)");
-        expect(status[0] == -1, "status -1", "status " + status[0]);
-        expect(text.endsWith(message), message, text);
+        List<String> refused = new ArrayList<>();
+        try {
+            building.get();
+        } catch (InvalidRequestException refusal) {
+            for (Problem problem : refusal.problems()) {
+                screen.labelled("refused", Screen.Style.BAD, problem.toString());
+                refused.add(problem.argument());
+            }
+        }
+        screen.line("  " + screen.styled(Screen.Style.DIM, "nothing is sent"));
+        expect(refused.equals(List.of(arguments)), List.of(arguments) + " refused", refused + "");
     }
 
     /** Lets the exchange act, outside the device. */
@@ -126,86 +156,65 @@ final class Stage {
     }
 
     /** Shows rows as a table and checks how many there are; of all columns, or of these. */
-    void table(List<Row> rows, int wanted, Column<?>... columns) {
+    void table(List<? extends Row<?>> rows, int wanted, Column<?, ?>... columns) {
         expect(rows.size() == wanted, wanted + " rows", rows.size() + " rows");
         if (rows.isEmpty()) {
             return;
         }
-        List<Column<?>> shown = columns.length > 0 ? List.of(columns) : rows.get(0).table().columns();
+        List<Column<?, ?>> all = new ArrayList<>(rows.get(0).shape().columns());
+        List<Column<?, ?>> shown = columns.length > 0 ? List.of(columns) : all;
         List<String> names = new ArrayList<>();
         shown.forEach(column -> names.add(isLeftOut(column) ? "" : words(column)));
         List<List<String>> cells = new ArrayList<>();
-        for (Row row : rows) {
+        for (Row<?> row : rows) {
             List<String> line = new ArrayList<>();
-            shown.forEach(column -> line.add(isLeftOut(column) ? "" : label(row, column)));
+            shown.forEach(column -> line.add(isLeftOut(column) ? "" : label(row, all, column)));
             cells.add(line);
         }
         screen.table(names, cells);
     }
 
-    /** Shows an order book, and checks the state that each order is in. */
-    void orders(List<Row> rows, Column<?> state, Column<?> message, String[] wanted,
-            Column<?>... columns) {
-        table(rows, wanted.length, columns);
-        for (int i = 0; i < Math.min(rows.size(), wanted.length); i++) {
-            String why = rows.get(i).text(message);
-            String actual = rows.get(i).text(state) + (why.isEmpty() ? "" : "&" + why);
-            expect(actual.equals(wanted[i]), wanted[i], actual);
-        }
-    }
-
-    /** Shows each section as a table and checks how many rows it has. */
-    void sections(Result result, int... wanted) {
-        expect(result.sections().size() == wanted.length, wanted.length + " sections",
-                result.sections().size() + " sections");
-        for (int i = 0; i < Math.min(wanted.length, result.sections().size()); i++) {
-            Section section = result.sections().get(i);
-            screen.line("  " + section.table().name());
-            table(section.rows(), wanted[i]);
-        }
-    }
-
     /** Shows the one row that there must be as named values. */
-    void record(List<Row> rows) {
-        expect(rows.size() == 1, "1 row", rows.size() + " rows");
+    void record(Row<?> row) {
+        expect(row != null && !row.isBlank(), "a record", "none");
         List<List<String>> items = new ArrayList<>();
-        for (Row row : rows) {
-            row.cells().forEach(
-                    cell -> items.add(List.of(words(cell.column()), label(cell), "")));
+        for (int place = 0; row != null && place < row.shape().columns().size(); place++) {
+            items.add(List.of(words(row.shape().columns().get(place)), label(row, place), ""));
         }
         screen.grid("shown", items);
     }
 
-    /** Checks the text of one column of a row. */
-    void field(List<Row> rows, int row, Column<?> column, String wanted) {
-        String actual = row < rows.size() ? rows.get(row).text(column) : "(missing)";
-        expect(actual.equals(wanted), column + " " + wanted, actual);
+    /** Checks a value. */
+    void value(String what, Object wanted, Object actual) {
+        expect(wanted.equals(actual), what + " " + wanted, String.valueOf(actual));
     }
 
     /** A second leg stands in the column of the first; what comes from no tag never changes. */
-    private static boolean isLeftOut(Column<?> column) {
-        return column.key().matches("[a-zA-Z]+2") || column.tags().isEmpty();
+    private static boolean isLeftOut(Column<?, ?> column) {
+        return column.name().matches("[a-zA-Z]+2") || column.tags().isEmpty();
     }
 
     /** Four decimals only where they say something. */
-    private static String label(Cell<?> cell) {
-        String text = cell.label();
+    private static String label(Row<?> row, int place) {
+        String text = row.label(place);
         boolean four = text.matches("-?[0-9]+\\.[0-9]{4}");
         return four ? new BigDecimal(text).stripTrailingZeros().toPlainString() : text;
     }
 
-    private static String words(Column<?> column) {
-        return column.key().replaceAll("([A-Z])", " $1").toLowerCase(Locale.ROOT);
+    private static String words(Column<?, ?> column) {
+        return column.name().replaceFirst("(?<=[a-z])1$", "").replaceAll("([A-Z])", " $1")
+                .toLowerCase(Locale.ROOT);
     }
 
-    private static String label(Row row, Column<?> column) {
+    private static String label(Row<?> row, List<Column<?, ?>> all, Column<?, ?> column) {
         String text = "";
-        for (Cell<?> cell : row.cells()) {
-            boolean second = cell.column().key().equals(column.key() + "2");
-            if (cell.column() == column) {
-                text = label(cell);
-            } else if (second && !cell.text().isEmpty()) {
-                text += " / " + label(cell);
+        for (int place = 0; place < all.size(); place++) {
+            boolean second =
+                    all.get(place).name().equals(column.name().replaceFirst("1$", "2"));
+            if (all.get(place) == column) {
+                text = label(row, place);
+            } else if (second && !row.text(place).isEmpty()) {
+                text += " / " + label(row, place);
             }
         }
         return text;

@@ -1,7 +1,8 @@
 package com.brindlex.kernel.quorvane.console.command;
 
-import com.brindlex.kernel.quorvane.typed.Operation;
-import com.brindlex.kernel.quorvane.typed.Result;
+import com.brindlex.kernel.quorvane.client.Market;
+import com.brindlex.kernel.quorvane.client.Operation;
+import com.brindlex.kernel.quorvane.client.RawReply;
 import java.util.concurrent.Callable;
 import picocli.CommandLine.Command;
 import picocli.CommandLine.Model.CommandSpec;
@@ -45,14 +46,22 @@ final class DecodeCommand implements Callable<Integer> {
         Terminal terminal = parent.terminal();
         // the line feed that ends a file is no part of the reply
         String reply = Terminal.read(spec, file).replaceFirst("\\r?\\n\\z", "");
-        Result result = operation.decode(market, reply);
+        RawReply read = RawReply.of(operation, market(), reply);
         if (terminal.isJson()) {
-            terminal.json(Shown.json(result));
+            terminal.json(Shown.json(read));
         } else if (raw) {
-            terminal.raw(result.text());
+            terminal.raw(read.text());
         } else {
-            Shown.result(terminal, result);
+            Shown.reply(terminal, read);
         }
-        return result.isSuccess() ? 0 : 1;
+        return read.reply().isFailure() ? 1 : 0;
+    }
+
+    private Market market() {
+        try {
+            return Market.of(market);
+        } catch (IllegalArgumentException none) {
+            throw new ParameterException(spec.commandLine(), none.getMessage());
+        }
     }
 }

@@ -1,13 +1,16 @@
 package com.brindlex.kernel.quorvane.console.command;
 
-import com.brindlex.kernel.quorvane.typed.Encoded;
-import com.brindlex.kernel.quorvane.typed.Operation;
+import com.brindlex.kernel.quorvane.client.InvalidRequestException;
+import com.brindlex.kernel.quorvane.client.Operation;
+import com.brindlex.kernel.quorvane.client.Problem;
 import java.util.LinkedHashMap;
+import java.util.List;
 import java.util.Map;
 import java.util.concurrent.Callable;
-import picocli.CommandLine;
 import picocli.CommandLine.Model.CommandSpec;
 import picocli.CommandLine.ParameterException;
+import picocli.CommandLine.ParseResult;
+import picocli.CommandLine;
 
 /** Builds one request; there is one such command for each encoder. */
 final class EncodeCommand implements Callable<Integer> {
@@ -43,23 +46,27 @@ final class EncodeCommand implements Callable<Integer> {
     public Integer call() {
         Quorvane parent = root.getCommand();
         Terminal terminal = parent.terminal();
-        Encoded encoded;
+        Map<String, Object> map = new LinkedHashMap<>();
+        map.put("operation", operation.method());
         try {
-            encoded = Options.request(operation, spec.commandLine().getParseResult()).encode();
+            ParseResult parsed = spec.commandLine().getParseResult();
+            String request = Options.request(operation, parsed).build().text();
+            map.put("request", request);
+            if (!terminal.isJson()) {
+                terminal.raw(request);
+            }
+        } catch (InvalidRequestException refused) {
+            List<String> problems = refused.problems().stream().map(Problem::toString).toList();
+            map.put("problems", problems);
+            if (!terminal.isJson()) {
+                problems.forEach(terminal::error);
+            }
         } catch (IllegalArgumentException bad) {
             throw new ParameterException(spec.commandLine(), bad.getMessage());
         }
         if (terminal.isJson()) {
-            Map<String, Object> map = new LinkedHashMap<>();
-            map.put("operation", operation.method());
-            map.put("status", encoded.status());
-            map.put(encoded.isSuccess() ? "request" : "message", encoded.text());
             terminal.json(map);
-        } else if (encoded.isSuccess()) {
-            terminal.raw(encoded.text());
-        } else {
-            terminal.error(encoded.text());
         }
-        return encoded.isSuccess() ? 0 : 1;
+        return map.containsKey("request") ? 0 : 1;
     }
 }

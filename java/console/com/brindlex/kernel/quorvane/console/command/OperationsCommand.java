@@ -1,15 +1,19 @@
 package com.brindlex.kernel.quorvane.console.command;
 
+import com.brindlex.kernel.quorvane.client.Argument;
+import com.brindlex.kernel.quorvane.client.Column;
+import com.brindlex.kernel.quorvane.client.Operation;
+import com.brindlex.kernel.quorvane.client.Shape;
 import com.brindlex.kernel.quorvane.console.Screen.Style;
-import com.brindlex.kernel.quorvane.typed.Argument;
-import com.brindlex.kernel.quorvane.typed.Column;
-import com.brindlex.kernel.quorvane.typed.Operation;
-import com.brindlex.kernel.quorvane.typed.Table;
+import com.brindlex.kernel.quorvane.console.dictionary.Dictionary;
+import com.brindlex.kernel.quorvane.console.dictionary.Reply;
 import java.util.ArrayList;
 import java.util.Arrays;
 import java.util.LinkedHashMap;
+import java.util.LinkedHashSet;
 import java.util.List;
 import java.util.Map;
+import java.util.Set;
 import java.util.concurrent.Callable;
 import java.util.stream.Collectors;
 import picocli.CommandLine.Command;
@@ -49,7 +53,7 @@ final class OperationsCommand implements Callable<Integer> {
             List<List<String>> rows = new ArrayList<>();
             for (Operation each : Operation.values()) {
                 if (each.isEncoder() == encoders) {
-                    rows.add(List.of(each.method(), each.summary(), encoders ? names(each)
+                    rows.add(List.of(each.method(), each.title(), encoders ? names(each)
                                                                              : tables(each)));
                 }
             }
@@ -66,39 +70,39 @@ final class OperationsCommand implements Callable<Integer> {
     }
 
     private static String tables(Operation each) {
-        String tables = each.layout().tables().stream().map(Table::name)
+        String tables = each.layout().shapes().stream().map(Shape::name)
                                 .collect(Collectors.joining(", "));
         return each.layout().kind().name().toLowerCase()
                 + (tables.isEmpty() ? "" : " of " + tables);
     }
 
     private static void show(Terminal terminal, Operation one) {
-        terminal.screen().title(one.method() + ": " + one.summary());
+        terminal.screen().title(one.method() + ": " + one.title());
         List<List<String>> arguments = new ArrayList<>();
-        for (Argument argument : one.allArguments()) {
+        for (Argument argument : Options.all(one)) {
             arguments.add(List.of(argument.name(), argument.type().javaType().getSimpleName(),
-                    argument.isRequired() ? "required" : "'" + argument.initial() + "'",
-                    argument.meaning()));
+                    argument.usual() == null ? "required" : "'" + argument.usual() + "'",
+                    argument.purpose()));
         }
         terminal.screen().texts(List.of("argument", "type", "usual value", "meaning"), arguments);
-        for (String form : one.requestForms()) {
+        for (String form : forms(one)) {
             terminal.line("  " + terminal.screen().styled(Style.DIM, form.replace("\n", "\\n")));
         }
         if (one.isEncoder()) {
             terminal.line("  read by " + one.decoders());
             return;
         }
-        terminal.line("  reply tags " + String.join(" ", one.replyTags()));
+        terminal.line("  reply tags " + String.join(" ", replyTags(one)));
         terminal.line("  result: " + tables(one));
         int section = 0;
-        for (Table table : one.layout().tables()) {
+        for (Shape<?> table : one.layout().shapes()) {
             terminal.line("");
             terminal.line("  " + terminal.screen().styled(Style.STRONG,
                     (one.layout().mark(section++) + " " + table.name()).trim()));
             List<List<String>> rows = new ArrayList<>();
-            for (int position = 0; position < table.positions(); position++) {
-                for (Column<?> column : table.at(position)) {
-                    rows.add(List.of(table.separatorBefore(column) + position, column.key(),
+            for (int position = 0; position < table.fields(); position++) {
+                for (Column<?, ?> column : table.at(position)) {
+                    rows.add(List.of(table.separatorBefore(column) + position, column.name(),
                             column.form().name(), column.tags(), column.meaning()));
                 }
             }
@@ -106,45 +110,63 @@ final class OperationsCommand implements Callable<Integer> {
         }
     }
 
+    /** The forms of a request: the name of its header, and what stands behind it. */
+    private static List<String> forms(Operation one) {
+        var known = Dictionary.get().operation(one.method());
+        return known.forms().stream().map(form -> "<" + known.header() + "> " + form.body())
+                .collect(Collectors.toList());
+    }
+
+    /** The tags that a decoder reads. */
+    private static Set<String> replyTags(Operation one) {
+        Reply reply = Dictionary.get().reply(one.method());
+        Set<String> tags = new LinkedHashSet<>();
+        reply.replyTags().forEach(bound -> tags.add(bound.tag()));
+        if (reply.record() != null) {
+            reply.record().tags().forEach(bound -> tags.add(bound.tag()));
+        }
+        return tags;
+    }
+
     private static Map<String, Object> describe(Operation one) {
         Map<String, Object> map = new LinkedHashMap<>();
         map.put("operation", one.method());
         map.put("kind", one.isEncoder() ? "encoder" : "decoder");
-        map.put("summary", one.summary());
+        map.put("summary", one.title());
         List<Object> arguments = new ArrayList<>();
-        for (Argument argument : one.allArguments()) {
+        for (Argument argument : Options.all(one)) {
             Map<String, Object> entry = new LinkedHashMap<>();
             entry.put("name", argument.name());
             entry.put("type", argument.type().javaType().getSimpleName());
-            entry.put("required", argument.isRequired());
-            entry.put("usual", argument.initial());
-            entry.put("meaning", argument.meaning());
+            entry.put("required", argument.usual() == null);
+            entry.put("usual", argument.usual());
+            entry.put("meaning", argument.purpose());
             arguments.add(entry);
         }
         map.put("arguments", arguments);
         if (one.isEncoder()) {
-            map.put("forms", one.requestForms());
+            map.put("forms", forms(one));
             map.put("decoders", one.decoders());
             return map;
         }
-        map.put("replyTags", one.replyTags());
+        map.put("replyTags", replyTags(one));
         map.put("layout", one.layout().kind().name().toLowerCase());
         List<Object> tables = new ArrayList<>();
-        for (Table table : one.layout().tables()) {
+        for (Shape<?> table : one.layout().shapes()) {
             tables.add(describe(table, one.layout().mark(tables.size())));
         }
         map.put("tables", tables);
         return map;
     }
 
-    private static Map<String, Object> describe(Table table, String mark) {
+    private static Map<String, Object> describe(Shape<?> table, String mark) {
         List<Object> columns = new ArrayList<>();
-        for (int position = 0; position < table.positions(); position++) {
-            for (Column<?> column : table.at(position)) {
+        for (int position = 0; position < table.fields(); position++) {
+            for (Column<?, ?> column : table.at(position)) {
                 Map<String, Object> entry = new LinkedHashMap<>();
                 entry.put("position", position);
                 entry.put("separator", table.separatorBefore(column));
-                entry.put("column", column.key());
+                entry.put("column", column.name());
                 entry.put("form", column.form().name());
                 entry.put("tags", column.tags());
                 entry.put("meaning", column.meaning());
@@ -154,7 +176,7 @@ final class OperationsCommand implements Callable<Integer> {
         Map<String, Object> map = new LinkedHashMap<>();
         map.put("name", table.name());
         map.put("mark", mark);
-        map.put("positions", table.positions());
+        map.put("positions", table.fields());
         map.put("columns", columns);
         return map;
     }

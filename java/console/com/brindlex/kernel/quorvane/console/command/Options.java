@@ -1,9 +1,12 @@
 package com.brindlex.kernel.quorvane.console.command;
 
-import com.brindlex.kernel.quorvane.typed.Argument;
-import com.brindlex.kernel.quorvane.typed.Operation;
-import com.brindlex.kernel.quorvane.typed.Request;
-import com.brindlex.kernel.quorvane.typed.Session;
+import com.brindlex.kernel.quorvane.client.Argument;
+import com.brindlex.kernel.quorvane.client.Market;
+import com.brindlex.kernel.quorvane.client.Operation;
+import com.brindlex.kernel.quorvane.client.Platform;
+import com.brindlex.kernel.quorvane.client.RawRequest;
+import com.brindlex.kernel.quorvane.client.Session;
+import java.util.ArrayList;
 import java.util.List;
 import java.util.Map;
 import picocli.CommandLine.Model.CommandSpec;
@@ -19,16 +22,16 @@ final class Options {
         CommandSpec spec = CommandSpec.wrapWithoutInspection(user);
         spec.name(operation.method());
         spec.mixinStandardHelpOptions(true);
-        spec.usageMessage().description("Builds the request: " + operation.summary() + ".");
+        spec.usageMessage().description("Builds the request: " + operation.title() + ".");
         spec.usageMessage().sortOptions(false);
-        for (Argument argument : operation.allArguments()) {
-            String given = usual.getOrDefault(argument.name(), argument.initial());
+        for (Argument argument : all(operation)) {
+            String given = usual.getOrDefault(argument.name(), argument.usual());
             OptionSpec.Builder option =
                     OptionSpec.builder("--" + dashed(argument.name()))
                             .type(String.class)
                             .paramLabel(argument.type().name().replaceFirst(".*_", ""))
                             .required(given == null)
-                            .description(argument.meaning() + (given == null || given.isBlank()
+                            .description(argument.purpose() + (given == null || given.isBlank()
                                             ? "" : "; usually " + given.replace("%", "%%")));
             spec.addOption(given == null ? option.build() : option.defaultValue(given).build());
         }
@@ -45,18 +48,27 @@ final class Options {
      *
      * @throws IllegalArgumentException with the reason, when a value is none for its argument
      */
-    static Request request(Operation operation, ParseResult parsed) {
-        List<Argument> all = operation.allArguments();
-        int leading = all.size() - operation.arguments().size();
-        Session session =
-                Session.of(number(parsed, all.get(0)), number(parsed, all.get(1)),
-                        text(parsed, all.get(3)), text(parsed, all.get(4)))
-                        .withSequence(number(parsed, all.get(2)));
-        Request request = new Request(operation, session);
-        for (Argument argument : all.subList(leading, all.size())) {
+    static RawRequest request(Operation operation, ParseResult parsed) {
+        List<Argument> device = Operation.sessionArguments();
+        Session session = Session.of(text(parsed, device.get(3)), text(parsed, device.get(4)))
+                                  .withMarket(Market.of(number(parsed, device.get(0))))
+                                  .withPlatform(Platform.of(number(parsed, device.get(1))))
+                                  .withSequence(number(parsed, device.get(2)));
+        RawRequest request = RawRequest.of(operation, session);
+        for (Argument argument : operation.arguments()) {
             request.set(argument.name(), text(parsed, argument));
         }
         return request;
+    }
+
+    /** All arguments of a native but the status array. */
+    static List<Argument> all(Operation operation) {
+        List<Argument> all = new ArrayList<>();
+        if (operation.isEncoder()) {
+            all.addAll(Operation.sessionArguments());
+        }
+        all.addAll(operation.arguments());
+        return all;
     }
 
     private static String text(ParseResult parsed, Argument argument) {

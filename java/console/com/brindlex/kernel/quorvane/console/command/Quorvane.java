@@ -1,15 +1,15 @@
 package com.brindlex.kernel.quorvane.console.command;
 
+import com.brindlex.kernel.quorvane.client.Operation;
 import com.brindlex.kernel.quorvane.console.dictionary.Dictionary;
-import com.brindlex.kernel.quorvane.typed.Operation;
 import java.util.ArrayList;
 import java.util.List;
-import picocli.CommandLine;
 import picocli.CommandLine.Command;
 import picocli.CommandLine.ITypeConverter;
 import picocli.CommandLine.Option;
 import picocli.CommandLine.ScopeType;
 import picocli.CommandLine.TypeConversionException;
+import picocli.CommandLine;
 
 /** The message codec on the command line. */
 @Command(name = "quorvane", mixinStandardHelpOptions = true, version = "quorvane",

@@ -1,13 +1,15 @@
 package com.brindlex.kernel.quorvane.console.command;
 
-import com.brindlex.kernel.quorvane.console.Screen;
+import com.brindlex.kernel.quorvane.client.Code;
+import com.brindlex.kernel.quorvane.client.Failure;
+import com.brindlex.kernel.quorvane.client.Price;
+import com.brindlex.kernel.quorvane.client.RawReply;
+import com.brindlex.kernel.quorvane.client.Reply;
+import com.brindlex.kernel.quorvane.client.ResultText.Section;
+import com.brindlex.kernel.quorvane.client.ResultText;
+import com.brindlex.kernel.quorvane.client.Row;
 import com.brindlex.kernel.quorvane.console.Screen.Style;
-import com.brindlex.kernel.quorvane.typed.Cell;
-import com.brindlex.kernel.quorvane.typed.Code;
-import com.brindlex.kernel.quorvane.typed.Price;
-import com.brindlex.kernel.quorvane.typed.Result;
-import com.brindlex.kernel.quorvane.typed.Row;
-import com.brindlex.kernel.quorvane.typed.Section;
+import com.brindlex.kernel.quorvane.console.Screen;
 import java.util.ArrayList;
 import java.util.LinkedHashMap;
 import java.util.List;
@@ -21,38 +23,47 @@ final class Shown {
 
     private Shown() {}
 
-    /** A result as tables, one for each section that has rows. */
-    static void result(Terminal terminal, Result result) {
+    /** What came of a reply: a message, or tables, one for each section that has rows. */
+    static void reply(Terminal terminal, RawReply read) {
         Screen screen = terminal.screen();
-        if (result.message() != null) {
-            screen.labelled("message", result.isSuccess() ? Style.PLAIN : Style.BAD,
-                    result.text());
+        Reply<?> reply = read.reply();
+        if (!reply.isResult()) {
+            screen.labelled("message", reply.isFailure() ? Style.BAD : Style.PLAIN,
+                    reply.toString());
+            return;
         }
+        ResultText result = read.result();
         for (Section section : result.sections()) {
-            if (section.rows().isEmpty()) {
-                screen.labelled(section.table().name(), Style.DIM, "none");
-                continue;
-            }
-            List<String> columns = new ArrayList<>();
-            section.table().columns().forEach(column -> columns.add(column.key()));
-            List<List<String>> rows = new ArrayList<>();
-            for (Row row : section.rows()) {
-                List<String> cells = new ArrayList<>();
-                row.cells().forEach(cell -> cells.add(cell.label()));
-                rows.add(cells);
-            }
-            if (columns.size() > (rows.size() == 1 ? NARROW : WIDE)) {
-                records(screen, section.table().name(), columns, rows);
-            } else {
-                screen.labelled(section.table().name(), Style.DIM, rows.size() + "");
-                screen.table(columns, rows);
-            }
+            section(screen, section);
         }
-        if (result.sections().isEmpty() && result.message() == null) {
-            String text = result.text();
-            screen.labelled("text", Style.PLAIN, text.isEmpty() ? "(none)" : text);
+        if (result.sections().isEmpty()) {
+            screen.labelled("text", Style.PLAIN, read.text().isEmpty() ? "(none)" : read.text());
         }
         result.faults().forEach(fault -> terminal.error(fault.toString()));
+    }
+
+    private static void section(Screen screen, Section section) {
+        String name = section.shape().name();
+        if (section.rows().isEmpty()) {
+            screen.labelled(name, Style.DIM, "none");
+            return;
+        }
+        List<String> columns = new ArrayList<>();
+        section.shape().columns().forEach(column -> columns.add(column.name()));
+        List<List<String>> rows = new ArrayList<>();
+        for (Row<?> row : section.rows()) {
+            List<String> cells = new ArrayList<>();
+            for (int place = 0; place < columns.size(); place++) {
+                cells.add(row.label(place));
+            }
+            rows.add(cells);
+        }
+        if (columns.size() > (rows.size() == 1 ? NARROW : WIDE)) {
+            records(screen, name, columns, rows);
+        } else {
+            screen.labelled(name, Style.DIM, rows.size() + "");
+            screen.table(columns, rows);
+        }
     }
 
     private static void records(
@@ -70,54 +81,64 @@ final class Shown {
         }
     }
 
-    /** A result as JSON. */
-    static Map<String, Object> json(Result result) {
+    /** What came of a reply as JSON. */
+    static Map<String, Object> json(RawReply read) {
         Map<String, Object> map = new LinkedHashMap<>();
-        map.put("operation", result.operation().method());
-        map.put("status", result.status());
-        map.put("text", result.text());
-        if (result.message() != null) {
+        map.put("operation", read.decoder().method());
+        map.put("status", read.status());
+        map.put("text", read.text());
+        map.put("outcome", read.reply().outcome().name().toLowerCase());
+        Failure failure = read.reply().failure();
+        if (failure != null) {
             Map<String, Object> message = new LinkedHashMap<>();
-            message.put("source", result.message().source());
-            message.put("text", result.message().text());
-            message.put("code", result.message().code());
+            message.put("source", failure.source());
+            message.put("text", failure.text());
+            message.put("code", failure.code());
             map.put("message", message);
         }
         List<Object> sections = new ArrayList<>();
-        for (Section section : result.sections()) {
-            List<Object> rows = new ArrayList<>();
-            for (Row row : section.rows()) {
-                Map<String, Object> cells = new LinkedHashMap<>();
-                row.cells().forEach(cell -> cells.put(cell.column().key(), value(cell)));
-                rows.add(cells);
-            }
-            Map<String, Object> entry = new LinkedHashMap<>();
-            entry.put("table", section.table().name());
-            entry.put("rows", rows);
-            sections.add(entry);
+        List<Object> faults = new ArrayList<>();
+        if (read.reply().isResult()) {
+            read.result().sections().forEach(section -> sections.add(json(section)));
+            read.result().faults().forEach(
+                    fault -> faults.add(fault(fault.offset(), fault.text())));
         }
         map.put("sections", sections);
-        List<Object> faults = new ArrayList<>();
-        result.faults().forEach(fault -> faults.add(fault(fault.offset(), fault.text())));
         map.put("faults", faults);
         return map;
     }
 
-    private static Object value(Cell<?> cell) {
-        Object value = cell.value();
+    private static Map<String, Object> json(Section section) {
+        List<Object> rows = new ArrayList<>();
+        for (Row<?> row : section.rows()) {
+            Map<String, Object> cells = new LinkedHashMap<>();
+            for (int place = 0; place < section.shape().columns().size(); place++) {
+                cells.put(section.shape().columns().get(place).name(), value(row, place));
+            }
+            rows.add(cells);
+        }
+        Map<String, Object> entry = new LinkedHashMap<>();
+        entry.put("table", section.shape().name());
+        entry.put("rows", rows);
+        return entry;
+    }
+
+    private static Object value(Row<?> row, int place) {
+        Object value = row.peek(place);
         if (value instanceof Number) {
             return value;
         }
         if (value instanceof Code<?> code) {
             Map<String, Object> map = new LinkedHashMap<>();
-            map.put("code", code.text());
+            map.put("code", code.code());
             map.put("name", code.isKnown() ? code.label() : null);
             return map;
         }
-        if (value instanceof Price price && price.amount() != null) {
+        if (value instanceof Price price && !price.isWord()) {
             return price.amount();
         }
-        return value == null ? cell.text().isEmpty() ? null : cell.text() : value.toString();
+        String text = row.text(place);
+        return value == null ? text.isEmpty() ? null : text : value.toString();
     }
 
     private static Map<String, Object> fault(int offset, String text) {

@@ -1,5 +1,11 @@
 package com.brindlex.kernel.quorvane.console.command;
 
+import com.brindlex.kernel.quorvane.client.Argument;
+import com.brindlex.kernel.quorvane.client.InvalidRequestException;
+import com.brindlex.kernel.quorvane.client.Market;
+import com.brindlex.kernel.quorvane.client.Operation;
+import com.brindlex.kernel.quorvane.client.RawReply;
+import com.brindlex.kernel.quorvane.client.TradeDate;
 import com.brindlex.kernel.quorvane.console.Screen.Style;
 import com.brindlex.kernel.quorvane.console.message.Kind;
 import com.brindlex.kernel.quorvane.console.message.Message;
@@ -7,16 +13,11 @@ import com.brindlex.kernel.quorvane.console.message.MessageReader;
 import com.brindlex.kernel.quorvane.simulator.Brokerage;
 import com.brindlex.kernel.quorvane.simulator.Gateway;
 import com.brindlex.kernel.quorvane.simulator.Line;
-import com.brindlex.kernel.quorvane.typed.Encoded;
-import com.brindlex.kernel.quorvane.typed.Operation;
-import com.brindlex.kernel.quorvane.typed.Result;
-import com.brindlex.kernel.quorvane.typed.TradeDate;
 import java.io.BufferedReader;
 import java.io.IOException;
 import java.io.InputStreamReader;
 import java.nio.charset.StandardCharsets;
 import java.time.Clock;
-import java.time.LocalDate;
 import java.util.ArrayList;
 import java.util.HashMap;
 import java.util.LinkedHashMap;
@@ -26,11 +27,11 @@ import java.util.Map;
 import java.util.concurrent.Callable;
 import java.util.regex.Matcher;
 import java.util.regex.Pattern;
-import picocli.CommandLine;
 import picocli.CommandLine.Command;
 import picocli.CommandLine.Option;
 import picocli.CommandLine.ParameterException;
 import picocli.CommandLine.ParentCommand;
+import picocli.CommandLine;
 
 /** Talks to the gateway simulator, line by line. */
 @Command(name = "simulate", mixinStandardHelpOptions = true, sortOptions = false,
@@ -68,9 +69,7 @@ final class SimulateCommand implements Callable<Integer> {
     public Integer call() throws IOException {
         terminal = parent.terminal();
         gateway = new Gateway(Clock.systemDefaultZone(), brokerage);
-        LocalDate now = LocalDate.now();
-        String today = TradeDate.of(now.getYear(), now.getMonthValue(), now.getDayOfMonth())
-                               .rocText();
+        String today = TradeDate.today().rocText();
         usual.putAll(Map.of("serialNo", "R58M30ABCDE", "localIP", "10.20.30.40", "branch", "9A01",
                 "identity", "A123456789&1234567", "password", "pass1234", "date", today,
                 "startDate", today, "endDate", today, "orderDate", today));
@@ -140,7 +139,7 @@ final class SimulateCommand implements Callable<Integer> {
             case "operations":
                 for (Operation operation : Operation.values()) {
                     if (operation.isEncoder()) {
-                        terminal.line(String.format("  %-26s %s", operation, operation.summary()));
+                        terminal.line(String.format("  %-26s %s", operation, operation.title()));
                     }
                 }
                 return true;
@@ -176,7 +175,7 @@ final class SimulateCommand implements Callable<Integer> {
     /** The name of an argument, from its name or that of its option. */
     private static String known(String name) {
         for (Operation operation : Operation.values()) {
-            for (var argument : operation.allArguments()) {
+            for (Argument argument : Options.all(operation)) {
                 boolean option = Options.dashed(argument.name()).equals(name);
                 if (option || argument.name().equals(name)) {
                     return argument.name();
@@ -195,15 +194,17 @@ final class SimulateCommand implements Callable<Integer> {
             command.usage(System.out);
             return true;
         }
-        Encoded encoded = Options.request(operation, parsed).encode();
-        if (!encoded.isSuccess()) {
-            terminal.error(encoded.text());
+        String request;
+        try {
+            request = Options.request(operation, parsed).build().text();
+        } catch (InvalidRequestException refused) {
+            refused.problems().forEach(problem -> terminal.error(problem.toString()));
             return false;
         }
-        String reply = gateway.answer(encoded.text());
+        String reply = gateway.answer(request);
         List<Operation> readers = operation.decoders();
         Operation reader = readers.get(brokerage == Brokerage.JZG ? readers.size() - 1 : 0);
-        return show(encoded.text(), reply, reader.decode(1, reply));
+        return show(request, reply, RawReply.of(reader, Market.SECURITIES, reply));
     }
 
     private boolean sendRaw(String request) {
@@ -211,27 +212,27 @@ final class SimulateCommand implements Callable<Integer> {
         Message read = MessageReader.read(request);
         List<Operation> readers = read.kind() != Kind.REQUEST ? List.of()
                 : Operation.named(read.operation()).decoders();
-        Result result = readers.isEmpty() ? null : readers.get(0).decode(1, reply);
-        return show(request, reply, result);
+        return show(request, reply, readers.isEmpty()
+                        ? null : RawReply.of(readers.get(0), Market.SECURITIES, reply));
     }
 
-    private boolean show(String request, String reply, Result result) {
+    private boolean show(String request, String reply, RawReply read) {
         if (terminal.isJson()) {
             Map<String, Object> map = new LinkedHashMap<>();
             map.put("request", request);
             map.put("reply", reply);
-            map.put("result", result == null ? null : Shown.json(result));
+            map.put("result", read == null ? null : Shown.json(read));
             terminal.json(map);
         } else {
             terminal.screen().labelled("request", Style.DIM, request.strip());
             terminal.screen().labelled("reply", Style.DIM, reply);
-            if (result != null) {
+            if (read != null) {
                 terminal.screen().labelled("result",
-                        result.isSuccess() ? Style.GOOD : Style.BAD,
-                        result.text().isEmpty() ? "(done)" : result.text());
-                Shown.result(terminal, result);
+                        read.reply().isFailure() ? Style.BAD : Style.GOOD,
+                        read.text().isEmpty() ? "(done)" : read.text());
+                Shown.reply(terminal, read);
             }
         }
-        return result != null && result.isSuccess();
+        return read != null && !read.reply().isFailure();
     }
 }

@@ -1,16 +1,16 @@
 package com.brindlex.kernel.quorvane.console.command;
 
 import com.brindlex.kernel.quorvane.console.Json;
-import com.brindlex.kernel.quorvane.console.Screen;
 import com.brindlex.kernel.quorvane.console.Screen.Style;
+import com.brindlex.kernel.quorvane.console.Screen;
 import java.io.IOException;
 import java.io.PrintStream;
 import java.nio.charset.StandardCharsets;
 import java.nio.file.Files;
 import java.nio.file.NoSuchFileException;
 import java.nio.file.Path;
-import picocli.CommandLine;
 import picocli.CommandLine.Model.CommandSpec;
+import picocli.CommandLine;
 
 /** Where commands read and write: texts with colours, or JSON. */
 final class Terminal {

@@ -4,8 +4,8 @@ import static org.junit.jupiter.api.Assertions.assertEquals;
 import static org.junit.jupiter.api.Assertions.assertFalse;
 import static org.junit.jupiter.api.Assertions.assertTrue;
 
-import com.brindlex.kernel.quorvane.typed.Argument;
-import com.brindlex.kernel.quorvane.typed.Operation;
+import com.brindlex.kernel.quorvane.client.Argument;
+import com.brindlex.kernel.quorvane.client.Operation;
 import java.io.ByteArrayInputStream;
 import java.io.ByteArrayOutputStream;
 import java.io.InputStream;
@@ -80,7 +80,7 @@ class QuorvaneTest {
         for (Operation operation : Operation.values()) {
             Run shown = run("", "operations", operation.method().toLowerCase());
             assertEquals(0, shown.code, shown.err);
-            for (Argument argument : operation.allArguments()) {
+            for (Argument argument : Options.all(operation)) {
                 assertTrue(shown.out.contains(argument.name()), shown.out);
             }
         }
@@ -100,7 +100,7 @@ class QuorvaneTest {
             if (operation.isEncoder()) {
                 Run help = run("", "encode", operation.method(), "--help");
                 assertEquals(0, help.code);
-                for (Argument argument : operation.allArguments()) {
+                for (Argument argument : Options.all(operation)) {
                     assertTrue(help.out.contains("--" + Options.dashed(argument.name())), help.out);
                 }
             }
@@ -113,11 +113,11 @@ class QuorvaneTest {
                 new String[] {"--serial-no", "SN1", "--local-ip", ""}));
         assertEquals(1, refused.code);
         assertEquals("", refused.out);
-        assertTrue(refused.err.contains("[CLIENT]"), refused.err);
+        assertTrue(refused.err.contains("localIP must be given"), refused.err);
         Run json = run("", words("encode", "AuthEncode", USER,
                 new String[] {"--serial-no", "SN1", "--local-ip", "", "--json"}));
         assertEquals(1, json.code);
-        assertTrue(json.out.contains("\"status\": -1"), json.out);
+        assertTrue(json.out.contains("\"localIP must be given\""), json.out);
     }
 
     @Test

@@ -1,9 +1,12 @@
-package com.brindlex.kernel.quorvane.typed;
+package com.brindlex.kernel.quorvane.client;
 
 import static org.junit.jupiter.api.Assertions.assertEquals;
+import static org.junit.jupiter.api.Assertions.assertFalse;
 import static org.junit.jupiter.api.Assertions.assertNotNull;
 import static org.junit.jupiter.api.Assertions.assertTrue;
 
+import com.brindlex.kernel.quorvane.console.dictionary.Dictionary;
+import com.brindlex.kernel.quorvane.console.dictionary.Reply.Bound;
 import java.util.ArrayList;
 import java.util.Arrays;
 import java.util.List;
@@ -12,9 +15,9 @@ import java.util.stream.Stream;
 import org.junit.jupiter.params.ParameterizedTest;
 import org.junit.jupiter.params.provider.MethodSource;
 
-/** Nothing that a decoder returns may make the typed layer throw. */
+/** Whatever a decoder returns is a result, a failure or on its way; a value that is none says so. */
 class RandomReplyTest {
-    private static final int ROUNDS = 2000;
+    private static final int ROUNDS = 1000;
     private static final String[] VALUES = {
         "", " ", "0", "1", "2", "3", "5", "8", "9", "0000", "5001", "1234", "-", "-5", "2330", "B",
         "S", "C", "P", "X", "Y", "N", "E", "T", "I", "TXF", "TXO", "MSO", "TEO", "202401", "TIMEX",
@@ -29,17 +32,31 @@ class RandomReplyTest {
         return Arrays.stream(Operation.values()).filter(operation -> !operation.isEncoder());
     }
 
+    /** The tags that a decoder reads. */
+    private static List<String> tags(Operation decoder) {
+        var reply = Dictionary.get().reply(decoder.method());
+        List<Bound> bounds = new ArrayList<>(reply.replyTags());
+        bounds.addAll(reply.record() == null ? List.of() : reply.record().tags());
+        return bounds.stream().map(Bound::tag).distinct().toList();
+    }
+
+    private static RawReply read(Operation decoder, Random random, String reply) {
+        return RawReply.of(decoder, Market.of(random.nextInt(10)), reply);
+    }
+
     @ParameterizedTest
     @MethodSource("decoders")
     void repliesOfRandomFields(Operation decoder) {
         Random random = new Random(decoder.ordinal());
         int withRows = 0;
         for (int round = 0; round < ROUNDS; round++) {
-            Result result = decoder.decode(random.nextInt(10), reply(decoder, random));
-            touch(result);
-            withRows += result.rows().isEmpty() ? 0 : 1;
+            RawReply reply = read(decoder, random, reply(decoder, random));
+            touch(reply.result(), reply.text());
+            judge(reply.reply());
+            withRows += reply.result().sections().stream().anyMatch(
+                    section -> !section.rows().isEmpty()) ? 1 : 0;
         }
-        boolean hasRows = !decoder.layout().tables().isEmpty();
+        boolean hasRows = !decoder.layout().shapes().isEmpty();
         assertTrue(!hasRows || withRows > ROUNDS / 50, "rows seen: " + withRows);
     }
 
@@ -48,17 +65,18 @@ class RandomReplyTest {
     void garbageReplies(Operation decoder) {
         Random random = new Random(1000 + decoder.ordinal());
         for (int round = 0; round < ROUNDS; round++) {
-            touch(decoder.decode(garbage(random, random.nextInt(200))));
+            judge(read(decoder, random, garbage(random, random.nextInt(200))).reply());
         }
     }
 
-    /** Not even a text that no decoder gives. */
+    /** Not even a text that no decoder gives makes anything throw. */
     @ParameterizedTest
     @MethodSource("decoders")
     void garbageResults(Operation decoder) {
         Random random = new Random(2000 + decoder.ordinal());
         for (int round = 0; round < ROUNDS; round++) {
-            touch(Result.of(decoder, random.nextInt(3) - 1, garbage(random, random.nextInt(300))));
+            String text = garbage(random, random.nextInt(300));
+            touch(ResultText.of(decoder, text), text);
         }
     }
 
@@ -68,11 +86,12 @@ class RandomReplyTest {
     void damagedResults(Operation decoder) {
         Random random = new Random(3000 + decoder.ordinal());
         for (int round = 0; round < ROUNDS; round++) {
-            String good = decoder.decode(reply(decoder, random)).text();
+            String good = read(decoder, random, reply(decoder, random)).text();
             int at = random.nextInt(good.length() + 1);
             int to = Math.min(good.length(), at + random.nextInt(2));
-            String middle = garbage(random, random.nextInt(2));
-            touch(Result.of(decoder, 1, good.substring(0, at) + middle + good.substring(to)));
+            String bad = good.substring(0, at) + garbage(random, random.nextInt(2))
+                    + good.substring(to);
+            touch(ResultText.of(decoder, bad), bad);
         }
     }
 
@@ -86,7 +105,7 @@ class RandomReplyTest {
             int records = random.nextInt(4);
             for (int i = 0; i < records; i++) {
                 reply.append("|00=1|67=").append(i).append("|68=0000");
-                for (String tag : decoder.replyTags()) {
+                for (String tag : tags(decoder)) {
                     if (!tag.matches("67|68|M2")) {
                         reply.append('|').append(tag).append('=').append(tidy(tag));
                     }
@@ -94,11 +113,13 @@ class RandomReplyTest {
                 reply.append("|01=");
             }
             reply.append("|00=9|67=999999|68=0000|01=");
-            Result result = decoder.decode(reply.toString());
-            assertTrue(result.faults().isEmpty(), () -> result + " " + result.faults());
-            if (decoder.layout().kind() == Layout.Kind.LIST && result.isSuccess()
-                    && !decoder.method().matches("QueryBankRemain.*|QueryFinance.*")) {
-                assertEquals(records, result.rows().size(), result.text());
+            RawReply read = read(decoder, random, reply.toString());
+            judge(read.reply());
+            if (read.reply().isResult()) {
+                assertEquals(List.of(), read.result().faults(), read::toString);
+            }
+            if (read.reply().orNull() instanceof Rows<?> rows) {
+                assertEquals(records, rows.size(), read.text());
             }
         }
     }
@@ -135,7 +156,7 @@ class RandomReplyTest {
     }
 
     private static String reply(Operation decoder, Random random) {
-        List<String> tags = new ArrayList<>(decoder.replyTags());
+        List<String> tags = tags(decoder);
         StringBuilder reply = new StringBuilder(random.nextBoolean() ? "F=7|68=0000" : "F=7");
         int records = random.nextInt(5);
         for (int i = 0; i < records; i++) {
@@ -167,38 +188,50 @@ class RandomReplyTest {
         return text.toString();
     }
 
+    /** One of the three outcomes, and a failure says something. */
+    private static void judge(Reply<?> reply) {
+        assertNotNull(reply.outcome());
+        assertNotNull(reply.toString());
+        assertEquals(reply.isResult(), reply.orNull() != null);
+        assertEquals(reply.isResult(), reply.message().isEmpty());
+        if (reply.isFailure()) {
+            assertFalse(reply.failure().text().trim().isEmpty());
+        }
+        assertEquals(reply, reply);
+    }
+
     /** Reads everything that there is to read. */
-    private static void touch(Result result) {
-        assertNotNull(result.toString());
-        if (result.message() != null) {
-            assertEquals(result.text(), result.message().full());
-            assertNotNull(result.message().text() + result.message().code());
-            assertNotNull(result.message().source());
-        }
+    private static void touch(ResultText result, String text) {
         for (Fault fault : result.faults()) {
-            assertTrue(fault.offset() >= 0 && fault.offset() <= result.text().length(),
-                    () -> result + " " + fault);
+            assertTrue(fault.offset() >= 0 && fault.offset() <= text.length(),
+                    () -> text + " " + fault);
         }
-        for (Section section : result.sections()) {
-            assertEquals(section.rows(), result.rows(section.table()));
-            for (Row row : section.rows()) {
-                touch(result, row);
+        for (ResultText.Section section : result.sections()) {
+            for (Row<?> row : section.rows()) {
+                assertEquals(section.shape(), row.shape());
+                assertEquals(row, row);
+                assertNotNull(row.toString());
+                touch(row, text);
             }
         }
     }
 
-    private static void touch(Result result, Row row) {
-        assertNotNull(row.toString());
-        int index = 0;
-        for (Column<?> column : row.table().columns()) {
-            Cell<?> cell = row.cells().get(index++);
-            assertEquals(column, cell.column());
-            assertEquals(cell.text(), row.text(column));
-            assertEquals(cell.value(), row.get(column));
-            assertNotNull(cell.label());
-            if (cell.offset() >= 0) {
-                assertTrue(result.text().startsWith(cell.text(), cell.offset()),
-                        () -> result + " " + cell.column());
+    private static <R extends Row<R>> void touch(Row<R> row, String text) {
+        for (int place = 0; place < row.shape().columns().size(); place++) {
+            @SuppressWarnings("unchecked")
+            Column<R, ?> column = (Column<R, ?>) row.shape().columns().get(place);
+            assertEquals(row.text(place), row.text(column));
+            assertNotNull(row.label(place));
+            assertTrue(row.offset(place) < 0
+                            || text.startsWith(row.text(place), row.offset(place)));
+            try {
+                Object value = row.get(column);
+                assertEquals(row.peek(place) == null ? row.text(place).trim().isEmpty() : true,
+                        column.form() == Form.TEXT || value != null
+                                || row.text(place).trim().isEmpty());
+            } catch (MalformedValueException told) {
+                assertEquals(column, told.column());
+                assertFalse(row.faults().isEmpty() && row.text(place).indexOf('&') < 0);
             }
         }
     }
