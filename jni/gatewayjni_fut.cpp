@@ -17,16 +17,16 @@ HostSession OnFutures(HostSession session) {
 #define FUTURES_ENCODER(operation, method, parameters, ...) \
   ENCODER_OF(OnFutures(SESSION), operation, method, parameters, __VA_ARGS__)
 
-#define ORDER_PARAMETERS                                                                          \
-  LOGIN_PARAMETERS, jstring reference, jstring orderDate, jstring commodity1, jstring commodity2, \
-      jstring month1, jstring month2, jstring strike1, jstring strike2, jstring callPut1,         \
-      jstring callPut2, jbyte n6, jbyte orderKind, jbyte priceType, jchar function, jchar w3,     \
-      jchar timeInForce, jchar unusedLetter, jchar side1, jchar side2, jint quantity,             \
-      jint unusedNumber, jint price
-#define ORDER                                                                                      \
-  LOGIN, reference, orderDate, commodity1, commodity2, month1, month2, strike1, strike2, callPut1, \
-      callPut2, n6, orderKind, priceType, function, w3, timeInForce, unusedLetter, side1, side2,   \
-      quantity, unusedNumber, price
+#define ORDER_PARAMETERS                                                                        \
+  LOGIN_PARAMETERS, jstring orderReference, jstring orderDate, jstring commodity1,              \
+      jstring commodity2, jstring month1, jstring month2, jstring strike1, jstring strike2,     \
+      jstring callPut1, jstring callPut2, jbyte handlingFlag, jbyte orderKind, jbyte priceType, \
+      jchar function, jchar flagW3, jchar timeInForce, jchar unreadLetter, jchar side1,         \
+      jchar side2, jint quantity, jint unreadNumber, jint price
+#define ORDER                                                                                 \
+  LOGIN, orderReference, orderDate, commodity1, commodity2, month1, month2, strike1, strike2, \
+      callPut1, callPut2, handlingFlag, orderKind, priceType, function, flagW3, timeInForce,  \
+      unreadLetter, side1, side2, quantity, unreadNumber, price
 
 FUTURES_ENCODER(FutSubmitOrderEncode, CGatewayFut::SubmitOrderEncode, (ORDER_PARAMETERS), ORDER)
 FUTURES_ENCODER(FutSubmitOrderEncode1, CGatewayFut::SubmitOrderEncode1, (ORDER_PARAMETERS), ORDER)

@@ -4,11 +4,13 @@
 
 // New orders.
 
-#define ORDER_PARAMETERS                                                                   \
-  LOGIN_PARAMETERS, jstring stockCode, jstring date, jint quantity, jint unit, jint price, \
-      jbyte side, jbyte flag13, jbyte orderKind, jbyte priceKind, jbyte tradeType, jbyte n6
-#define ORDER \
-  LOGIN, stockCode, date, quantity, unit, price, side, flag13, orderKind, priceKind, tradeType, n6
+#define ORDER_PARAMETERS                                                                        \
+  LOGIN_PARAMETERS, jstring stockCode, jstring orderDate, jint quantity, jint unit, jint price, \
+      jbyte side, jbyte flag13, jbyte orderKind, jbyte priceKind, jbyte tradeType,              \
+      jbyte handlingFlag
+#define ORDER                                                                             \
+  LOGIN, stockCode, orderDate, quantity, unit, price, side, flag13, orderKind, priceKind, \
+      tradeType, handlingFlag
 
 ENCODER(SubmitOrderEncode, CGatewayStk::SubmitOrderEncode, (ORDER_PARAMETERS), ORDER)
 ENCODER(SubmitOrderEncode1, CGatewayStk::SubmitOrderEncode1, (ORDER_PARAMETERS), ORDER)
@@ -24,13 +26,13 @@ DECODER(SubmitOrderDecode, CGatewayStk::SubmitOrderDecode)
 
 // Orders cancelled and changed.
 
-#define AMENDMENT_PARAMETERS                                                                      \
-  LOGIN_PARAMETERS, jstring stockCode, jstring date, jstring reference, jint quantity, jint unit, \
-      jint price, jbyte side, jbyte flag13, jbyte orderKind, jbyte unread, jbyte tradeType,       \
-      jbyte n6
-#define AMENDMENT                                                                            \
-  LOGIN, stockCode, date, reference, quantity, unit, price, side, flag13, orderKind, unread, \
-      tradeType, n6
+#define AMENDMENT_PARAMETERS                                                                     \
+  LOGIN_PARAMETERS, jstring stockCode, jstring orderDate, jstring orderReference, jint quantity, \
+      jint unit, jint price, jbyte side, jbyte flag13, jbyte orderKind, jbyte unreadPriceKind,   \
+      jbyte tradeType, jbyte handlingFlag
+#define AMENDMENT                                                                              \
+  LOGIN, stockCode, orderDate, orderReference, quantity, unit, price, side, flag13, orderKind, \
+      unreadPriceKind, tradeType, handlingFlag
 
 ENCODER(CancelOrderEncode, CGatewayStk::CancelOrderEncode, (AMENDMENT_PARAMETERS), AMENDMENT)
 ENCODER(CancelOrderEncode1, CGatewayStk::CancelOrderEncode1, (AMENDMENT_PARAMETERS), AMENDMENT)
@@ -64,6 +66,7 @@ ENCODER(QueryCreditInfoEncode, CGatewayStk::QueryCreditInfoEncode,
 DECODER(QueryCreditInfoDecode, CGatewayStk::QueryCreditInfoDecode)
 
 ENCODER(PaymentEncode, CGatewayStk::PaymentEncode,
-        (LOGIN_PARAMETERS, jstring period, jstring endDate), LOGIN, period, endDate)
+        (LOGIN_PARAMETERS, jstring periodOrStartDate, jstring endDate), LOGIN, periodOrStartDate,
+        endDate)
 DECODER(PaymentDecode, CGatewayStk::PaymentDecode)
 DECODER(PaymentDecodeJZG, CGatewayStk::PaymentDecodeJZG)

@@ -1,6 +1,7 @@
 """The dictionary as one value: its files read, argument sets written out, names checked."""
 
 import json
+import re
 from pathlib import Path
 
 FOLDER = Path(__file__).resolve().parent.parent
@@ -104,11 +105,30 @@ def _check(whole):
             _known(operation["header"], headers, where)
             for decoder in operation["answeredBy"]:
                 _known(decoder, operations, where)
+            _check_forms(whole, operation)
         else:
             _known(where, replies, "operations.json")
     for reply in whole["replies"]:
         _known(reply["decoder"], operations, "replies.json")
         _check_reply(whole, reply, operations[reply["decoder"]], codes)
+
+
+def _check_forms(whole, operation):
+    """A form names values, conversions and pieces that are there, and arguments of its own."""
+    pieces = by_name(whole["pieces"])
+    values = {one["name"] for one in operation["arguments"]} | set(by_name(whole["values"]))
+    conversions = set(by_name(whole["conversions"]))
+    for form in operation["forms"]:
+        where = f"{operation['name']}, a form"
+        text = form["body"]
+        for piece in re.findall(r"<(\w+)>", text):
+            _known(piece, pieces, where)
+            text += pieces[piece]["text"]
+        for name, conversion in re.findall(r"\{(\w+)\|?(\w*)\}", text):
+            _known(name, values, where)
+            _known(conversion or "first", conversions, where)
+        for name in form.get("when", {}):
+            _known(name, values, where)
 
 
 def _check_reply(whole, reply, operation, codes):

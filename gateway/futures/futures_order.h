@@ -25,14 +25,14 @@ struct Leg {
 
 // The host's three byte numbers are unsigned: -1 is 255.
 struct FuturesOrder {
-  const char* reference;
+  const char* orderReference;
   Leg first;
   Leg second;
-  uint8_t n6;
+  uint8_t handlingFlag;
   OrderKind kind;
   uint8_t priceType;
   char function;
-  char w3;
+  char flagW3;
   char timeInForce;
   int32_t quantity;
   int32_t price;

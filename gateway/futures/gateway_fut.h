@@ -25,32 +25,34 @@ class CGatewayFut : public CGatewayPub {
   // the header fails (its message alone), when a needed leg text is empty or the kind unknown (the
   // message behind the header), or when the request does not fit.
   //
-  //   reference            of the order to change or cancel: two values joined by '&'
+  //   orderReference       of the order to change or cancel: two values joined by '&'
   //   orderDate            a date such as 1130115, or empty; sent by SubmitOrderEncode alone
   //   commodity..callPut   of the legs; strike and call/put are empty for futures
-  //   n6                   0 to 255, sent as tag N6
+  //   handlingFlag         0 to 255, sent as tag N6
   //   orderKind            1 futures, 2 option, 3 option combination, 4 futures spread
   //   priceType            0 to 255; 1 and 3 are at the market, whatever the price
   //   function             'I' new, 'C' change of quantity, 'A' change of price, else cancel
-  //   w3                   sent as tag W3 of a new order
+  //   flagW3               sent as tag W3 of a new order
   //   timeInForce          'I' immediate or cancel, 'F' fill or kill, else rest of day
   //   side1, side2         'B' or 'S'
   //   quantity             lots
   //   price                with four implied decimals
   char* SubmitOrderEncode(const char* branch, const char* identity, const char* password,
-                          const char* reference, const char* orderDate, const char* commodity1,
+                          const char* orderReference, const char* orderDate, const char* commodity1,
                           const char* commodity2, const char* month1, const char* month2,
                           const char* strike1, const char* strike2, const char* callPut1,
-                          const char* callPut2, char n6, char orderKind, char priceType,
-                          char function, char w3, char timeInForce, char unusedLetter, char side1,
-                          char side2, int quantity, int unusedNumber, int price, int* status);
+                          const char* callPut2, char handlingFlag, char orderKind, char priceType,
+                          char function, char flagW3, char timeInForce, char unreadLetter,
+                          char side1, char side2, int quantity, int unreadNumber, int price,
+                          int* status);
   char* SubmitOrderEncode1(const char* branch, const char* identity, const char* password,
-                           const char* reference, const char* orderDate, const char* commodity1,
-                           const char* commodity2, const char* month1, const char* month2,
-                           const char* strike1, const char* strike2, const char* callPut1,
-                           const char* callPut2, char n6, char orderKind, char priceType,
-                           char function, char w3, char timeInForce, char unusedLetter, char side1,
-                           char side2, int quantity, int unusedNumber, int price, int* status);
+                           const char* orderReference, const char* orderDate,
+                           const char* commodity1, const char* commodity2, const char* month1,
+                           const char* month2, const char* strike1, const char* strike2,
+                           const char* callPut1, const char* callPut2, char handlingFlag,
+                           char orderKind, char priceType, char function, char flagW3,
+                           char timeInForce, char unreadLetter, char side1, char side2,
+                           int quantity, int unreadNumber, int price, int* status);
 
   // The gateway's answer to an order: "number@date@@accepted@flag@!", or its message with status
   // -1. An empty reply means that the order is under way: status 1.
@@ -83,20 +85,22 @@ class CGatewayFut : public CGatewayPub {
   // Append the order's own tags to the terminated text in `body`, a buffer of kBodySize bytes, and
   // turn the order key in `signature`, a buffer of kBufferSize bytes, into the signature payload.
   // Return 1, or 0 with the parameter error alone in `body`.
-  int EncodeSubmitOrderRecord(const char* reference, const char* orderDate, const char* commodity1,
-                              const char* commodity2, const char* month1, const char* month2,
-                              const char* strike1, const char* strike2, const char* callPut1,
-                              const char* callPut2, char n6, char orderKind, char priceType,
-                              char function, char w3, char timeInForce, char unusedLetter,
-                              char side1, char side2, int quantity, int unusedNumber, int price,
-                              char* body, char* signature);
-  int EncodeSubmitOrderRecord1(const char* reference, const char* orderDate, const char* commodity1,
-                               const char* commodity2, const char* month1, const char* month2,
-                               const char* strike1, const char* strike2, const char* callPut1,
-                               const char* callPut2, char n6, char orderKind, char priceType,
-                               char function, char w3, char timeInForce, char unusedLetter,
-                               char side1, char side2, int quantity, int unusedNumber, int price,
-                               char* body, char* signature);
+  int EncodeSubmitOrderRecord(const char* orderReference, const char* orderDate,
+                              const char* commodity1, const char* commodity2, const char* month1,
+                              const char* month2, const char* strike1, const char* strike2,
+                              const char* callPut1, const char* callPut2, char handlingFlag,
+                              char orderKind, char priceType, char function, char flagW3,
+                              char timeInForce, char unreadLetter, char side1, char side2,
+                              int quantity, int unreadNumber, int price, char* body,
+                              char* signature);
+  int EncodeSubmitOrderRecord1(const char* orderReference, const char* orderDate,
+                               const char* commodity1, const char* commodity2, const char* month1,
+                               const char* month2, const char* strike1, const char* strike2,
+                               const char* callPut1, const char* callPut2, char handlingFlag,
+                               char orderKind, char priceType, char function, char flagW3,
+                               char timeInForce, char unreadLetter, char side1, char side2,
+                               int quantity, int unreadNumber, int price, char* body,
+                               char* signature);
 
   // Writes what a reply or record says of itself into `out` (cleared before, `size` bytes): "0000",
   // "5001" (no data), else "message(code)"; nothing when that does not fit. Returns `out`.

@@ -90,10 +90,10 @@ void WriteBody(const FuturesOrder& order, const char* price, CTextWriter& body) 
               order.timeInForce == 'I' ? "1" : "0", CombinationCode(order), leg.callPut);
   if (order.HasTwoLegs()) WriteSecondLeg(order, body);
   if (order.IsNew()) {
-    body.Append(WIRE("|W3=%c"), order.w3);
+    body.Append(WIRE("|W3=%c"), order.flagW3);
     return;
   }
-  const OrderReference reference(AsText(order.reference), kReferencePartSize);
+  const OrderReference reference(AsText(order.orderReference), kReferencePartSize);
   body.Append(WIRE("|36=%s|46=%s|37=%ld"), reference.orderNumber, reference.gatewayNumber,
               order.quantity);
 }
@@ -110,7 +110,7 @@ void SignPlain(const Signing& signing, CTextWriter& out) {
   const FuturesOrder& order = signing.order;
   const Leg& first = order.first;
   const Leg& second = order.second;
-  const OrderReference reference(AsText(order.reference), kReferencePartSize);
+  const OrderReference reference(AsText(order.orderReference), kReferencePartSize);
   if (order.IsNew() && order.HasTwoLegs()) {
     out.Append(WIRE("!!%s_%c_%c_%s_%s_%s_%s_%c_%s_%s_%s_%s_%ld_%s"), signing.key, order.timeInForce,
                first.side, first.commodity, first.month, first.strike, first.callPut, second.side,
@@ -133,15 +133,15 @@ void SignInPlaces(const Signing& signing, CTextWriter& out) {
   const FuturesOrder& order = signing.order;
   const Leg& first = order.first;
   const Leg& second = order.second;
-  const OrderReference reference(AsText(order.reference), kReferencePartSize);
+  const OrderReference reference(AsText(order.orderReference), kReferencePartSize);
   if (order.IsNew() && order.HasTwoLegs()) {
     out.Append(WIRE("|PL=S!!%s,%c,%c,%d,%c,%s,%s,%s,%s,%c,%s,%s,%s,%s,%ld,%s,"), signing.key,
-               order.timeInForce, order.w3, int{order.priceType}, first.side, first.commodity,
+               order.timeInForce, order.flagW3, int{order.priceType}, first.side, first.commodity,
                first.month, first.strike, first.callPut, second.side, second.commodity,
                second.month, second.strike, second.callPut, order.quantity, signing.price);
   } else if (order.IsNew()) {
     out.Append(WIRE("|PL=S!!%s,%c,%c,%d,%c,%s,%s,%s,%s,,,,,,%ld,%s,"), signing.key,
-               order.timeInForce, order.w3, int{order.priceType}, first.side, first.commodity,
+               order.timeInForce, order.flagW3, int{order.priceType}, first.side, first.commodity,
                first.month, first.strike, first.callPut, order.quantity, signing.price);
   } else if (order.function == 'A') {
     out.Append(WIRE("|PL=S!!%s,%c,,,,,,,,,,,,,%ld,%s,%s"), signing.key, order.timeInForce,
@@ -184,19 +184,20 @@ int EncodeRecord(CGatewayPub& gateway, const FuturesOrder& order, Sign* sign, ch
 }
 
 // The host's arguments in their own order.
-FuturesOrder NameOrder(const char* reference, const char* commodity1, const char* commodity2,
+FuturesOrder NameOrder(const char* orderReference, const char* commodity1, const char* commodity2,
                        const char* month1, const char* month2, const char* strike1,
-                       const char* strike2, const char* callPut1, const char* callPut2, char n6,
-                       char orderKind, char priceType, char function, char w3, char timeInForce,
-                       char side1, char side2, int quantity, int price) {
-  return {reference,
+                       const char* strike2, const char* callPut1, const char* callPut2,
+                       char handlingFlag, char orderKind, char priceType, char function,
+                       char flagW3, char timeInForce, char side1, char side2, int quantity,
+                       int price) {
+  return {orderReference,
           {side1, commodity1, month1, strike1, callPut1},
           {side2, commodity2, month2, strike2, callPut2},
-          static_cast<uint8_t>(n6),
+          static_cast<uint8_t>(handlingFlag),
           OrderKind{static_cast<uint8_t>(orderKind)},
           static_cast<uint8_t>(priceType),
           function,
-          w3,
+          flagW3,
           timeInForce,
           quantity,
           price};
@@ -217,7 +218,7 @@ char* CGatewayFut::EncodeOrder(OrderHead head, const OrderOrigin& origin, const 
   key.AppendTo(signature);
   Sign* const sign = head == OrderHead::kPlain ? SignPlain : SignInPlaces;
   if (WriteRecord(*this, order, sign, line, signature)) {
-    line.Append(WIRE("|N6=%d"), int{order.n6});
+    line.Append(WIRE("|N6=%d"), int{order.handlingFlag});
     line.AppendText({signature.Text(), signature.Length()});
     if (signature.Overflowed()) return Fail(line, status, kBadParameters);
   } else {
@@ -228,59 +229,61 @@ char* CGatewayFut::EncodeOrder(OrderHead head, const OrderOrigin& origin, const 
 }
 
 char* CGatewayFut::SubmitOrderEncode(const char* branch, const char* identity, const char* password,
-                                     const char* reference, const char* orderDate,
+                                     const char* orderReference, const char* orderDate,
                                      const char* commodity1, const char* commodity2,
                                      const char* month1, const char* month2, const char* strike1,
                                      const char* strike2, const char* callPut1,
-                                     const char* callPut2, char n6, char orderKind, char priceType,
-                                     char function, char w3, char timeInForce, char, char side1,
-                                     char side2, int quantity, int, int price, int* status) {
+                                     const char* callPut2, char handlingFlag, char orderKind,
+                                     char priceType, char function, char flagW3, char timeInForce,
+                                     char, char side1, char side2, int quantity, int, int price,
+                                     int* status) {
   return EncodeOrder(OrderHead::kPlain,
                      {AsText(branch), AsText(identity), AsText(password), AsText(orderDate)},
-                     NameOrder(reference, commodity1, commodity2, month1, month2, strike1, strike2,
-                               callPut1, callPut2, n6, orderKind, priceType, function, w3,
-                               timeInForce, side1, side2, quantity, price),
+                     NameOrder(orderReference, commodity1, commodity2, month1, month2, strike1,
+                               strike2, callPut1, callPut2, handlingFlag, orderKind, priceType,
+                               function, flagW3, timeInForce, side1, side2, quantity, price),
                      status);
 }
 
-char* CGatewayFut::SubmitOrderEncode1(
-    const char* branch, const char* identity, const char* password, const char* reference,
-    const char* orderDate, const char* commodity1, const char* commodity2, const char* month1,
-    const char* month2, const char* strike1, const char* strike2, const char* callPut1,
-    const char* callPut2, char n6, char orderKind, char priceType, char function, char w3,
-    char timeInForce, char, char side1, char side2, int quantity, int, int price, int* status) {
+char* CGatewayFut::SubmitOrderEncode1(const char* branch, const char* identity,
+                                      const char* password, const char* orderReference,
+                                      const char* orderDate, const char* commodity1,
+                                      const char* commodity2, const char* month1,
+                                      const char* month2, const char* strike1, const char* strike2,
+                                      const char* callPut1, const char* callPut2, char handlingFlag,
+                                      char orderKind, char priceType, char function, char flagW3,
+                                      char timeInForce, char, char side1, char side2, int quantity,
+                                      int, int price, int* status) {
   return EncodeOrder(OrderHead::kSigned,
                      {AsText(branch), AsText(identity), AsText(password), AsText(orderDate)},
-                     NameOrder(reference, commodity1, commodity2, month1, month2, strike1, strike2,
-                               callPut1, callPut2, n6, orderKind, priceType, function, w3,
-                               timeInForce, side1, side2, quantity, price),
+                     NameOrder(orderReference, commodity1, commodity2, month1, month2, strike1,
+                               strike2, callPut1, callPut2, handlingFlag, orderKind, priceType,
+                               function, flagW3, timeInForce, side1, side2, quantity, price),
                      status);
 }
 
-int CGatewayFut::EncodeSubmitOrderRecord(const char* reference, const char*, const char* commodity1,
-                                         const char* commodity2, const char* month1,
-                                         const char* month2, const char* strike1,
-                                         const char* strike2, const char* callPut1,
-                                         const char* callPut2, char n6, char orderKind,
-                                         char priceType, char function, char w3, char timeInForce,
-                                         char, char side1, char side2, int quantity, int, int price,
-                                         char* body, char* signature) {
+int CGatewayFut::EncodeSubmitOrderRecord(
+    const char* orderReference, const char*, const char* commodity1, const char* commodity2,
+    const char* month1, const char* month2, const char* strike1, const char* strike2,
+    const char* callPut1, const char* callPut2, char handlingFlag, char orderKind, char priceType,
+    char function, char flagW3, char timeInForce, char, char side1, char side2, int quantity, int,
+    int price, char* body, char* signature) {
   return EncodeRecord(*this,
-                      NameOrder(reference, commodity1, commodity2, month1, month2, strike1, strike2,
-                                callPut1, callPut2, n6, orderKind, priceType, function, w3,
-                                timeInForce, side1, side2, quantity, price),
+                      NameOrder(orderReference, commodity1, commodity2, month1, month2, strike1,
+                                strike2, callPut1, callPut2, handlingFlag, orderKind, priceType,
+                                function, flagW3, timeInForce, side1, side2, quantity, price),
                       SignPlain, body, signature);
 }
 
 int CGatewayFut::EncodeSubmitOrderRecord1(
-    const char* reference, const char*, const char* commodity1, const char* commodity2,
+    const char* orderReference, const char*, const char* commodity1, const char* commodity2,
     const char* month1, const char* month2, const char* strike1, const char* strike2,
-    const char* callPut1, const char* callPut2, char n6, char orderKind, char priceType,
-    char function, char w3, char timeInForce, char, char side1, char side2, int quantity, int,
+    const char* callPut1, const char* callPut2, char handlingFlag, char orderKind, char priceType,
+    char function, char flagW3, char timeInForce, char, char side1, char side2, int quantity, int,
     int price, char* body, char* signature) {
   return EncodeRecord(*this,
-                      NameOrder(reference, commodity1, commodity2, month1, month2, strike1, strike2,
-                                callPut1, callPut2, n6, orderKind, priceType, function, w3,
-                                timeInForce, side1, side2, quantity, price),
+                      NameOrder(orderReference, commodity1, commodity2, month1, month2, strike1,
+                                strike2, callPut1, callPut2, handlingFlag, orderKind, priceType,
+                                function, flagW3, timeInForce, side1, side2, quantity, price),
                       SignInPlaces, body, signature);
 }

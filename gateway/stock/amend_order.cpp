@@ -31,7 +31,7 @@ const char* FindFaultTagged(const StockOrder& order) {
 }
 
 OrderReference SplitReference(const StockOrder& order) {
-  return OrderReference(order.reference, kReferenceSize);
+  return OrderReference(order.orderReference, kReferenceSize);
 }
 
 // A body begins alike in every form; `rest` are the values of the format's own marks. One piece: a
@@ -48,7 +48,7 @@ void WriteBody(CTextWriter& line, Format format, const StockOrder& order,
 void WriteCancel(CTextWriter& line, const StockOrder& order, const OrderKey& key) {
   const OrderReference reference = SplitReference(order);
   WriteBody(line, WIRE("|10=%08d|36=%s|46=%s|28=%d|29=%s|31=%d|32=%c|N6=%d|27=%d|UT=1000|13=%c"),
-            order, reference, order.n6, order.kind, order.flag13);
+            order, reference, order.handlingFlag, order.kind, order.flag13);
   OpenPayload(line, key);
   line.Append(WIRE("_%s_%c_%s__"), reference.orderNumber, order.side, order.stockCode);
 }
@@ -57,7 +57,8 @@ void WriteChange(CTextWriter& line, const StockOrder& order, const OrderKey& key
   const OrderReference reference = SplitReference(order);
   WriteBody(line,
             WIRE("|10=%08d|36=%s|46=%s|28=%d|29=%s|31=%d|32=%c|37=%d|N6=%d|27=%d|UT=%d|13=%c"),
-            order, reference, SentQuantity(order), order.n6, order.kind, order.unit, order.flag13);
+            order, reference, SentQuantity(order), order.handlingFlag, order.kind, order.unit,
+            order.flag13);
   OpenPayload(line, key);
   line.Append(WIRE("_%s_%c_%s_%d_"), reference.orderNumber, order.side, order.stockCode,
               SentQuantity(order));
@@ -65,7 +66,7 @@ void WriteChange(CTextWriter& line, const StockOrder& order, const OrderKey& key
 
 void WriteTaggedBody(CTextWriter& line, const StockOrder& order, const OrderReference& reference) {
   WriteBody(line, WIRE("|10=%08d|36=%s|46=%s|28=%d|29=%s|31=%d|32=%c|37=%d|N6=%d|27=%d|UT=%d"),
-            order, reference, SentQuantity(order), order.n6, order.kind, order.unit);
+            order, reference, SentQuantity(order), order.handlingFlag, order.kind, order.unit);
 }
 
 // In tag PL the columns of order kind, price kind and price stay empty, for a cancellation the
@@ -94,41 +95,49 @@ constexpr OrderForm kTaggedChange = {'C', OrderHead::kSigned, FindFaultTagged, W
 }  // namespace
 
 char* CGatewayStk::CancelOrderEncode(const char* branch, const char* identity, const char* password,
-                                     const char* stockCode, const char* date, const char* reference,
-                                     long quantity, long unit, long price, char side, char flag13,
-                                     char orderKind, char unread, char tradeType, char n6,
+                                     const char* stockCode, const char* orderDate,
+                                     const char* orderReference, long quantity, long unit,
+                                     long price, char side, char flag13, char orderKind,
+                                     char unreadPriceKind, char tradeType, char handlingFlag,
                                      int* status) {
-  const StockOrder order(branch, identity, password, stockCode, date, reference, quantity, unit,
-                         price, side, flag13, orderKind, unread, tradeType, n6);
+  const StockOrder order(branch, identity, password, stockCode, orderDate, orderReference, quantity,
+                         unit, price, side, flag13, orderKind, unreadPriceKind, tradeType,
+                         handlingFlag);
   return EncodeOrder(kCancel, order, status);
 }
 
 char* CGatewayStk::CancelOrderEncode1(const char* branch, const char* identity,
-                                      const char* password, const char* stockCode, const char* date,
-                                      const char* reference, long quantity, long unit, long price,
-                                      char side, char flag13, char orderKind, char unread,
-                                      char tradeType, char n6, int* status) {
-  const StockOrder order(branch, identity, password, stockCode, date, reference, quantity, unit,
-                         price, side, flag13, orderKind, unread, tradeType, n6);
+                                      const char* password, const char* stockCode,
+                                      const char* orderDate, const char* orderReference,
+                                      long quantity, long unit, long price, char side, char flag13,
+                                      char orderKind, char unreadPriceKind, char tradeType,
+                                      char handlingFlag, int* status) {
+  const StockOrder order(branch, identity, password, stockCode, orderDate, orderReference, quantity,
+                         unit, price, side, flag13, orderKind, unreadPriceKind, tradeType,
+                         handlingFlag);
   return EncodeOrder(kTaggedCancel, order, status);
 }
 
 char* CGatewayStk::ChangeOrderEncode(const char* branch, const char* identity, const char* password,
-                                     const char* stockCode, const char* date, const char* reference,
-                                     long quantity, long unit, long price, char side, char flag13,
-                                     char orderKind, char unread, char tradeType, char n6,
+                                     const char* stockCode, const char* orderDate,
+                                     const char* orderReference, long quantity, long unit,
+                                     long price, char side, char flag13, char orderKind,
+                                     char unreadPriceKind, char tradeType, char handlingFlag,
                                      int* status) {
-  const StockOrder order(branch, identity, password, stockCode, date, reference, quantity, unit,
-                         price, side, flag13, orderKind, unread, tradeType, n6);
+  const StockOrder order(branch, identity, password, stockCode, orderDate, orderReference, quantity,
+                         unit, price, side, flag13, orderKind, unreadPriceKind, tradeType,
+                         handlingFlag);
   return EncodeOrder(kChange, order, status);
 }
 
 char* CGatewayStk::ChangeOrderEncode1(const char* branch, const char* identity,
-                                      const char* password, const char* stockCode, const char* date,
-                                      const char* reference, long quantity, long unit, long price,
-                                      char side, char flag13, char orderKind, char unread,
-                                      char tradeType, char n6, int* status) {
-  const StockOrder order(branch, identity, password, stockCode, date, reference, quantity, unit,
-                         price, side, flag13, orderKind, unread, tradeType, n6);
+                                      const char* password, const char* stockCode,
+                                      const char* orderDate, const char* orderReference,
+                                      long quantity, long unit, long price, char side, char flag13,
+                                      char orderKind, char unreadPriceKind, char tradeType,
+                                      char handlingFlag, int* status) {
+  const StockOrder order(branch, identity, password, stockCode, orderDate, orderReference, quantity,
+                         unit, price, side, flag13, orderKind, unreadPriceKind, tradeType,
+                         handlingFlag);
   return EncodeOrder(kTaggedChange, order, status);
 }

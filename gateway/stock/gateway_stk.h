@@ -15,45 +15,49 @@ class CGatewayStk : public CGatewayPub {
   CGatewayStk() = default;
   ~CGatewayStk() override;
 
-  // New orders. `identity` is the user's ID number and account joined by '&'; `date` is in the
+  // New orders. `identity` is the user's ID number and account joined by '&'; `orderDate` is in the
   // Republic of China calendar (1130115) or empty. `quantity` is above 0 and counts lots of `unit`
   // shares for the trade types 0 and 3, shares for 2; `price` is in hundredths. Order kind, price
   // kind, trade type and N6 flag are unsigned bytes; side and tag-13 flag are sent as they are.
   //
   // SubmitOrderEncode carries its signature payload bare in tag 33, SubmitOrderEncode1 in tag PL.
   char* SubmitOrderEncode(const char* branch, const char* identity, const char* password,
-                          const char* stockCode, const char* date, long quantity, long unit,
+                          const char* stockCode, const char* orderDate, long quantity, long unit,
                           long price, char side, char flag13, char orderKind, char priceKind,
-                          char tradeType, char n6, int* status);
+                          char tradeType, char handlingFlag, int* status);
   char* SubmitOrderEncode1(const char* branch, const char* identity, const char* password,
-                           const char* stockCode, const char* date, long quantity, long unit,
+                           const char* stockCode, const char* orderDate, long quantity, long unit,
                            long price, char side, char flag13, char orderKind, char priceKind,
-                           char tradeType, char n6, int* status);
+                           char tradeType, char handlingFlag, int* status);
 
   // The brief order: header and trade type alone, nothing checked. When the header fails its
   // message comes with the trade type behind it.
   char* SubmitOrderEncode2(const char* branch, const char* identity, const char* password,
                            char function, char tradeType);
 
-  // Cancellations and changes of the order that `reference`, two numbers joined by '&', names.
-  // Other arguments as in a new order, with neither quantity nor price checked; `unread` is sent by
-  // none. The payload is bare, or in tag PL for the names that end in 1.
+  // Cancellations and changes of the order that `orderReference`, two numbers joined by '&', names.
+  // Other arguments as in a new order, with neither quantity nor price checked; `unreadPriceKind`
+  // is sent by none. The payload is bare, or in tag PL for the names that end in 1.
   char* CancelOrderEncode(const char* branch, const char* identity, const char* password,
-                          const char* stockCode, const char* date, const char* reference,
+                          const char* stockCode, const char* orderDate, const char* orderReference,
                           long quantity, long unit, long price, char side, char flag13,
-                          char orderKind, char unread, char tradeType, char n6, int* status);
+                          char orderKind, char unreadPriceKind, char tradeType, char handlingFlag,
+                          int* status);
   char* CancelOrderEncode1(const char* branch, const char* identity, const char* password,
-                           const char* stockCode, const char* date, const char* reference,
+                           const char* stockCode, const char* orderDate, const char* orderReference,
                            long quantity, long unit, long price, char side, char flag13,
-                           char orderKind, char unread, char tradeType, char n6, int* status);
+                           char orderKind, char unreadPriceKind, char tradeType, char handlingFlag,
+                           int* status);
   char* ChangeOrderEncode(const char* branch, const char* identity, const char* password,
-                          const char* stockCode, const char* date, const char* reference,
+                          const char* stockCode, const char* orderDate, const char* orderReference,
                           long quantity, long unit, long price, char side, char flag13,
-                          char orderKind, char unread, char tradeType, char n6, int* status);
+                          char orderKind, char unreadPriceKind, char tradeType, char handlingFlag,
+                          int* status);
   char* ChangeOrderEncode1(const char* branch, const char* identity, const char* password,
-                           const char* stockCode, const char* date, const char* reference,
+                           const char* stockCode, const char* orderDate, const char* orderReference,
                            long quantity, long unit, long price, char side, char flag13,
-                           char orderKind, char unread, char tradeType, char n6, int* status);
+                           char orderKind, char unreadPriceKind, char tradeType, char handlingFlag,
+                           int* status);
 
   // The gateway's answer to a new order: "number@date@@accepted!".
   char* SubmitOrderDecode(const char* reply, int* status);
@@ -84,10 +88,10 @@ class CGatewayStk : public CGatewayPub {
                               const char* stockCode, int* status);
   char* QueryCreditInfoDecode(const char* reply, int* status);
 
-  // The settlement of a period: `period` is a selector 1 to 6, or the first day, with `endDate` the
-  // last. 17 fields to a record, in the layout of the brokerage JZG too.
+  // The settlement of a period: `periodOrStartDate` is a selector 1 to 6, or the first day, with
+  // `endDate` the last. 17 fields to a record, in the layout of the brokerage JZG too.
   char* PaymentEncode(const char* branch, const char* identity, const char* password,
-                      const char* period, const char* endDate, int* status);
+                      const char* periodOrStartDate, const char* endDate, int* status);
   char* PaymentDecode(const char* reply, int* status);
   char* PaymentDecodeJZG(const char* reply, int* status);
 

@@ -32,7 +32,7 @@ int Hundredths(const StockOrder& order) {
 
 void WriteBody(CTextWriter& line, const StockOrder& order) {
   line.Append(WIRE("|27=%d|28=%d|29=%s|30=%d|UT=%d|13=%c|N6=%d"), order.kind, order.tradeType,
-              order.stockCode, SentQuantity(order), order.unit, order.flag13, order.n6);
+              order.stockCode, SentQuantity(order), order.unit, order.flag13, order.handlingFlag);
   if (HasLimit(order)) {
     line.Append(WIRE("|31=%d.%02d|M8=0|32=%c|33="), Whole(order), Hundredths(order), order.side);
   } else if (order.tradeType == kFixedPrice) {
@@ -75,20 +75,21 @@ constexpr OrderForm kTaggedOrder = {'I', OrderHead::kSigned, FindFault, WriteTag
 }  // namespace
 
 char* CGatewayStk::SubmitOrderEncode(const char* branch, const char* identity, const char* password,
-                                     const char* stockCode, const char* date, long quantity,
+                                     const char* stockCode, const char* orderDate, long quantity,
                                      long unit, long price, char side, char flag13, char orderKind,
-                                     char priceKind, char tradeType, char n6, int* status) {
-  const StockOrder order(branch, identity, password, stockCode, date, nullptr, quantity, unit,
-                         price, side, flag13, orderKind, priceKind, tradeType, n6);
+                                     char priceKind, char tradeType, char handlingFlag,
+                                     int* status) {
+  const StockOrder order(branch, identity, password, stockCode, orderDate, nullptr, quantity, unit,
+                         price, side, flag13, orderKind, priceKind, tradeType, handlingFlag);
   return EncodeOrder(kBareOrder, order, status);
 }
 
 char* CGatewayStk::SubmitOrderEncode1(const char* branch, const char* identity,
-                                      const char* password, const char* stockCode, const char* date,
-                                      long quantity, long unit, long price, char side, char flag13,
-                                      char orderKind, char priceKind, char tradeType, char n6,
-                                      int* status) {
-  const StockOrder order(branch, identity, password, stockCode, date, nullptr, quantity, unit,
-                         price, side, flag13, orderKind, priceKind, tradeType, n6);
+                                      const char* password, const char* stockCode,
+                                      const char* orderDate, long quantity, long unit, long price,
+                                      char side, char flag13, char orderKind, char priceKind,
+                                      char tradeType, char handlingFlag, int* status) {
+  const StockOrder order(branch, identity, password, stockCode, orderDate, nullptr, quantity, unit,
+                         price, side, flag13, orderKind, priceKind, tradeType, handlingFlag);
   return EncodeOrder(kTaggedOrder, order, status);
 }

@@ -151,15 +151,16 @@ char* ListPayments(CGatewayStk& gateway, const char* reply, const PaymentLayout&
 }  // namespace
 
 char* CGatewayStk::PaymentEncode(const char* branch, const char* identity, const char* password,
-                                 const char* period, const char* endDate, int* status) {
+                                 const char* periodOrStartDate, const char* endDate, int* status) {
   CTextWriter line = StartQuery(branch, identity, password, status);
   if (*status != 1) return line.Text();
   line.AppendText("|FUNC=6|H4=1");
-  if (const char* const code = PeriodCodeOf(period)) {
+  if (const char* const code = PeriodCodeOf(periodOrStartDate)) {
     line.Append(WIRE("|SDATE=%s|EDATE="), code);
   } else {
-    if (AsText(period).empty() || AsText(endDate).empty()) return Fail(line, status, kDateError);
-    line.Append(WIRE("|SDATE=%s|EDATE=%s"), period, endDate);
+    if (AsText(periodOrStartDate).empty() || AsText(endDate).empty())
+      return Fail(line, status, kDateError);
+    line.Append(WIRE("|SDATE=%s|EDATE=%s"), periodOrStartDate, endDate);
   }
   line.AppendText("|01=");
   return FinishEscaped(line, status, kBadParameters);

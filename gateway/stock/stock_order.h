@@ -12,12 +12,13 @@
 // are sent as characters. Texts are the host's and outlive the order.
 struct StockOrder {
   StockOrder(const char* hostBranch, const char* hostIdentity, const char* hostPassword,
-             const char* hostStockCode, const char* hostDate, const char* hostReference,
+             const char* hostStockCode, const char* hostOrderDate, const char* hostReference,
              long hostQuantity, long hostUnit, long hostPrice, char hostSide, char hostFlag13,
-             char hostKind, char hostPriceKind, char hostTradeType, char hostN6)
-      : origin{AsText(hostBranch), AsText(hostIdentity), AsText(hostPassword), AsText(hostDate)},
+             char hostKind, char hostPriceKind, char hostTradeType, char hostHandlingFlag)
+      : origin{AsText(hostBranch), AsText(hostIdentity), AsText(hostPassword),
+               AsText(hostOrderDate)},
         stockCode(AsText(hostStockCode)),
-        reference(AsText(hostReference)),
+        orderReference(AsText(hostReference)),
         quantity(static_cast<int>(hostQuantity)),
         unit(static_cast<int>(hostUnit)),
         price(static_cast<int>(hostPrice)),
@@ -26,23 +27,23 @@ struct StockOrder {
         kind(NumberOf(hostKind)),
         priceKind(NumberOf(hostPriceKind)),
         tradeType(NumberOf(hostTradeType)),
-        n6(NumberOf(hostN6)) {}
+        handlingFlag(NumberOf(hostHandlingFlag)) {}
 
   // The number of a host's byte.
   static uint8_t NumberOf(char byte) { return static_cast<uint8_t>(byte); }
 
   OrderOrigin origin;
   std::string_view stockCode;
-  std::string_view reference;  // the order to cancel or change; empty in a new order
-  int quantity;                // lots, or shares of an odd lot
-  int unit;                    // shares per lot
-  int price;                   // hundredths
+  std::string_view orderReference;  // the order to cancel or change; empty in a new order
+  int quantity;                     // lots, or shares of an odd lot
+  int unit;                         // shares per lot
+  int price;                        // hundredths
   char side;
   char flag13;
   uint8_t kind;
   uint8_t priceKind;
   uint8_t tradeType;
-  uint8_t n6;
+  uint8_t handlingFlag;
 };
 
 // Trade types: lots, an odd lot, lots at the session's fixed price.

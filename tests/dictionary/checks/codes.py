@@ -18,21 +18,24 @@ def run(whole, program, _):
     for operation in library.operations(whole, False):
         reply = load.by_name(whole["replies"], "decoder")[operation["name"]]
         decoders[operation["name"]] = replies.Decoder(whole, operation, reply, lib, found)
-    for name, column in (("QueryOrderDecode", "type"), ("QueryReplyDecode", "type"),
-                         ("PaymentDecode", "type")):
-        _judge_types(found, tables, decoders[name], column)
-    for name in ("FutQueryOrderDecode", "FutQueryReplyDecode"):
+    wanted = set(decoders)
+    for name in wanted & {"QueryOrderDecode", "QueryReplyDecode", "PaymentDecode"}:
+        _judge_types(found, tables, decoders[name], "type")
+    for name in wanted & {"FutQueryOrderDecode", "FutQueryReplyDecode"}:
         _judge_legs(found, tables, decoders[name])
     for name, tag, column in (("FutQueryInventoryDecode", "28", "currency"),
                               ("SubmitOrderDecode", "19", "acceptance"),
                               ("FutSubmitOrderDecode", "19", "acceptance"),
                               ("QueryOrderDecode", "JV", "changeable"),
                               ("FutQueryOrderDecode", "JV", "changeable")):
-        _judge_wire(found, tables, decoders[name], tag, column)
-    _judge_time_in_force(found, tables, decoders["FutQueryOrderDecode"])
-    _judge_words(found, tables, decoders)
+        if name in wanted:
+            _judge_wire(found, tables, decoders[name], tag, column)
+    if {"QueryOrderDecode", "FutQueryOrderDecode"} <= wanted:
+        _judge_time_in_force(found, tables, decoders["FutQueryOrderDecode"])
+        _judge_words(found, tables, decoders)
     for books, name in (("stock", "QueryOrderDecode"), ("futures", "FutQueryOrderDecode")):
-        _judge_states(found, tables, decoders[name], books)
+        if name in wanted:
+            _judge_states(found, tables, decoders[name], books)
     return found.finish("codes")
 
 

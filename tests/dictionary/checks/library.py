@@ -1,5 +1,7 @@
 """Calls of the library, by the names of the dictionary, and what was found wrong."""
 
+import os
+import re
 import subprocess
 
 from generator import load
@@ -60,7 +62,10 @@ def is_letter(argument):
 
 
 def operations(whole, encoders):
-    return [one for one in whole["operations"] if load.is_encoder(one) == encoders]
+    """The encoders or decoders; DICTIONARY_ONLY in the environment narrows them by name."""
+    only = os.environ.get("DICTIONARY_ONLY", "")
+    return [one for one in whole["operations"]
+            if load.is_encoder(one) == encoders and re.match(only, one["name"])]
 
 
 def codes_of(whole, argument, operation):

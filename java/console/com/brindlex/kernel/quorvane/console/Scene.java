@@ -13,8 +13,10 @@ public enum Scene {
     STOCK_ORDER,
     /** Stock order book and fills. */
     STOCK_LIST,
-    /** Stock positions and credit figures. */
+    /** Stock positions. */
     STOCK_POSITION,
+    /** Credit figures of a stock. */
+    STOCK_CREDIT,
     /** Stock settlement. */
     SETTLEMENT,
     /** Placing, changing and cancelling futures and options orders. */

@@ -48,7 +48,7 @@ class ReadingTest {
         "CancelChangeOrderDecode, STOCK_ORDER",
         "QueryOrderDecode, STOCK_LIST",
         "QueryInventoryDecodeJZG, STOCK_POSITION",
-        "QueryCreditInfoEncode, STOCK_POSITION",
+        "QueryCreditInfoEncode, STOCK_CREDIT",
         "PaymentDecodeJZG, SETTLEMENT",
         "FutSubmitOrderEncode, FUTURES_ORDER",
         "FutQueryInventoryDecode, FUTURES_LIST",
