@@ -57,7 +57,7 @@ def _judge_tables(found, whole, files):
         if not readers:
             continue
         judged = "AnswerWithoutRecords(" in text  # by what the reply as a whole says
-        shared = "".join(files[each] for each in files if judged and each.name == "reply_code.h")
+        shared = "".join(files[each] for each in files if judged and each.suffix == ".h")
         names = load.scene_tags(whole, readers[0]["scene"])
         rows = [row for row in ROW.findall(text) if row[2] != "kNotRead"]
         records = [replies[one["name"]].get("record", {}) for one in readers]
