@@ -1,5 +1,5 @@
 // abi_digest DIRECTORY [CALLS]: plays the golden cases of a directory and a drawn load of CALLS
-// calls for each of the 59 exports, and prints one digest for each export and one over all: every
+// calls for each export, and prints one digest for each export and one over all: every
 // byte of each result, status and log line counts. It prints the same on every machine, whatever
 // its word size, sign of `char` or compiler.
 

@@ -9,14 +9,9 @@ namespace gateway_fuzz {
 
 // Tags of replies, near misses among them.
 inline constexpr const char* kTags[] = {
-    "00", "01", "67",  "68",  "M2",  "M3",  "M5",  "M8",  "M22",  "07", "10", "11", "13",
-    "14", "15", "16",  "17",  "18",  "19",  "21",  "22",  "27",   "28", "29", "31", "32",
-    "33", "34", "36",  "37",  "39",  "41",  "44",  "46",  "47",   "48", "49", "50", "51",
-    "69", "70", "75",  "76",  "77",  "78",  "79",  "81",  "82",   "84", "85", "86", "87",
-    "88", "89", "96",  "97",  "A0",  "A1",  "A2",  "B8",  "B9",   "EL", "F0", "F1", "F2",
-    "F3", "JV", "K1",  "KT",  "LO",  "MT",  "N6",  "O4",  "PN",   "PS", "QX", "QY", "R8",
-    "RA", "RF", "U5",  "U9",  "V5",  "V8",  "V9",  "W0",  "W1",   "W2", "W3", "W5", "0",
-    "6",  "M",  "751", "752", "761", "762", "771", "772", "7511", ""};
+#include "tests/fuzz/wire_tags.inc"
+    // What stands around records, what requests carry, and near misses.
+    "00", "01", "M22", "10", "11", "13", "14", "15", "0", "6", "M", "7511", ""};
 
 // Values of fields, and texts that a host passes.
 inline constexpr const char* kValues[] = {"",

@@ -45,7 +45,7 @@ def _try_sources(found, copy, kind, draw):
     """One fault at a time in a source; what must be built anew is."""
     pattern, spoil, checks, builds, folder = SOURCE_FAULTS[kind]
     places = [(str(path.relative_to(copy.top)), match)
-              for path in sorted(copy.top.glob(folder))
+              for path in sorted(copy.top.glob(folder)) if path.suffix in (".cpp", ".h")
               for match in re.finditer(pattern, path.read_text(encoding="utf-8"))]
     for path, match in draw.sample(places, EACH):
         text = copy.read(path)
@@ -198,5 +198,5 @@ SOURCE_FAULTS = {
     "argument": (r"(?:const char\*|char|int|long) (stockCode|orderKind|tradeType|price|quantity|"
                  r"side|startDate|endDate|certMsg|newPassword|queryType)(?=[,)])", _source_name,
                  ["sources"], False, "gateway/*/gateway_*.h"),
-    "code": (r"\), (\d+), \d+\}", _source_code, ["codes"], True, "gateway/stock/*.[ch]*"),
+    "code": (r"\), (\d+), \d+\}", _source_code, ["codes"], True, "gateway/stock/*"),
 }

@@ -22,7 +22,7 @@ import picocli.CommandLine.ParentCommand;
 
 /** Lists the operations, or one of them with its arguments and results. */
 @Command(name = "operations", mixinStandardHelpOptions = true, sortOptions = false,
-        description = "Lists the 59 operations, or one with its arguments, forms and columns.")
+        description = "Lists the operations, or one with its arguments, forms and columns.")
 final class OperationsCommand implements Callable<Integer> {
     @ParentCommand
     private Quorvane parent;
