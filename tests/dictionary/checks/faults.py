@@ -198,5 +198,5 @@ SOURCE_FAULTS = {
     "argument": (r"(?:const char\*|char|int|long) (stockCode|orderKind|tradeType|price|quantity|"
                  r"side|startDate|endDate|certMsg|newPassword|queryType)(?=[,)])", _source_name,
                  ["sources"], False, "gateway/*/gateway_*.h"),
-    "code": (r"\), (\d+), \d+\}", _source_code, ["codes"], True, "gateway/stock/*"),
+    "code": (r"(?:\)|kEveryNumber), (\d+), \d+\}", _source_code, ["codes"], True, "gateway/stock/*"),
 }
