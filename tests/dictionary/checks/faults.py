@@ -46,7 +46,8 @@ def _try_sources(found, copy, kind, draw):
     pattern, spoil, checks, builds, folder = SOURCE_FAULTS[kind]
     places = [(str(path.relative_to(copy.top)), match)
               for path in sorted(copy.top.glob(folder)) if path.suffix in (".cpp", ".h")
-              for match in re.finditer(pattern, path.read_text(encoding="utf-8"))]
+              for match in re.finditer(pattern, path.read_text(encoding="utf-8"))
+              if kind != "argument" or _is_of_operation(match)]
     for path, match in draw.sample(places, EACH):
         text = copy.read(path)
         spoilt, names = spoil(match)
@@ -69,6 +70,11 @@ def _expect_named(found, copy, checks, what, names, only):
             break
     found.expect(any(name in said for name in names),
                  f"{what}: no check names one of {names}; the last says {said[:300]!r}")
+
+
+def _is_of_operation(match):
+    """Whether the argument is one of an operation, not of what they are made of."""
+    return re.search(r"(En|De)code[12]?$", re.findall(r"(\w+)\(", match.string[:match.start()])[-1])
 
 
 def _decoders(text):

@@ -74,20 +74,21 @@ def _judge_rows(found, where, rows, records, names):
         here = [tag for tag in order if tag in listed]
         found.expect(listed == here, f"{where}: the dictionary reads the tags "
                                      f"{_first_difference(listed, here)} in another order")
-    listed = {row["tag"]: row for record in records for row in record.get("tags", [])}
     for name, tag, bound, skipped in rows:
-        if not found.expect(tag in listed, f"{where} reads tag {tag}; the dictionary does not"):
+        said = [row for record in records for row in record.get("tags", []) if row["tag"] == tag]
+        if not found.expect(said, f"{where} reads tag {tag}; the dictionary does not"):
             continue
-        said = names[tag]["name"]
-        found.expect(name == said[0].upper() + said[1:],
-                     f"{where}: tag {tag} is k{name}; the dictionary calls it {said}")
+        called = names[tag]["name"]
+        found.expect(name == called[0].upper() + called[1:],
+                     f"{where}: tag {tag} is k{name}; the dictionary calls it {called}")
         here = None if bound in ("kRecord", "kUnbounded") else int(bound)
-        there = listed[tag].get("bound")
-        found.expect(here == (None if there == size else there),
-                     f"{where}: tag {tag} has {bound} bytes; the dictionary has {there}")
-        found.expect(bool(skipped) == ("blanks" in listed[tag]),
-                     f"{where}: tag {tag}, blanks skipped on one side")
-    for tag in set(listed) - set(order):
+        for row in said:
+            there = row.get("bound")
+            found.expect(here == (None if there == size else there),
+                         f"{where}: tag {tag} has {bound} bytes; the dictionary has {there}")
+            found.expect(bool(skipped) == ("blanks" in row),
+                         f"{where}: tag {tag}, blanks skipped on one side")
+    for tag in {row["tag"] for record in records for row in record.get("tags", [])} - set(order):
         found.expect(False, f"{where} has no row for tag {tag}")
 
 
@@ -100,18 +101,15 @@ def _first_difference(left, right):
 
 def _judge_fields(found, where, fields, replies):
     """The fields of the whole reply."""
-    listed = {row["tag"]: row for reply in replies for row in reply.get("replyTags", [])}
-    here = {tag for tag, _, _ in fields}
+    rows = [row for reply in replies for row in reply.get("replyTags", [])]
     for tag, bound, _ in fields:
-        if tag in listed:
+        said = [row["bound"] for row in rows if row["tag"] == tag]
+        found.expect(said, f"{where} reads tag {tag} of the whole reply; the dictionary does not")
+        for each in said:
             size = SIZES.get(bound) or int(bound)
-            found.expect(size == listed[tag]["bound"],
-                         f"{where}: tag {tag} has {size} bytes; the dictionary has "
-                         f"{listed[tag]['bound']}")
-        else:
-            found.expect(False, f"{where} reads tag {tag} of the whole reply; the dictionary does "
-                                f"not")
-    for tag in set(listed) - here:
+            found.expect(size == each,
+                         f"{where}: tag {tag} has {size} bytes; the dictionary has {each}")
+    for tag in {row["tag"] for row in rows} - {tag for tag, _, _ in fields}:
         found.expect(False, f"{where} does not read tag {tag} of the whole reply")
 
 
