@@ -91,7 +91,8 @@ def _judge_wire(found, tables, decoder, tag, column):
     table = next(one["codes"] for one in decoder.columns if one["name"] == column)
     listed = {each: row["code"] for row in tables[table]["values"] for each in row["wire"].split()}
     letters = [chr(c) for c in range(ord("0"), ord("Z") + 1) if chr(c).isalnum()]
-    for letter, shown in zip(letters, _shown(decoder, column, [dict(case, **{tag: one}) for one in letters])):
+    cases = [dict(case, **{tag: letter}) for letter in letters]
+    for letter, shown in zip(letters, _shown(decoder, column, cases)):
         wanted = listed.get(letter, "")
         found.expect(shown in (wanted, REFUSED if not wanted else wanted),
                      f"{decoder.name}: tag {tag} {letter} gives {shown!r}; "
