@@ -1,7 +1,7 @@
 """The results: each decoder's columns by position, and the code tables."""
 
 from . import load, words
-from .markdown import code, link, paragraph, table
+from .markdown import block, code, link, paragraph, table
 
 SHAPES = {"empty": "empty, the status says it all", "text": "one text as the gateway sent it",
           "record": "one record", "list": "a list", "sections": "lists behind numbered marks"}
@@ -18,6 +18,8 @@ def lines(whole):
                              f"{words.sentence(SHAPES[reply['result']])}")
         for one in reply.get("tables", []):
             yield from _table(one, forms)
+        if reply.get("tables"):
+            yield from ["Example:", ""] + block([reply["exampleResult"]])
     yield from ["## Codes", ""]
     for codes in whole["codes"]:
         yield from _codes(codes)

@@ -126,6 +126,7 @@ def _add_pair(copy):
         {"at": 0, "name": "stockCode", "form": "text", "tags": ["29"], "meaning": "stock code"},
         {"at": 1, "name": "orderedQuantity", "form": "count", "tags": ["70"], "meaning": "limit"}]
     replies["replies"].append(dict(model, decoder="QueryLimitDecode", record=record,
+                                   exampleResult="1!2330@5000!",
                                    tables=[{"name": "limit", "columns": columns}]))
     copy.write("dictionary/replies.json", layout.text(replies))
 
@@ -144,6 +145,7 @@ def _add_tag(copy):
 
     replies = _rows(copy, "dictionary/replies.json")
     book = next(one for one in replies["replies"] if one["decoder"] == "QueryOrderDecode")
+    book["exampleResult"] = book["exampleResult"][:-1] + "@7!"
     book["record"]["tags"].append({"tag": "Z7", "bound": 50})
     book["tables"][0]["columns"].append(
         {"at": 14, "name": "flagZ7", "form": "text", "tags": ["Z7"], "meaning": "Z7 flag"})

@@ -92,7 +92,11 @@ class Decoder:
             for table, row in enumerate(self.parsed(answer) or []):
                 for name, text in (row or {}).items():
                     shown[table, name] = shown.get((table, name)) or text
-        problems = results.problems(self.reply, self.ask([self.line()])[0][1])
+        result = self.ask([self.line()])[0][1]
+        self.found.expect(result == self.reply["exampleResult"],
+                          f"{self.name}: the columns of the example read {result!r}; the "
+                          f"dictionary has {self.reply['exampleResult']!r}")
+        problems = results.problems(self.reply, result)
         for problem in problems:
             self.found.expect(False, f"{self.name}: {problem}")
         for column in self.columns:
