@@ -155,5 +155,4 @@ def _add_tag(copy):
     copy.replace(path, "  kChangeable\n};", "  kChangeable,\n  kFlagZ7\n};")
     copy.replace(path, '{kChangeable, "JV", 50}};', '{kChangeable, "JV", 50},\n    {kFlagZ7, "Z7", 50}};')
     copy.replace(path, '"@%s@%s@%s@%s@%s!"', '"@%s@%s@%s@%s@%s@%s!"')
-    copy.replace(path, "ChangeFlagOf(record, failure));",
-                 "ChangeFlagOf(record, failure), record.Text(kFlagZ7));")
+    copy.replace(path, "!message.empty()));", "!message.empty()), record.Text(kFlagZ7));")
