@@ -81,10 +81,9 @@ char* WriteDecimal(char* at, int64_t value, size_t width);
 template <size_t kWidth>
 inline char* WriteNumber(char* at, int64_t value) {
   constexpr size_t kDigits = kWidth == 0 ? 1 : kWidth;
-  if (value >= 0 && static_cast<uint64_t>(value) < PowerOfTen(kDigits)) {
-    return WriteDigits<kDigits>(at, static_cast<uint32_t>(value));
-  }
-  return WriteDecimal(at, value, kWidth);
+  constexpr uint64_t kEnd = PowerOfTen(kDigits);  // below every negative number, taken unsigned
+  if (static_cast<uint64_t>(value) >= kEnd) return WriteDecimal(at, value, kWidth);
+  return WriteDigits<kDigits>(at, static_cast<uint32_t>(value));
 }
 
 #endif  // QUORVANE_GATEWAY_CORE_DECIMAL_H_
