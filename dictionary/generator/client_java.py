@@ -132,8 +132,12 @@ def _bounds(operation, argument):
     if argument["type"] != "String":
         low = argument.get("min", -(2**31) if argument["type"] == "int" else 0)
         return low, argument.get("max", 2**31 - 1 if argument["type"] == "int" else 255)
-    if operation in UNBOUNDED and argument["name"] == "certMsg":
-        return 0, 2**31 - 1
+    if argument["name"] == "certMsg":
+        # the Base64 of fewer bytes carries none of them
+        return 3, 2**31 - 1 if operation in UNBOUNDED else LENGTHS["certMsg"]
+    if argument["name"] == "serialNo":
+        # one that fills its field runs on into the address
+        return 0, argument["maxLength"] - 1
     return 0, argument.get("maxLength", LENGTHS.get(argument["name"], USUAL_LENGTH))
 
 

@@ -43,7 +43,7 @@ public final class Argument {
      * An argument.
      *
      * @param usual the value when none is given; null when one must be
-     * @param min the least number
+     * @param min the least number; the least length of a text in bytes
      * @param max the greatest number; the greatest length of a text in bytes
      * @param characters a regular expression for each character of a text; empty for any
      */
@@ -121,8 +121,9 @@ public final class Argument {
             return foreign;
         }
         int length = Texts.utf8Length(text);
-        if (length > max) {
-            return "must have at most " + max + " bytes, not " + length;
+        if (length > max || length < min) {
+            return "must have " + (length > max ? "at most " + max : "at least " + min)
+                    + " bytes, not " + length;
         }
         if (!characters.isEmpty() && !text.matches("(" + characters + ")*")) {
             return "must consist of " + characters;

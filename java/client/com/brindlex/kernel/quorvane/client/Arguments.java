@@ -5,7 +5,7 @@ final class Arguments {
     static final Argument MARKET = new Argument("market", Argument.Type.INT, "1", 0, 200, "", "market code: 0 to 100 asks for securities, any other for futures");
     static final Argument PLATFORM = new Argument("platform", Argument.Type.INT, "0", 0, 14, "", "row of the client edition; a row outside the table is sent as `NO DEFINE`");
     static final Argument SEQ_NO = new Argument("seqNo", Argument.Type.INT, "0", 0, 2147483647, "", "request number, counted by the app; its last two digits go into the request id (-1 counts as 95)");
-    static final Argument SERIAL_NO = new Argument("serialNo", Argument.Type.TEXT, null, 0, 20, "[!-~]", "serial number of the device; a longer one is cut, and one of 20 characters runs on into the address");
+    static final Argument SERIAL_NO = new Argument("serialNo", Argument.Type.TEXT, null, 0, 19, "[!-~]", "serial number of the device; a longer one is cut, and one of 20 characters runs on into the address");
     static final Argument LOCAL_IP = new Argument("localIP", Argument.Type.TEXT, null, 0, 64, "[0-9A-Za-z.:%]", "address of the device in text form, empty without a network; a longer one is cut");
     static final Argument BRANCH = new Argument("branch", Argument.Type.TEXT, null, 0, 16, "[0-9A-Za-z]", "branch code of the brokerage");
     static final Argument IDENTITY = new Argument("identity", Argument.Type.TEXT, null, 0, 79, "", "ID number and account, in either order, joined by `&`; either may be empty");
@@ -19,8 +19,8 @@ final class Arguments {
     static final Argument TIME = new Argument("time", Argument.Type.SMALL, "0", 0, 255, "", "code of a time, sent as a number");
     static final Argument ITEM = new Argument("item", Argument.Type.SMALL, "0", 0, 255, "", "code of an item, sent as a number");
     static final Argument NEW_PASSWORD = new Argument("newPassword", Argument.Type.TEXT, null, 0, 256, "", "the password to change to");
-    static final Argument CERT_MSG = new Argument("certMsg", Argument.Type.TEXT, null, 0, 2147483647, "", "certificate message: opaque text of the certificate software, not empty; sent as Base64");
-    static final Argument CERT_MSG_2 = new Argument("certMsg", Argument.Type.TEXT, null, 0, 2600, "", "certificate message: opaque text of the certificate software, not empty; sent as Base64");
+    static final Argument CERT_MSG = new Argument("certMsg", Argument.Type.TEXT, null, 3, 2147483647, "", "certificate message: opaque text of the certificate software, not empty; sent as Base64");
+    static final Argument CERT_MSG_2 = new Argument("certMsg", Argument.Type.TEXT, null, 3, 2600, "", "certificate message: opaque text of the certificate software, not empty; sent as Base64");
     static final Argument BIRTH = new Argument("birth", Argument.Type.TEXT, null, 0, 32, "", "date of birth of the holder, sent exactly as given");
     static final Argument STOCK_CODE = new Argument("stockCode", Argument.Type.TEXT, null, 0, 6, "[0-9A-Za-z]", "stock code");
     static final Argument ORDER_DATE = new Argument("orderDate", Argument.Type.TEXT, "", 0, 256, "", "date of the order, `1130115`; empty for none (date, Republic of China calendar)");

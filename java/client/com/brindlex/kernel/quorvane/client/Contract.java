@@ -85,6 +85,12 @@ public final class Contract {
 
     /** Writes the contract into leg 1 or 2 of a request. */
     void fill(Draft<?> draft, int leg) {
+        if (commodity.isEmpty()) {
+            draft.refuse("commodity" + leg, "must be given");
+        }
+        if (month.isEmpty()) {
+            draft.refuse("month" + leg, "must be given");
+        }
         if (isOption()
                 && (strike.signum() <= 0 || strike.scale() > 4 || strike.precision() > 10)) {
             draft.refuse("strike" + leg, "must be above 0 with at most 4 decimals, not " + strike);

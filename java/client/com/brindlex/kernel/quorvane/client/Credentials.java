@@ -8,8 +8,8 @@ import org.jetbrains.annotations.NotNull;
  */
 public final class Credentials {
     private final String branch;
-    private final String idNumber;
-    private final String account;
+    private final String idNumber;  // null for a user by account alone
+    private final String account;   // null for a user by ID number alone
     private final String password;
 
     private Credentials(String branch, String idNumber, String account, String password) {
@@ -37,14 +37,14 @@ public final class Credentials {
     @NotNull
     public static Credentials ofIdNumber(
             @NotNull String branch, @NotNull String idNumber, @NotNull String password) {
-        return new Credentials(branch, idNumber, "", password);
+        return new Credentials(branch, idNumber, null, password);
     }
 
     /** A user by account alone. */
     @NotNull
     public static Credentials ofAccount(
             @NotNull String branch, @NotNull String account, @NotNull String password) {
-        return new Credentials(branch, "", account, password);
+        return new Credentials(branch, null, account, password);
     }
 
     /** The same user with another password. */
@@ -62,13 +62,13 @@ public final class Credentials {
     /** ID number; empty for a user by account alone. */
     @NotNull
     public String idNumber() {
-        return idNumber;
+        return idNumber == null ? "" : idNumber;
     }
 
     /** Account; empty for a user by ID number alone. */
     @NotNull
     public String account() {
-        return account;
+        return account == null ? "" : account;
     }
 
     /** Trading password. */
@@ -85,16 +85,13 @@ public final class Credentials {
 
     /** Writes the identity into a request. */
     void identify(Draft<?> draft) {
-        if (!idNumber.isEmpty() && !idNumber.matches("[A-Za-z0-9]{8,10}")) {
+        if (idNumber != null && !idNumber.matches("[A-Za-z0-9]{8,10}")) {
             draft.refuse("idNumber", "must have 8 to 10 letters and digits");
         }
-        if (!account.isEmpty() && !account.matches("[0-9]{2,7}")) {
+        if (account != null && !account.matches("[0-9]{2,7}")) {
             draft.refuse("account", "must have 2 to 7 digits");
         }
-        if (idNumber.isEmpty() && account.isEmpty()) {
-            draft.refuse("identity", "must name an ID number or an account");
-        }
-        draft.set("identity", idNumber.isEmpty() ? account + "&" : idNumber + "&" + account);
+        draft.set("identity", idNumber == null ? account + "&" : idNumber + "&" + account());
     }
 
     @Override
@@ -103,17 +100,17 @@ public final class Credentials {
             return false;
         }
         Credentials user = (Credentials) other;
-        return user.branch.equals(branch) && user.idNumber.equals(idNumber)
-                && user.account.equals(account) && user.password.equals(password);
+        return user.branch.equals(branch) && user.idNumber().equals(idNumber())
+                && user.account().equals(account()) && user.password.equals(password);
     }
 
     @Override
     public int hashCode() {
-        return (branch.hashCode() * 31 + idNumber.hashCode()) * 31 + account.hashCode();
+        return (branch.hashCode() * 31 + idNumber().hashCode()) * 31 + account().hashCode();
     }
 
     @Override
     public String toString() {
-        return "Credentials(branch " + branch + ", account " + account + ")";
+        return "Credentials(branch " + branch + ", account " + account() + ")";
     }
 }

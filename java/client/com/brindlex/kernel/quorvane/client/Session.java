@@ -28,7 +28,7 @@ public final class Session {
      * A session on the securities market of a brokerage with the usual layouts, from a client
      * without a name of its own, whose first request has the number 0.
      *
-     * @param serialNumber serial number of the device, at most 20 characters
+     * @param serialNumber serial number of the device, at most 19 characters
      * @param localAddress address of the device, at most 64 characters; without one no request goes
      */
     @NotNull

@@ -34,7 +34,7 @@ final class DemoLogin {
         stage.refusedHere("A device without network address",
                 () -> Requests.of(Stage.SESSION.withLocalAddress(""), USER).login(), "localIP");
         stage.refusedHere("An account that is none and a password that forges a field",
-                () -> stage.as(Credentials.of("9A01", "", "12-34", "x|PWD=y")).login(),
+                () -> stage.as(Credentials.ofAccount("9A01", "12-34", "x|PWD=y")).login(),
                 "account", "password");
     }
 

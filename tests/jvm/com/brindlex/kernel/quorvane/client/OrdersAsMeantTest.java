@@ -133,10 +133,10 @@ final class OrdersAsMeantTest {
         }
         assertEquals(List.of("idNumber"), refused(() -> Requests.of(
                 SESSION, Credentials.of("9A01", "A1&345678", "1234567", "x")).login()));
-        assertEquals(List.of("identity"), refused(() -> Requests.of(
+        assertEquals(List.of("idNumber", "account"), refused(() -> Requests.of(
                 SESSION, Credentials.of("9A01", "", "", "x")).login()));
         assertEquals(List.of("branch", "password"), refused(() -> Requests.of(
-                SESSION, Credentials.of("", "A123456789", "", "")).login()));
+                SESSION, Credentials.ofIdNumber("", "A123456789", "")).login()));
     }
 
     @Test
