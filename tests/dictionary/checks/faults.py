@@ -78,10 +78,10 @@ def _is_of_operation(match):
 
 
 def _decoders(text):
-    """A pattern of the operations that a source defines."""
+    """A pattern of the operations that a source defines; of all for a header that they share."""
     prefix = "Fut" if "CGatewayFut::" in text else ""
     names = {prefix + name for name in re.findall(r"::(\w+(?:En|De)code\w*)\(", text)}
-    return "|".join(sorted(names | {"QueryFinanceDecode"} if prefix else names)) or "None"
+    return "|".join(sorted(names | {"QueryFinanceDecode"} if prefix else names))  # all, for what they share
 
 
 def _at(whole, place):
