@@ -81,7 +81,7 @@ def _decoders(text):
     """A pattern of the operations that a source defines; of all for a header that they share."""
     prefix = "Fut" if "CGatewayFut::" in text else ""
     names = {prefix + name for name in re.findall(r"::(\w+(?:En|De)code\w*)\(", text)}
-    return "|".join(sorted(names | {"QueryFinanceDecode"} if prefix else names))  # all, for what they share
+    return "|".join(sorted(names | {"QueryFinanceDecode"} if prefix else names))
 
 
 def _at(whole, place):
