@@ -72,11 +72,11 @@ final class LogOptions {
         return open(stream());
     }
 
-    LogReader open(InputStream stream) throws IOException {
+    LogReader open(InputStream stream) {
         return new LogReader(lines(stream), tag);
     }
 
-    LineReader lines(InputStream stream) throws IOException {
+    LineReader lines(InputStream stream) {
         return new LineReader(stream, isMessage() ? StandardCharsets.UTF_8 : charset);
     }
 

@@ -19,6 +19,7 @@ final class Joining {
 
     /** A text this long may go on in the next entry of an app that logs in pieces. */
     private static final int LIKELY_CUT = 900;
+    private static final int ROUND_PIECES = 3000;
 
     private final List<LogEntry> entries = new ArrayList<>(1);
     private final List<Integer> splits = new ArrayList<>(0);
@@ -71,8 +72,12 @@ final class Joining {
     }
 
     private boolean isCutReply() {
-        return kind == Kind.REPLY && bytes >= LIKELY_CUT && text.lastIndexOf("|00=")
-                > text.lastIndexOf("|01=");
+        if (kind != Kind.REPLY || bytes < LIKELY_CUT) {
+            return false;
+        }
+        int end = text.lastIndexOf("|01=");
+        boolean ends = end == text.length() - "|01=".length();
+        return text.lastIndexOf("|00=") > end || isPiece() && !ends;
     }
 
     /** Takes a line that goes on with the message; whether it did. */
@@ -101,28 +106,32 @@ final class Joining {
         }
         String more = entry.text();
         if (isOpenBase64()) {
-            return BASE64.matcher(more).matches();
+            return BASE64.matcher(more).matches() && !begins(more)
+                    && text.length() < LineReader.LONGEST;
         }
         Kind its = MessageReader.kind(more);
         boolean another = its == Kind.END || its == Kind.LENGTH || its == Kind.REQUEST
                 || its == Kind.HEADER || its == Kind.MARK || its == Kind.RESULT
-                || more.startsWith("F=7|") || more.startsWith("F=1|");
+                || begins(more);
         return !another && text.length() < LineReader.LONGEST
                 && (expected < 0 || bytes + bytes(more) <= expected);
     }
 
-    /** Whether a line feed stood before a line, or the text was logged in pieces. */
-    private boolean isFeed(String more) {
-        if (expected >= 0) {
-            int whole = bytes + bytes(more);
-            return whole + 1 <= expected && !(isFull() && whole == expected);
-        }
-        return isOpenBase64() || !isFull();
+    private static boolean begins(String text) {
+        return text.startsWith("F=7|") || text.startsWith("F=1|");
     }
 
-    /** Whether the last line is as long as lines become where a text is logged in pieces. */
-    private boolean isFull() {
-        return bytes(entries.get(entries.size() - 1).text()) >= LIKELY_CUT;
+    /** Whether a line feed stood before a line; where a text is logged in pieces none did. */
+    private boolean isFeed(String more) {
+        boolean room = expected < 0 || bytes + bytes(more) < expected;
+        return isOpenBase64() || room && !isPiece();
+    }
+
+    /** Whether the last line is as long as pieces are: a round number, or what an entry holds. */
+    private boolean isPiece() {
+        String last = entries.get(entries.size() - 1).text();
+        return bytes(last) >= ROUND_PIECES
+                || last.length() >= LIKELY_CUT && last.length() % 100 == 0;
     }
 
     LogMessage message() {

@@ -18,10 +18,11 @@ public final class LineReader implements Closeable {
     /** The characters that are kept of a line. */
     public static final int LONGEST = 1 << 20;
 
-    private final Reader in;
+    private final InputStream stream;
     private final char[] buffer = new char[8192];
     private final StringBuilder line = new StringBuilder();
-    private final Charset charset;
+    private Charset charset;
+    private Reader in;
     private int at;
     private int filled;
     private long number;
@@ -32,12 +33,19 @@ public final class LineReader implements Closeable {
      *
      * @param charset of a stream without a byte order mark
      */
-    public LineReader(InputStream stream, Charset charset) throws IOException {
-        PushbackInputStream bytes = new PushbackInputStream(stream, 3);
-        this.charset = marked(bytes, charset);
-        this.in = new InputStreamReader(bytes, this.charset.newDecoder()
-                .onMalformedInput(CodingErrorAction.REPLACE)
-                .onUnmappableCharacter(CodingErrorAction.REPLACE));
+    public LineReader(InputStream stream, Charset charset) {
+        this.stream = stream;
+        this.charset = charset;
+    }
+
+    private void begin() throws IOException {
+        if (in == null) {
+            PushbackInputStream bytes = new PushbackInputStream(stream, 3);
+            charset = marked(bytes, charset);
+            in = new InputStreamReader(bytes, charset.newDecoder()
+                    .onMalformedInput(CodingErrorAction.REPLACE)
+                    .onUnmappableCharacter(CodingErrorAction.REPLACE));
+        }
     }
 
     /** What a byte order mark says; the mark itself is passed over. */
@@ -73,12 +81,14 @@ public final class LineReader implements Closeable {
     }
 
     /** The charset that the stream is read in. */
-    public Charset charset() {
+    public Charset charset() throws IOException {
+        begin();
         return charset;
     }
 
     /** The next line; null at the end. */
     public LogLine next() throws IOException {
+        begin();
         line.setLength(0);
         boolean cut = false;
         while (true) {
@@ -122,6 +132,6 @@ public final class LineReader implements Closeable {
 
     @Override
     public void close() throws IOException {
-        in.close();
+        stream.close();
     }
 }

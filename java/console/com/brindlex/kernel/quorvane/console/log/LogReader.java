@@ -1,5 +1,7 @@
 package com.brindlex.kernel.quorvane.console.log;
 
+import com.brindlex.kernel.quorvane.console.message.Kind;
+import com.brindlex.kernel.quorvane.console.message.MessageReader;
 import java.io.Closeable;
 import java.io.IOException;
 import java.util.function.Consumer;
@@ -86,12 +88,21 @@ public final class LogReader implements Closeable {
         boolean own = header != null && tag.equals(header.tag());
         boolean tagless = header == null ? last == null : header.tag() == null;
         String text = entry.text();
-        int[] found = Unwrap.find(text);
+        int[] found = (own || tagless) && begins(text) ? null : Unwrap.find(text);
         if (found != null) {
             return new LogEntry(entry.line(), header, entry.begin() + found[0],
                     entry.begin() + found[1]);
         }
         return own || tagless ? entry : null;
+    }
+
+    /** Whether a text is a message from its begin on. */
+    private static boolean begins(String text) {
+        if (!text.startsWith("[")) {
+            return text.startsWith("|");
+        }
+        Kind kind = MessageReader.kind(text);
+        return kind == Kind.MESSAGE || kind == Kind.MARK;
     }
 
     @Override

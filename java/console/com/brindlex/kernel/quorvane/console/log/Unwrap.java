@@ -13,11 +13,10 @@ final class Unwrap {
     private Unwrap() {}
 
     /**
-     * Where the message stands: its begin and its end; null for a text without one. What begins
-     * like a message is one.
+     * Where the message stands: its begin and its end; null for a text without one.
      */
     static int[] find(String text) {
-        if (text.startsWith("F=") || text.startsWith("|") || text.startsWith("[")) {
+        if (text.startsWith("F=1|") || text.startsWith("F=7|")) {
             return new int[] {0, text.length()};
         }
         if (text.indexOf('|') < 0 && text.indexOf('[') < 0 && text.indexOf('!') < 0) {

@@ -8,7 +8,6 @@ import java.util.Comparator;
 import java.util.EnumSet;
 import java.util.List;
 import java.util.Set;
-import java.util.regex.Matcher;
 
 /** Learns the secrets of messages, and replaces them. */
 public final class Masker {
@@ -136,10 +135,8 @@ public final class Masker {
                         pseudonyms.of(found.kind(), SecretFields.plain(value).strip()))));
             }
         }
-        Matcher anywhere = pseudonyms.pattern().matcher(text);
-        while (anywhere.find()) {
-            spans.add(new Span(anywhere.start(), anywhere.end(),
-                    pseudonyms.ofForm(anywhere.group())));
+        for (Forms.Hit hit : pseudonyms.finder().find(text)) {
+            spans.add(new Span(hit.begin(), hit.end(), pseudonyms.ofForm(hit.form())));
         }
         // a field goes before what was found within it
         spans.sort(Comparator.comparingInt(Span::begin)

@@ -1,29 +1,26 @@
 package com.brindlex.kernel.quorvane.console.mask;
 
+import java.net.URLEncoder;
 import java.nio.charset.StandardCharsets;
+import java.time.LocalDate;
 import java.util.Base64;
-import java.util.Comparator;
 import java.util.HashMap;
 import java.util.HashSet;
 import java.util.LinkedHashMap;
-import java.util.List;
 import java.util.Map;
 import java.util.Set;
-import java.util.regex.Pattern;
 
 /** What stands for each secret: the same text wherever the secret stands. */
 final class Pseudonyms {
-    /** A shorter secret is replaced where it stands as a word alone. */
-    private static final int LONG_ENOUGH = 6;
-
-    /** A shorter password, and one of a few digits, is replaced in its fields and lines alone. */
+    /** A shorter secret is replaced in its fields and lines alone; also a number of few digits. */
     private static final int SHORTEST_WORD = 4;
+    private static final int SHORTEST_NUMBER = 6;
 
     private final Map<Secret, Map<String, String>> names = new HashMap<>();
     private final Map<String, String> forms = new LinkedHashMap<>();
     private final Map<String, String> alone = new HashMap<>();
     private final Set<String> taken = new HashSet<>();
-    private Pattern pattern;
+    private Forms finder;
 
     /** Learns a secret. */
     void add(Secret kind, String value) {
@@ -33,7 +30,7 @@ final class Pseudonyms {
         }
         taken.add(value);
         names.computeIfAbsent(kind, each -> new LinkedHashMap<>()).putIfAbsent(key, "");
-        pattern = null;
+        finder = null;
     }
 
     /** An account is the same with zeros before it and without. */
@@ -59,13 +56,13 @@ final class Pseudonyms {
         return "0".repeat(Math.max(0, length - number.length())) + number;
     }
 
-    /** Every form of every secret that may stand anywhere in a text; null when there is none. */
-    Pattern pattern() {
+    /** Finds every form of every secret that may stand anywhere in a text. */
+    Forms finder() {
         prepare();
-        return pattern;
+        return finder;
     }
 
-    /** What stands for a form that the pattern found. */
+    /** What stands for a form that was found. */
     String ofForm(String form) {
         return forms.get(form);
     }
@@ -77,21 +74,13 @@ final class Pseudonyms {
     }
 
     private void prepare() {
-        if (pattern != null) {
+        if (finder != null) {
             return;
         }
         forms.clear();
         alone.clear();
         names.forEach(this::name);
-        List<String> longestFirst = forms.keySet().stream()
-                .sorted(Comparator.comparingInt(String::length).reversed()).toList();
-        StringBuilder all = new StringBuilder("(?!)");
-        for (String form : longestFirst) {
-            boolean word = form.length() < LONG_ENOUGH + 2;
-            all.append('|').append(word ? "(?<![A-Za-z0-9])" : "").append(Pattern.quote(form))
-                    .append(word ? "(?![A-Za-z0-9])" : "");
-        }
-        pattern = Pattern.compile(all.toString());
+        finder = new Forms(forms.keySet());
     }
 
     private void name(Secret kind, Map<String, String> known) {
@@ -112,8 +101,12 @@ final class Pseudonyms {
             case ID -> id(value, number);
             case ACCOUNT -> value.matches("[0-9]+") ? String.valueOf(number) : "ACCT" + number;
             case SIGNATURE -> "certificate " + number;
-            case PERSON -> value.matches("[0-9]{6,8}") ? "20000101" : "person " + number;
+            case PERSON -> value.matches("[0-9]{6,8}") ? birthday(number) : "person " + number;
         };
+    }
+
+    private static String birthday(int number) {
+        return LocalDate.of(1950, 1, 1).plusDays(number - 1).toString().replace("-", "");
     }
 
     /** As long as the ID number, since the length decides how it is sent. */
@@ -131,8 +124,9 @@ final class Pseudonyms {
             return;
         }
         alone.put(value, name);
-        boolean few = value.length() < SHORTEST_WORD
-                || value.length() < LONG_ENOUGH && value.matches("[0-9]+");
+        int bytes = value.getBytes(StandardCharsets.UTF_8).length;
+        boolean few = bytes < SHORTEST_WORD || value.length() < Forms.SHORTEST
+                || bytes < SHORTEST_NUMBER && value.matches("[0-9]+");
         if (few) {
             return;
         }
@@ -140,7 +134,7 @@ final class Pseudonyms {
         put(value.replace(" ", "%20"), name.replace(" ", "%20"));
         if (kind == Secret.PASSWORD || kind == Secret.ID) {
             put(base64(value), base64(name));
-            put(java.net.URLEncoder.encode(value, StandardCharsets.UTF_8), name);
+            put(URLEncoder.encode(value, StandardCharsets.UTF_8), name);
             put(value.replace("\\", "\\\\").replace("\"", "\\\""), name);
         }
     }

@@ -104,12 +104,24 @@ public final class Timeline {
                 ? readers(request.decoders(), named) : named;
         Message message = MessageReader.glance(source.text(), decoders);
         if (request == null && id.isEmpty()) {
-            request = pending.takeOldest(message.operations());
+            request = message.operations().isEmpty()
+                    ? null : pending.takeOldest(message.operations());
+            request = request != null || !decoders.isEmpty()
+                    ? request : pending.takeOldest(family(message));
             if (request != null && decoders.isEmpty()) {
                 message = MessageReader.glance(source.text(), request.decoders());
             }
         }
         return row(source, message, request, status(message));
+    }
+
+    /** The decoders of receipts, or of everything else: short replies look alike. */
+    private static List<String> family(Message message) {
+        boolean receipt = message.operation() != null
+                && Dictionary.get().reply(message.operation()).isReceipt();
+        return Dictionary.get().operations().stream().map(Operation::name)
+                .filter(each -> Dictionary.get().reply(each) != null
+                        && Dictionary.get().reply(each).isReceipt() == receipt).toList();
     }
 
     /** The decoder that a length line named, where it is one of those that can answer. */

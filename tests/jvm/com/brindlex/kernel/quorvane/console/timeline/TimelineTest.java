@@ -1,0 +1,129 @@
+package com.brindlex.kernel.quorvane.console.timeline;
+
+import static org.junit.jupiter.api.Assertions.assertEquals;
+import static org.junit.jupiter.api.Assertions.assertFalse;
+import static org.junit.jupiter.api.Assertions.assertTrue;
+
+import java.io.IOException;
+import java.util.List;
+import org.junit.jupiter.api.Test;
+
+/** Which reply answers which request, and what a timeline says of it. */
+class TimelineTest {
+    private static String at(int millis, int thread, String text) {
+        return String.format("01-15 13:45:%02d.%03d  1234  %d D gatewayjni: %s%n", millis / 1000,
+                millis % 1000, thread, text);
+    }
+
+    private static String credit(String id, String stock) {
+        return "F=7|KIND=S|BHNO=9A00|CB=1|IP=10.0.0.1|11=NO%20DEFINE|VER=24369|65=00" + id
+                + "|SN=SN0001|15=1|IDNO=A123456789|ACNO=1234567|PWD=pw||FUNC=8|29=" + stock
+                + "|01=";
+    }
+
+    private static String login(String id) {
+        return credit(id, "0").replace("||FUNC=8|29=0|", "|FUNC=0|").replace("%20", " ");
+    }
+
+    private static String order(String id, String stock) {
+        return "F=1|KIND=S|BHNO=9A00|CB=1|IP=10.0.0.1|11=NO DEFINE|VER=24369|SN=SN0001|65=00" + id
+                + "|14=I|15=0|IDNO=A123456789|ACNO=1234567|PWD=pw|21=20240115|22="
+                + id.substring(0, 6) + "|23=" + id + "|24=5|V4=|27=0|28=0|29=" + stock
+                + "|30=2000|UT=1000|13=7|N6=1|31=600.00|M8=0|32=B|33=!!9A00_1234567_A123456789_I_B_"
+                + stock + "_2000_600.00";
+    }
+
+    private static List<Row> rows(String... lines) throws IOException {
+        return TimelineFormatsTest.rows(String.join("", lines));
+    }
+
+    @Test
+    void theRequestIdTiesAReplyWhateverTheOrder() throws IOException {
+        List<Row> rows = rows(at(0, 1, credit("13452101", "2330")),
+                at(5, 2, credit("13452102", "2317")),
+                at(90, 3, "F=7|65=0013452102|00=1|68=0000|29=2317|A0=1|01="),
+                at(120, 3, "F=7|65=0013452101|00=1|68=E1|M2=無此股票|01="));
+        assertEquals(2, rows.get(2).requestLine());
+        assertEquals("2317", rows.get(2).instrument());
+        assertEquals(85, rows.get(2).millis());
+        assertEquals(1, rows.get(3).requestLine());
+        assertEquals(120, rows.get(3).millis());
+        assertEquals("refused: 無此股票 (E1)", rows.get(3).words());
+        assertEquals("refused", rows.get(3).status());
+        assertTrue(rows.get(3).isFailure());
+    }
+
+    @Test
+    void withoutAnIdTheOldestFittingRequestIsAnswered() throws IOException {
+        List<Row> rows = rows(at(0, 1, login("13452101")), at(5, 1, order("13452102", "2330")),
+                at(9, 1, order("13452103", "2317")), at(30, 1, "|39= |19=S|46=G1|44=20240115|"),
+                at(40, 1, "|39=E|19=|K1=庫存不足|"), at(50, 1, "F=7|68=0000|01="));
+        assertEquals(List.of(2L, 3L, 1L), rows.subList(3, 6).stream().map(Row::requestLine).toList());
+        assertEquals("accepted G1", rows.get(3).words());
+        assertEquals("buy 2 lots 2330 at 600.00", rows.get(1).words());
+        assertEquals("refused: 庫存不足", rows.get(4).words());
+    }
+
+    @Test
+    void threadsDoNotDisturbEachOther() throws IOException {
+        List<Row> rows = rows(at(0, 1, login("13452101")), at(1, 1, "~CGatewayPub"),
+                at(2, 1, order("13452102", "2330")), at(3, 1, "~CGatewayStk"),
+                at(4, 1, "~CGatewayPub"),
+                at(5, 7, "AuthDecode: Len:33"), at(6, 8, "G0001@1130115@@1!"),
+                at(7, 7, "F=7|65=0013452101|68=0000|01="), at(8, 8, "~CGatewayStk"),
+                at(9, 7, "0!"), at(10, 8, "~CGatewayPub"), at(11, 7, "~CGatewayPub"));
+        assertEquals(4, rows.size(), rows::toString);
+        assertEquals("accepted G0001", rows.get(2).words());
+        assertEquals(3, rows.get(2).requestLine());
+        assertEquals("0 accounts", rows.get(3).words());
+        assertEquals(1, rows.get(3).requestLine());
+    }
+
+    @Test
+    void anEmptyResultOfTheStockClassAcceptsACancellation() throws IOException {
+        String cancel = order("13452102", "2330").replace("14=I", "14=D").replaceFirst("\\|27=.*",
+                "|10=20240115|36=W0001|46=G0002|28=0|29=2330|31=60000|32=B|N6=1|27=0|UT=1000|13=7"
+                + "!!9A00_1234567_A123456789_D_W0001_B_2330__");
+        List<Row> rows = rows(at(0, 1, cancel), at(1, 1, "~CGatewayStk"), at(2, 1, "~CGatewayPub"),
+                at(20, 1, ""), at(21, 1, "~CGatewayStk"), at(22, 1, "~CGatewayPub"));
+        assertEquals(2, rows.size(), rows::toString);
+        assertEquals("cancel W0001 (buy 2330)", rows.get(0).words());
+        assertEquals(List.of(), rows.get(0).faults());
+        assertEquals("accepted", rows.get(1).words());
+        assertEquals(20, rows.get(1).millis());
+    }
+
+    @Test
+    void anAppThatLogsTheSameMessagesAddsNoRows() throws IOException {
+        String app = "01-15 13:45:21.500  1234  1 I MyApp: send: ";
+        List<Row> rows = rows(app + login("13452101") + "\n", at(1, 1, login("13452101")),
+                app + "F=7|65=0013452101|68=0000|01=\n", at(9, 1, "F=7|65=0013452101|68=0000|01="));
+        assertEquals(2, rows.size(), rows::toString);
+    }
+
+    @Test
+    void whatIsDamagedOrUnansweredShows() throws IOException {
+        List<Row> rows = rows(at(0, 1, order("13452102", "2330").replace("_2330_", "_2317_")),
+                at(5, 1, "F=7|65=0099999999|68=0000|01="));
+        assertTrue(rows.get(0).isFailure());
+        assertEquals("signature-mismatch", rows.get(0).faults().get(0).kind());
+        assertEquals(0, rows.get(1).requestLine());
+    }
+
+    @Test
+    void filtersChooseRows() throws IOException {
+        List<Row> rows = rows(at(0, 1, credit("13452101", "2330")),
+                at(90, 3, "F=7|65=0013452101|00=1|68=E1|M2=no|01="), at(95, 1, login("13452103")));
+        assertEquals(2, count(rows, new RowFilter(null, "2330", null, false)));
+        assertEquals(1, count(rows, new RowFilter(null, null, "login", false)));
+        assertEquals(3, count(rows, new RowFilter("1234567", null, null, false)));
+        assertEquals(0, count(rows, new RowFilter("7654321", null, null, false)));
+        assertEquals(1, count(rows, new RowFilter(null, null, null, true)));
+        assertEquals(2, count(rows, new RowFilter(null, null, "QueryCredit", false)));
+        assertFalse(new RowFilter(null, "9999", null, true).takes(rows.get(0)));
+    }
+
+    private static long count(List<Row> rows, RowFilter filter) {
+        return rows.stream().filter(filter::takes).count();
+    }
+}
