@@ -35,6 +35,7 @@ public final class Timeline {
         }
     };
     private String lastReply = "";
+    private String lastResult = "";
 
     /** The row of the next message of the log; null when the message makes none. */
     public Event accept(LogMessage source) {
@@ -96,9 +97,6 @@ public final class Timeline {
         String id = requestId(source.text());
         List<String> named = named(call);
         Pending.Request request = id.isEmpty() ? null : pending.take(id);
-        if (request == null && repeated) {
-            return null;
-        }
         lastReply = source.text();
         List<String> decoders = request != null && !request.decoders().isEmpty()
                 ? readers(request.decoders(), named) : named;
@@ -112,7 +110,9 @@ public final class Timeline {
                 message = MessageReader.glance(source.text(), request.decoders());
             }
         }
-        return row(source, message, request, status(message));
+        // an app may decode a reply twice, or log it, too
+        return request == null && repeated ? null
+                                           : row(source, message, request, status(message));
     }
 
     /** The decoders of receipts, or of everything else: short replies look alike. */
@@ -167,6 +167,11 @@ public final class Timeline {
         Message guessed = MessageReader.glance(source.text(), List.of());
         List<String> decoders = kind == Kind.RESULT ? guessed.operations() : ofClass(call);
         Pending.Request request = pending.takeOldest(decoders);
+        boolean repeated = source.text().equals(lastResult);
+        lastResult = source.text();
+        if (request == null && repeated) {
+            return null;  // an app may decode a reply twice
+        }
         Message message = request == null || kind == Kind.MESSAGE ? guessed
                 : MessageReader.glance(source.text(), request.decoders());
         return row(source, message, request, status(message));

@@ -102,6 +102,21 @@ class TimelineTest {
     }
 
     @Test
+    void aReplyThatIsDecodedTwiceIsOneRow() throws IOException {
+        String refusal = "F=7|68=E002|M2=no|01=";
+        List<Row> rows = rows(at(0, 1, login("13452101")), at(1, 1, "~CGatewayPub"),
+                at(2, 1, refusal), at(3, 1, "no"), at(4, 1, "~CGatewayPub"),
+                at(5, 1, refusal), at(6, 1, "no"), at(7, 1, "~CGatewayPub"),
+                at(8, 1, login("13452102")), at(9, 1, "~CGatewayPub"),
+                at(10, 1, refusal), at(11, 1, "no"), at(12, 1, "~CGatewayPub"));
+        assertEquals(List.of(0L, 1L, 0L, 9L), rows.stream().map(Row::requestLine).toList());
+        rows = rows(at(0, 1, order("13452102", "2330")), at(1, 1, "~CGatewayPub"),
+                at(2, 1, "G1@1130115@@1!"), at(3, 1, "~CGatewayPub"), at(4, 1, "G1@1130115@@1!"),
+                at(5, 1, "~CGatewayPub"));
+        assertEquals(2, rows.size(), rows::toString);
+    }
+
+    @Test
     void whatIsDamagedOrUnansweredShows() throws IOException {
         List<Row> rows = rows(at(0, 1, order("13452102", "2330").replace("_2330_", "_2317_")),
                 at(5, 1, "F=7|65=0099999999|68=0000|01="));
