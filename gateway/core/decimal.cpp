@@ -38,6 +38,17 @@ constexpr uint64_t Magnitude(int64_t value) {
   return value < 0 ? 0 - static_cast<uint64_t>(value) : static_cast<uint64_t>(value);
 }
 
+// Writes the leading digits first, two at a time.
+char* WritePlain(char* at, uint64_t value) {
+  if (value >= 100) at = WritePlain(at, value / 100);
+  if (value < 10) {
+    *at = static_cast<char>('0' + value);
+    return at + 1;
+  }
+  WriteDigitPair(at, static_cast<uint32_t>(value % 100));
+  return at + 2;
+}
+
 }  // namespace
 
 int64_t ReadInt64(std::string_view text) {
@@ -87,14 +98,8 @@ size_t DecimalSize(int64_t value, size_t width) {
 }
 
 char* WriteDecimal(char* at, int64_t value, size_t width) {
-  const size_t size = DecimalSize(value, width);
-  char* const start = value < 0 ? at + 1 : at;
-  char* digit = at + size;
-  uint64_t rest = Magnitude(value);
-  for (; rest > UINT32_MAX; rest /= 10) *--digit = static_cast<char>('0' + rest % 10);
-  auto narrow = static_cast<uint32_t>(rest);  // 32-bit division is much the cheaper one
-  for (; digit - start >= 2; narrow /= 100) WriteDigitPair(digit -= 2, narrow % 100);
-  if (digit != start) *start = static_cast<char>('0' + narrow % 10);
-  if (value < 0) *at = '-';
-  return at + size;
+  size_t zeros = width == 0 ? 0 : DecimalSize(value, width) - DecimalSize(value, 0);
+  if (value < 0) *at++ = '-';
+  for (; zeros > 0; --zeros) *at++ = '0';
+  return WritePlain(at, Magnitude(value));
 }

@@ -79,8 +79,10 @@ Stamp CGatewayPub::TakeStamp() {
   struct tm local;
   if (localtime_r(&now, &local) == nullptr) local = {};
   m_nSeqNo = static_cast<int32_t>(static_cast<uint32_t>(m_nSeqNo) % 100);
-  const int clock = local.tm_hour * 10000 + local.tm_min * 100 + local.tm_sec;
   Stamp stamp = {WrapAdd(local.tm_year, 1900), local.tm_mon + 1, local.tm_mday, {}};
-  WriteDecimal(stamp.digits, clock * 100 + m_nSeqNo, sizeof stamp.digits);
+  char* at = stamp.digits;
+  for (const int part : {local.tm_hour, local.tm_min, local.tm_sec, m_nSeqNo}) {
+    at = WriteDigits<2>(at, static_cast<uint32_t>(part));
+  }
   return stamp;
 }
