@@ -127,12 +127,12 @@ constexpr size_t TagSize(TagKey key) {
 // each, in the same order: another order does not build, nor does a tag that stands twice.
 class CTagTable {
  public:
-  static constexpr size_t kMaxTags = 64;
+  static constexpr size_t kMaxTags = 36;  // more cost read-only data in each decoder
   static constexpr int kNone = -1;
 
   template <size_t kRows>
   constexpr explicit CTagTable(const TagRow (&rows)[kRows]) {
-    static_assert(kRows <= kMaxTags, "a record's fields are told by the bits of one number");
+    static_assert(kRows <= kMaxTags, "a table holds at most kMaxTags tags");
     if (!AreInFieldOrder(rows)) RowsAreNotInFieldOrder();
     for (size_t row = 0; row < kRows; ++row) {
       m_keys[row] = MakeTagKey(rows[row].tag);
@@ -159,13 +159,13 @@ class CTagTable {
   uint64_t Skips() const { return m_nSkips; }
 
  private:
-  static constexpr size_t kPlaces = 256;
+  static constexpr size_t kPlaces = 128;
   static constexpr TagKey kVacant = 0xffffffff;  // no field has this key
 
   // Never defined: a constant table cannot call it.
   static void RowsAreNotInFieldOrder();
 
-  constexpr size_t PlaceOf(TagKey key) const { return key * m_nFactor >> 24; }
+  constexpr size_t PlaceOf(TagKey key) const { return key * m_nFactor >> 25; }
 
   // Whether the present factor gives each of the first `count` keys a place of its own.
   constexpr bool HaveOwnPlaces(size_t count) const {
