@@ -1,5 +1,5 @@
 // The wire's own format texts, read by the compiler: a wrong value type does not build, and at run
-// time nothing is looked for.
+// time nothing is looked for but where a text has next to no room left.
 //
 // Marks: "%s" (a C text, null read as empty, or a std::string_view), "%c" (char), "%d" (int, or a
 // byte of the host's), "%ld" (any integer) and the zero-padded "%0Nd" (int).
@@ -24,10 +24,10 @@
 // One mark of a format and the literal text before it. Behind the last mark of a format stands one
 // more, of kind 0, for the rest of the literal text.
 struct WireMark {
-  uint8_t literalAt;
-  uint8_t literalSize;
+  size_t literalAt;
+  size_t literalSize;
   char kind;  // 's', 'c', 'd', or 'l' for "%ld"
-  uint8_t width;
+  size_t width;
 };
 
 constexpr size_t CountMarks(std::string_view format) {
@@ -36,21 +36,25 @@ constexpr size_t CountMarks(std::string_view format) {
   return count;
 }
 
+// Reads the mark from `at` on, which goes behind it.
+constexpr WireMark ReadMark(std::string_view format, size_t& at) {
+  WireMark mark = {at, 0, 0, 0};
+  while (at < format.size() && format[at] != '%') ++at;
+  mark.literalSize = at - mark.literalAt;
+  if (at == format.size()) return mark;
+  for (++at; format[at] >= '0' && format[at] <= '9'; ++at) {
+    mark.width = mark.width * 10 + static_cast<size_t>(format[at] - '0');
+  }
+  mark.kind = format[at];
+  at += mark.kind == 'l' ? 2 : 1;
+  return mark;
+}
+
 template <size_t kCount>
 constexpr std::array<WireMark, kCount + 1> ReadMarks(std::string_view format) {
   std::array<WireMark, kCount + 1> marks = {};
   size_t at = 0;
-  for (WireMark& mark : marks) {
-    mark.literalAt = static_cast<uint8_t>(at);
-    while (at < format.size() && format[at] != '%') ++at;
-    mark.literalSize = static_cast<uint8_t>(at - mark.literalAt);
-    if (at == format.size()) break;
-    for (++at; format[at] >= '0' && format[at] <= '9'; ++at) {
-      mark.width = static_cast<uint8_t>(mark.width * 10 + (format[at] - '0'));
-    }
-    mark.kind = format[at];
-    at += mark.kind == 'l' ? 2 : 1;
-  }
+  for (WireMark& mark : marks) mark = ReadMark(format, at);
   return marks;
 }
 
@@ -61,6 +65,8 @@ inline constexpr auto kWireMarks = ReadMarks<CountMarks(Format::Text())>(Format:
 struct WireValue {
   int64_t number;
   const char* text = nullptr;
+
+  std::string_view Text() const { return {text, static_cast<size_t>(number)}; }
 };
 
 inline std::string_view AsText(const char* text) {

@@ -1,7 +1,5 @@
 #include "gateway/core/wire_text.h"
 
-#include <cstring>
-
 namespace {
 
 // The part of a piece's room that is not written yet.
@@ -11,10 +9,9 @@ struct Place {
 
   bool Has(size_t size) const { return static_cast<size_t>(end - at) >= size; }
 
-  bool Put(const char* text, size_t size) {
-    if (!Has(size)) return false;
-    memcpy(at, text, size);
-    at += size;
+  bool Put(std::string_view text) {
+    if (!Has(text.size())) return false;
+    at += text.copy(at, text.size());
     return true;
   }
 
@@ -25,28 +22,29 @@ struct Place {
   }
 
   bool PutValue(const WireMark& mark, const WireValue& value) {
-    if (mark.kind == 's') return Put(value.text, static_cast<size_t>(value.number));
+    if (mark.kind == 's') return Put(value.Text());
     if (mark.kind != 'c') return PutNumber(value.number, mark.width);
     const char c = static_cast<char>(value.number);
-    return Put(&c, 1);
+    return Put({&c, 1});
   }
 };
 
 // False when the piece does not fit.
-bool WritePiece(Place& place, const char* format, const WireMark* mark, const WireValue* value) {
-  for (;; ++mark, ++value) {
-    if (!place.Put(format + mark->literalAt, mark->literalSize)) return false;
-    if (mark->kind == '\0' || (mark->kind == 'c' && value->number == 0)) return true;
-    if (!place.PutValue(*mark, *value)) return false;
+bool WritePiece(Place& place, std::string_view format, const WireValue* value) {
+  for (size_t at = 0;; ++value) {
+    const WireMark mark = ReadMark(format, at);
+    if (!place.Put({format.data() + mark.literalAt, mark.literalSize})) return false;
+    if (mark.kind == '\0' || (mark.kind == 'c' && value->number == 0)) return true;
+    if (!place.PutValue(mark, *value)) return false;
   }
 }
 
 }  // namespace
 
-void CWireText::AppendTightly(const char* format, const WireMark* marks, const WireValue* values) {
+void CWireText::AppendTightly(std::string_view format, const WireValue* values) {
   for (;;) {
     Place place = {m_pAt, m_pEnd};
-    if (WritePiece(place, format, marks, values)) {
+    if (WritePiece(place, format, values)) {
       m_pAt = place.at;
       return;
     }

@@ -78,7 +78,7 @@ class CWireText {
       m_pAt = at;
     } else {
       const WireValue plain[] = {values..., {}};
-      AppendTightly(Format::Text().data(), kWireMarks<Format>.data(), plain);
+      AppendTightly(Format::Text(), plain);
     }
   }
 
@@ -115,7 +115,7 @@ class CWireText {
   }
 
   // The same where that bound does not fit: each value asks for itself, to the byte.
-  void AppendTightly(const char* format, const WireMark* marks, const WireValue* values);
+  void AppendTightly(std::string_view format, const WireValue* values);
 };
 
 #endif  // QUORVANE_GATEWAY_CORE_WIRE_TEXT_H_
