@@ -30,11 +30,18 @@ public final class Screen {
 
     private final PrintStream out;
     private final boolean colours;
+    private final int wrapAt;
 
     /** Writes to {@code out}, with terminal colours when {@code colours} is set. */
     public Screen(PrintStream out, boolean colours) {
+        this(out, colours, true);
+    }
+
+    /** Likewise; long texts are wrapped when {@code wrapped} is set, else they stay in one line. */
+    public Screen(PrintStream out, boolean colours, boolean wrapped) {
         this.out = out;
         this.colours = colours;
+        this.wrapAt = wrapped ? WIDTH - 12 : Integer.MAX_VALUE;
     }
 
     /** Puts a text into a style. */
@@ -65,7 +72,7 @@ public final class Screen {
     public void labelled(String label, Style style, String text) {
         String shown = text.replace("\r", "␍").replace("\n", "␊");
         boolean first = true;
-        for (String piece : wrap(shown.isEmpty() ? "(empty)" : shown, WIDTH - 12)) {
+        for (String piece : wrap(shown.isEmpty() ? "(empty)" : shown, wrapAt)) {
             String head = styled(Style.LABEL, pad(first ? label : "", 9));
             out.println("  " + head + " " + styled(style, piece));
             first = false;

@@ -12,7 +12,7 @@ import picocli.CommandLine.TypeConversionException;
 import picocli.CommandLine;
 
 /** The message codec on the command line. */
-@Command(name = "quorvane", mixinStandardHelpOptions = true, version = "quorvane",
+@Command(name = "quorvane", mixinStandardHelpOptions = true, versionProvider = Quorvane.Version.class,
         sortOptions = false,
         description = "Builds requests, reads replies, and explains what a log holds of both.",
         footer = {"", "Exit codes: 0 done, 1 the operation failed or a line is damaged, 2 usage.",
@@ -50,6 +50,7 @@ public final class Quorvane {
         root.addSubcommand(new TimelineCommand());
         root.addSubcommand(new CheckCommand());
         root.addSubcommand(new MaskCommand());
+        root.addSubcommand(new CompletionCommand());
         root.addSubcommand(new SimulateCommand());
         root.setCaseInsensitiveEnumValuesAllowed(true);
         root.setUsageHelpAutoWidth(true);
@@ -76,6 +77,16 @@ public final class Quorvane {
         boolean wanted = colour == Colour.ALWAYS
                 || colour == Colour.AUTO && CommandLine.Help.Ansi.AUTO.enabled();
         return new Terminal(json, wanted && !json);
+    }
+
+    /** The version of the jar, and of the dictionary that all commands know the protocol by. */
+    static final class Version implements CommandLine.IVersionProvider {
+        @Override
+        public String[] getVersion() {
+            String jar = Quorvane.class.getPackage().getImplementationVersion();
+            return new String[] {"quorvane " + (jar == null ? "(no jar)" : jar) + ", dictionary "
+                    + Dictionary.get().version()};
+        }
     }
 
     /** The name of an operation as the dictionary writes it, from one in any case. */

@@ -23,7 +23,7 @@ final class Terminal {
         this.out = new PrintStream(System.out, true, StandardCharsets.UTF_8);
         this.err = new PrintStream(System.err, true, StandardCharsets.UTF_8);
         this.json = json;
-        this.screen = new Screen(out, colours);
+        this.screen = new Screen(out, colours, System.console() != null);
     }
 
     boolean isJson() {

@@ -196,4 +196,66 @@ class QuorvaneTest {
         assertTrue(damaged.out.contains("AuthEncode"), damaged.out);
         assertTrue(damaged.out.contains("^"), damaged.out);
     }
+
+    private static final String LOG = """
+            01-15 13:45:21.000  1234  5678 D gatewayjni: F=7|KIND=S|BHNO=9A00|CB=1|IP=10.0.0.1\
+            |11=NO DEFINE|VER=24369|65=0013452107|SN=SN0001|15=1|IDNO=A123456789|ACNO=1234567\
+            |PWD=pass1234|FUNC=0|01=
+            01-15 13:45:21.080  1234  5678 D gatewayjni: F=7|65=0013452107|68=E002|M2=密碼錯誤|
+            """;
+
+    @Test
+    void aTimelineIsALineAMessage() {
+        Run shown = run(LOG, "timeline");
+        assertEquals(0, shown.code, shown.err);
+        assertEquals(2, shown.out.lines().count(), shown.out);
+        assertTrue(shown.out.contains("refused: 密碼錯誤 (E002) (80 ms)"), shown.out);
+        assertTrue(shown.err.contains("2 messages: 1 requests, 1 answers"), shown.err);
+        assertEquals(1, run(LOG, "timeline", "--failures").out.lines().count());
+        assertEquals(1, run(LOG, "timeline", "--stock", "2330").code);
+        Run csv = run(LOG, "timeline", "--csv");
+        assertTrue(csv.out.startsWith("line,time,direction,"), csv.out);
+        assertTrue(csv.out.contains(",1234567,,login,sent,0013452107,,,\r\n"), csv.out);
+        Run json = run(LOG, "timeline", "--json");
+        assertTrue(json.out.lines().allMatch(line -> line.startsWith("{\"line\":")), json.out);
+        assertEquals(1, run("nothing\n", "timeline").code);
+    }
+
+    @Test
+    void checkTellsFaultsByTheirNames() {
+        assertEquals(0, run(LOG, "check").code);
+        Run damaged = run(LOG.replace("VER=24369", "VER=1"), "check");
+        assertEquals(1, damaged.code);
+        assertTrue(damaged.out.startsWith("(input):1: wrong-constant: "), damaged.out);
+        Run json = run(LOG.replace("VER=24369", "VER=1"), "check", "--json");
+        assertTrue(json.out.contains("\"kind\":\"wrong-constant\""), json.out);
+        assertEquals(2, run("", "check", "/no/such/log").code);
+    }
+
+    @Test
+    void maskKeepsTheLogReadable() {
+        Run masked = run(LOG, "mask");
+        assertEquals(0, masked.code, masked.err);
+        assertFalse(masked.out.contains("A123456789") || masked.out.contains("pass1234"));
+        assertEquals(0, run(masked.out, "check").code);
+        assertTrue(run(LOG, "mask", "--keep", "id,account").out.contains("IDNO=A123456789"));
+        assertEquals(2, run(LOG, "mask", "--keep", "password").code);
+    }
+
+    @Test
+    void aMessageCanBeAnArgument() {
+        String message = LOG.lines().findFirst().orElseThrow().replaceFirst(".*gatewayjni: ", "");
+        Run explained = run("", "explain", message);
+        assertEquals(0, explained.code, explained.err);
+        assertTrue(explained.out.startsWith("request: login"), explained.out);
+        assertEquals(0, run("", "check", message).code);
+    }
+
+    @Test
+    void versionAndCompletion() {
+        assertTrue(run("", "--version").out.matches("(?s)quorvane .*[0-9]+\\.[0-9]+\\.[0-9]+\\s*"));
+        Run completion = run("", "completion");
+        assertTrue(completion.out.contains("complete -F _complete_quorvane"), completion.err);
+        assertTrue(completion.out.contains("--failures"));
+    }
 }
