@@ -3,6 +3,7 @@ package com.brindlex.kernel.quorvane.console.command;
 import com.brindlex.kernel.quorvane.client.Market;
 import com.brindlex.kernel.quorvane.client.Operation;
 import com.brindlex.kernel.quorvane.client.RawReply;
+import com.brindlex.kernel.quorvane.console.ReplyValues;
 import java.util.concurrent.Callable;
 import picocli.CommandLine.Command;
 import picocli.CommandLine.Model.CommandSpec;
@@ -48,7 +49,7 @@ final class DecodeCommand implements Callable<Integer> {
         String reply = Terminal.read(spec, file).replaceFirst("\\r?\\n\\z", "");
         RawReply read = RawReply.of(operation, market(), reply);
         if (terminal.isJson()) {
-            terminal.json(Shown.json(read));
+            terminal.json(ReplyValues.of(read));
         } else if (raw) {
             terminal.raw(read.text());
         } else {

@@ -1,12 +1,9 @@
 package com.brindlex.kernel.quorvane.console.command;
 
 import com.brindlex.kernel.quorvane.client.Argument;
-import com.brindlex.kernel.quorvane.client.Market;
 import com.brindlex.kernel.quorvane.client.Operation;
-import com.brindlex.kernel.quorvane.client.Platform;
 import com.brindlex.kernel.quorvane.client.RawRequest;
-import com.brindlex.kernel.quorvane.client.Session;
-import java.util.ArrayList;
+import com.brindlex.kernel.quorvane.console.WrittenRequest;
 import java.util.List;
 import java.util.Map;
 import picocli.CommandLine.Model.CommandSpec;
@@ -49,39 +46,12 @@ final class Options {
      * @throws IllegalArgumentException with the reason, when a value is none for its argument
      */
     static RawRequest request(Operation operation, ParseResult parsed) {
-        List<Argument> device = Operation.sessionArguments();
-        Session session = Session.of(text(parsed, device.get(3)), text(parsed, device.get(4)))
-                                  .withMarket(Market.of(number(parsed, device.get(0))))
-                                  .withPlatform(Platform.of(number(parsed, device.get(1))))
-                                  .withSequence(number(parsed, device.get(2)));
-        RawRequest request = RawRequest.of(operation, session);
-        for (Argument argument : operation.arguments()) {
-            request.set(argument.name(), text(parsed, argument));
-        }
-        return request;
+        return WrittenRequest.of(operation,
+                name -> parsed.commandSpec().findOption("--" + dashed(name)).getValue());
     }
 
     /** All arguments of a native but the status array. */
     static List<Argument> all(Operation operation) {
-        List<Argument> all = new ArrayList<>();
-        if (operation.isEncoder()) {
-            all.addAll(Operation.sessionArguments());
-        }
-        all.addAll(operation.arguments());
-        return all;
-    }
-
-    private static String text(ParseResult parsed, Argument argument) {
-        return parsed.commandSpec().findOption("--" + dashed(argument.name())).getValue();
-    }
-
-    private static int number(ParseResult parsed, Argument argument) {
-        String text = text(parsed, argument);
-        try {
-            return Integer.parseInt(text);
-        } catch (NumberFormatException wrong) {
-            throw new IllegalArgumentException(
-                    argument.name() + " must be a whole number, not '" + text + "'");
-        }
+        return WrittenRequest.arguments(operation);
     }
 }

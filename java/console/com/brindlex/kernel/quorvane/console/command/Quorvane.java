@@ -52,6 +52,7 @@ public final class Quorvane {
         root.addSubcommand(new MaskCommand());
         root.addSubcommand(new CompletionCommand());
         root.addSubcommand(new SimulateCommand());
+        root.addSubcommand(new PageCommand());
         root.setCaseInsensitiveEnumValuesAllowed(true);
         root.setUsageHelpAutoWidth(true);
         root.setParameterExceptionHandler(Quorvane::badUsage);

@@ -5,7 +5,8 @@ import com.brindlex.kernel.quorvane.client.InvalidRequestException;
 import com.brindlex.kernel.quorvane.client.Market;
 import com.brindlex.kernel.quorvane.client.Operation;
 import com.brindlex.kernel.quorvane.client.RawReply;
-import com.brindlex.kernel.quorvane.client.TradeDate;
+import com.brindlex.kernel.quorvane.console.ReplyValues;
+import com.brindlex.kernel.quorvane.console.WrittenRequest;
 import com.brindlex.kernel.quorvane.console.Screen.Style;
 import com.brindlex.kernel.quorvane.console.message.Kind;
 import com.brindlex.kernel.quorvane.console.message.Message;
@@ -69,10 +70,7 @@ final class SimulateCommand implements Callable<Integer> {
     public Integer call() throws IOException {
         terminal = parent.terminal();
         gateway = new Gateway(Clock.systemDefaultZone(), brokerage);
-        String today = TradeDate.today().rocText();
-        usual.putAll(Map.of("serialNo", "R58M30ABCDE", "localIP", "10.20.30.40", "branch", "9A01",
-                "identity", "A123456789&1234567", "password", "pass1234", "date", today,
-                "startDate", today, "endDate", today, "orderDate", today));
+        usual.putAll(WrittenRequest.sample());
         boolean interactive = System.console() != null && !terminal.isJson();
         if (interactive) {
             terminal.line("The gateway is up. 'help' says what it takes, 'quit' ends the session.");
@@ -221,7 +219,7 @@ final class SimulateCommand implements Callable<Integer> {
             Map<String, Object> map = new LinkedHashMap<>();
             map.put("request", request);
             map.put("reply", reply);
-            map.put("result", read == null ? null : Shown.json(read));
+            map.put("result", read == null ? null : ReplyValues.of(read));
             terminal.json(map);
         } else {
             terminal.screen().labelled("request", Style.DIM, request.strip());

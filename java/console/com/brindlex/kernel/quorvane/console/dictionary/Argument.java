@@ -13,10 +13,11 @@ package com.brindlex.kernel.quorvane.console.dictionary;
  * @param codes the table of its codes; null when it has none
  * @param unread whether the library does not read it
  * @param usual the value that stands in when none is given; null when there is none
+ * @param example a value that shows how it is written; null when there is none
  */
 public record Argument(String name, String type, String kind, String unit, boolean required,
         Long min, Long max, Integer maxLength, String codes, boolean unread, String usual,
-        String purpose) {
+        String example, String purpose) {
     /** Whether it is one character of the wire. */
     public boolean isLetter() {
         return "letter".equals(kind);

@@ -26,9 +26,9 @@ public final class Dictionary {
     private final Map<String, Operation> operations = new LinkedHashMap<>();
     private final Map<String, Header> headers = new HashMap<>();
     private final Map<String, String> pieces = new HashMap<>();
-    private final Map<String, CodeTable> codes = new HashMap<>();
+    private final Map<String, CodeTable> codes = new LinkedHashMap<>();
     private final Map<String, Reply> replies = new HashMap<>();
-    private final Map<String, Map<String, Tag>> scenes = new HashMap<>();
+    private final Map<String, Map<String, Tag>> scenes = new LinkedHashMap<>();
     private final List<Message> messages = new ArrayList<>();
     private final Map<String, String> english = new HashMap<>();
 
@@ -188,6 +188,16 @@ public final class Dictionary {
     /** A table of codes by its name. */
     public CodeTable codes(String name) {
         return codes.get(name);
+    }
+
+    /** All tables of codes, as they stand in the dictionary. */
+    public Collection<CodeTable> codeTables() {
+        return codes.values();
+    }
+
+    /** The names of the scenes, as they stand in the dictionary. */
+    public Collection<String> scenes() {
+        return scenes.keySet();
     }
 
     /** What a decoder reads; null when it is no decoder. */

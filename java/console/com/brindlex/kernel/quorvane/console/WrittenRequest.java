@@ -1,0 +1,69 @@
+package com.brindlex.kernel.quorvane.console;
+
+import com.brindlex.kernel.quorvane.client.Argument;
+import com.brindlex.kernel.quorvane.client.Market;
+import com.brindlex.kernel.quorvane.client.Operation;
+import com.brindlex.kernel.quorvane.client.Platform;
+import com.brindlex.kernel.quorvane.client.RawRequest;
+import com.brindlex.kernel.quorvane.client.Session;
+import com.brindlex.kernel.quorvane.client.TradeDate;
+import java.util.ArrayList;
+import java.util.List;
+import java.util.Map;
+import java.util.function.UnaryOperator;
+
+/** Requests whose arguments people write, as options or in a form. */
+public final class WrittenRequest {
+    private WrittenRequest() {}
+
+    /** All arguments of a native but the status array. */
+    public static List<Argument> arguments(Operation operation) {
+        List<Argument> all = new ArrayList<>();
+        if (operation.isEncoder()) {
+            all.addAll(Operation.sessionArguments());
+        }
+        all.addAll(operation.arguments());
+        return all;
+    }
+
+    /**
+     * The request of what was written.
+     *
+     * @param texts the text of an argument by its name
+     * @throws IllegalArgumentException with the reason, when a text is none for its argument
+     */
+    public static RawRequest of(Operation operation, UnaryOperator<String> texts) {
+        List<Argument> device = Operation.sessionArguments();
+        Session session = Session.of(text(texts, device.get(3)), text(texts, device.get(4)))
+                                  .withMarket(Market.of(number(texts, device.get(0))))
+                                  .withPlatform(Platform.of(number(texts, device.get(1))))
+                                  .withSequence(number(texts, device.get(2)));
+        RawRequest request = RawRequest.of(operation, session);
+        for (Argument argument : operation.arguments()) {
+            request.set(argument.name(), text(texts, argument));
+        }
+        return request;
+    }
+
+    /** What to send as the simulated gateway's customer, from a device, today. */
+    public static Map<String, String> sample() {
+        String today = TradeDate.today().rocText();
+        return Map.of("serialNo", "R58M30ABCDE", "localIP", "10.20.30.40", "branch", "9A01",
+                "identity", "A123456789&1234567", "password", "pass1234", "date", today,
+                "startDate", today, "endDate", today, "orderDate", today);
+    }
+
+    private static String text(UnaryOperator<String> texts, Argument argument) {
+        return texts.apply(argument.name());
+    }
+
+    private static int number(UnaryOperator<String> texts, Argument argument) {
+        String text = text(texts, argument);
+        try {
+            return Integer.parseInt(text);
+        } catch (NumberFormatException wrong) {
+            throw new IllegalArgumentException(
+                    argument.name() + " must be a whole number, not '" + text + "'");
+        }
+    }
+}
