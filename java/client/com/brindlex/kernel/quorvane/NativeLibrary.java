@@ -4,8 +4,8 @@ import org.jetbrains.annotations.NotNull;
 import org.jetbrains.annotations.Nullable;
 
 /**
- * Brings {@code libquorvane.so} in: the one place that loads it, once, at the first call of a native
- * or when {@link #load} is called. May be used by several threads at once.
+ * Brings {@code libquorvane.so} in: the one place that loads it, once, at the first call of a
+ * native or when {@link #load} is called. May be used by several threads at once.
  *
  * <p>An app that loads its libraries by a helper of its own gives it before the first call: {@code
  * NativeLibrary.use(name -> ReLinker.loadLibrary(context, name))}.
@@ -57,8 +57,8 @@ public final class NativeLibrary {
     }
 
     private static String advice(String reason) {
-        return System.mapLibraryName(NAME) + " cannot be loaded (" + reason + "). On Android the app"
-                + " must carry it for the ABI of the device; on a plain machine"
+        return System.mapLibraryName(NAME) + " cannot be loaded (" + reason + "). On Android the"
+                + " app must carry it for the ABI of the device; on a plain machine"
                 + " -Djava.library.path must name its folder. NativeLibrary.use(...) takes another"
                 + " loader.";
     }

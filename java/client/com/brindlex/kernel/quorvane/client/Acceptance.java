@@ -2,6 +2,7 @@
 package com.brindlex.kernel.quorvane.client;
 
 import org.jetbrains.annotations.NotNull;
+
 /**
  * What the receipt of an order shows of tag 19.
  *

@@ -2,34 +2,33 @@
 package com.brindlex.kernel.quorvane.client;
 
 import org.jetbrains.annotations.NotNull;
+
 /** One account. Never changes. */
 public final class Account extends Row<Account> {
     /** Account field 07, in angle brackets. */
     public static final Column<Account, String> ACCOUNT_FIELD07 =
-            new Column<Account, String>(0, "accountField07", Form.TEXT,
-                    "07", "account field 07, in angle brackets");
+            new Column<Account, String>(0, "accountField07", Form.TEXT, "07",
+                    "account field 07, in angle brackets");
 
     /** Account field M5. */
     public static final Column<Account, String> ACCOUNT_FIELD_M5 =
-            new Column<Account, String>(1, "accountFieldM5", Form.TEXT,
-                    "M5", "account field M5");
+            new Column<Account, String>(1, "accountFieldM5", Form.TEXT, "M5", "account field M5");
 
     /** Account number, seven digits. */
     public static final Column<Account, String> ACCOUNT =
-            new Column<Account, String>(2, "account", Form.TEXT,
-                    "17 18", "account number, seven digits");
+            new Column<Account, String>(2, "account", Form.TEXT, "17 18",
+                    "account number, seven digits");
 
     /** Account field 16. */
     public static final Column<Account, String> ACCOUNT_FIELD16 =
-            new Column<Account, String>(3, "accountField16", Form.TEXT,
-                    "16", "account field 16");
+            new Column<Account, String>(3, "accountField16", Form.TEXT, "16", "account field 16");
 
     /** Account field 69. */
     public static final Column<Account, String> ACCOUNT_FIELD69 =
-            new Column<Account, String>(4, "accountField69", Form.TEXT,
-                    "69", "account field 69");
+            new Column<Account, String>(4, "accountField69", Form.TEXT, "69", "account field 69");
 
-    static final Shape<Account> SHAPE = new Shape<Account>("account", "0@1@2@3@4",
+    static final Shape<Account> SHAPE = new Shape<Account>("account",
+            "0@1@2@3@4",
             ACCOUNT_FIELD07, ACCOUNT_FIELD_M5, ACCOUNT, ACCOUNT_FIELD16, ACCOUNT_FIELD69) {
         @Override
         Account row(String text, int start, int end) {

@@ -2,6 +2,7 @@
 package com.brindlex.kernel.quorvane.client;
 
 import org.jetbrains.annotations.NotNull;
+
 /**
  * Code of an item at the opening of an account (tag ITEM). What a number stands for is the
  * broker's. Never changes.

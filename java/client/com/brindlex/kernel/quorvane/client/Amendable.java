@@ -2,6 +2,7 @@
 package com.brindlex.kernel.quorvane.client;
 
 import org.jetbrains.annotations.NotNull;
+
 /**
  * Whether an order can still be changed.
  *

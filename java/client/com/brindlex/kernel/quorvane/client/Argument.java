@@ -3,7 +3,9 @@ package com.brindlex.kernel.quorvane.client;
 import org.jetbrains.annotations.NotNull;
 import org.jetbrains.annotations.Nullable;
 
-/** One argument of a native method: its name and type, and the values that it takes. */
+/**
+ * One argument of a native method: its name and type, and the values that it takes. Never changes.
+ */
 public final class Argument {
     /** How an argument is passed. */
     public enum Type {

@@ -4,14 +4,16 @@ package com.brindlex.kernel.quorvane.client;
 import java.math.BigDecimal;
 import org.jetbrains.annotations.NotNull;
 import org.jetbrains.annotations.Nullable;
+
 /** One bank balance. Never changes. */
 public final class BankBalance extends Row<BankBalance> {
     /** Balance of the bank account. */
     public static final Column<BankBalance, BigDecimal> BANK_BALANCE =
-            new Column<BankBalance, BigDecimal>(0, "bankBalance", Form.NUMBER,
-                    "PN", "balance of the bank account");
+            new Column<BankBalance, BigDecimal>(0, "bankBalance", Form.NUMBER, "PN",
+                    "balance of the bank account");
 
-    static final Shape<BankBalance> SHAPE = new Shape<BankBalance>("bank balance", "@@@@0@",
+    static final Shape<BankBalance> SHAPE = new Shape<BankBalance>("bank balance",
+            "@@@@0@",
             BANK_BALANCE) {
         @Override
         BankBalance row(String text, int start, int end) {

@@ -4,7 +4,9 @@ import java.util.ArrayList;
 import java.util.List;
 import org.jetbrains.annotations.Nullable;
 
-/** Takes what the amendment of an order needs from its row of the book, and tells what is not there. */
+/**
+ * Takes what the amendment of an order needs from its row of the book, and tells what is not there.
+ */
 final class BookFacts<R extends Row<R>> {
     private static final String NOT_SHOWN = "must be given: the order book does not show it";
 

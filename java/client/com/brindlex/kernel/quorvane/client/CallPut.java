@@ -2,6 +2,7 @@
 package com.brindlex.kernel.quorvane.client;
 
 import org.jetbrains.annotations.NotNull;
+
 /** The two kinds of options. */
 public enum CallPut implements Coded {
     /** Call. */

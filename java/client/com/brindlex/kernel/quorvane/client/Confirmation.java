@@ -1,6 +1,6 @@
 package com.brindlex.kernel.quorvane.client;
 
-/** The gateway did what was asked and has nothing more to say. */
+/** The gateway did what was asked and has nothing more to say. Never changes. */
 public final class Confirmation {
     static final Confirmation DONE = new Confirmation();
 

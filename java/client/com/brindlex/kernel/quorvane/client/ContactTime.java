@@ -2,6 +2,7 @@
 package com.brindlex.kernel.quorvane.client;
 
 import org.jetbrains.annotations.NotNull;
+
 /**
  * Code of a time at the opening of an account (tag TIME). What a number stands for is the
  * broker's. Never changes.

@@ -2,49 +2,43 @@
 package com.brindlex.kernel.quorvane.client;
 
 import org.jetbrains.annotations.NotNull;
+
 /** One credit figures. Never changes. */
 public final class CreditFigures extends Row<CreditFigures> {
     /** Stock code. */
     public static final Column<CreditFigures, String> STOCK_CODE =
-            new Column<CreditFigures, String>(0, "stockCode", Form.TEXT,
-                    "29", "stock code");
+            new Column<CreditFigures, String>(0, "stockCode", Form.TEXT, "29", "stock code");
 
     /** Credit figure 76. */
     public static final Column<CreditFigures, String> FIGURE76 =
-            new Column<CreditFigures, String>(1, "figure76", Form.TEXT,
-                    "76", "credit figure 76");
+            new Column<CreditFigures, String>(1, "figure76", Form.TEXT, "76", "credit figure 76");
 
     /** Credit figure 77. */
     public static final Column<CreditFigures, String> FIGURE77 =
-            new Column<CreditFigures, String>(2, "figure77", Form.TEXT,
-                    "77", "credit figure 77");
+            new Column<CreditFigures, String>(2, "figure77", Form.TEXT, "77", "credit figure 77");
 
     /** Credit figure B8. */
     public static final Column<CreditFigures, String> FIGURE_B8 =
-            new Column<CreditFigures, String>(3, "figureB8", Form.TEXT,
-                    "B8", "credit figure B8");
+            new Column<CreditFigures, String>(3, "figureB8", Form.TEXT, "B8", "credit figure B8");
 
     /** Credit figure B9. */
     public static final Column<CreditFigures, String> FIGURE_B9 =
-            new Column<CreditFigures, String>(4, "figureB9", Form.TEXT,
-                    "B9", "credit figure B9");
+            new Column<CreditFigures, String>(4, "figureB9", Form.TEXT, "B9", "credit figure B9");
 
     /** Credit figure A0. */
     public static final Column<CreditFigures, String> FIGURE_A0 =
-            new Column<CreditFigures, String>(5, "figureA0", Form.TEXT,
-                    "A0", "credit figure A0");
+            new Column<CreditFigures, String>(5, "figureA0", Form.TEXT, "A0", "credit figure A0");
 
     /** Credit figure A1. */
     public static final Column<CreditFigures, String> FIGURE_A1 =
-            new Column<CreditFigures, String>(6, "figureA1", Form.TEXT,
-                    "A1", "credit figure A1");
+            new Column<CreditFigures, String>(6, "figureA1", Form.TEXT, "A1", "credit figure A1");
 
     /** Credit figure A2. */
     public static final Column<CreditFigures, String> FIGURE_A2 =
-            new Column<CreditFigures, String>(7, "figureA2", Form.TEXT,
-                    "A2", "credit figure A2");
+            new Column<CreditFigures, String>(7, "figureA2", Form.TEXT, "A2", "credit figure A2");
 
-    static final Shape<CreditFigures> SHAPE = new Shape<CreditFigures>("credit figures", "0@1@2@3@4@5@6@7",
+    static final Shape<CreditFigures> SHAPE = new Shape<CreditFigures>("credit figures",
+            "0@1@2@3@4@5@6@7",
             STOCK_CODE, FIGURE76, FIGURE77, FIGURE_B8, FIGURE_B9, FIGURE_A0, FIGURE_A1, FIGURE_A2) {
         @Override
         CreditFigures row(String text, int start, int end) {

@@ -4,17 +4,17 @@ package com.brindlex.kernel.quorvane.client;
 import java.math.BigDecimal;
 import org.jetbrains.annotations.NotNull;
 import org.jetbrains.annotations.Nullable;
+
 /** One futures fill. Never changes. */
 public final class FuturesFill extends Row<FuturesFill> {
     /** Order number. */
     public static final Column<FuturesFill, String> ORDER_NUMBER =
-            new Column<FuturesFill, String>(0, "orderNumber", Form.TEXT,
-                    "36", "order number");
+            new Column<FuturesFill, String>(0, "orderNumber", Form.TEXT, "36", "order number");
 
     /** Number of the order at the gateway. */
     public static final Column<FuturesFill, String> GATEWAY_NUMBER =
-            new Column<FuturesFill, String>(1, "gatewayNumber", Form.TEXT,
-                    "46", "number of the order at the gateway");
+            new Column<FuturesFill, String>(1, "gatewayNumber", Form.TEXT, "46",
+                    "number of the order at the gateway");
 
     /** Side of leg 1. */
     public static final Column<FuturesFill, Code<LegCode>> LEG_CODE1 =
@@ -28,8 +28,8 @@ public final class FuturesFill extends Row<FuturesFill> {
 
     /** Word in front of a contract (TIMEX or TAIMEX). */
     public static final Column<FuturesFill, String> EXCHANGE =
-            new Column<FuturesFill, String>(4, "exchange", Form.TEXT,
-                    "", "word in front of a contract (TIMEX or TAIMEX)");
+            new Column<FuturesFill, String>(4, "exchange", Form.TEXT, "",
+                    "word in front of a contract (TIMEX or TAIMEX)");
 
     /** What the contract is. */
     public static final Column<FuturesFill, Code<Product>> PRODUCT =
@@ -38,23 +38,22 @@ public final class FuturesFill extends Row<FuturesFill> {
 
     /** Commodity of leg 1. */
     public static final Column<FuturesFill, String> COMMODITY1 =
-            new Column<FuturesFill, String>(6, "commodity1", Form.TEXT,
-                    "33", "commodity of leg 1");
+            new Column<FuturesFill, String>(6, "commodity1", Form.TEXT, "33", "commodity of leg 1");
 
     /** Contract month of leg 1. */
     public static final Column<FuturesFill, String> MONTH1 =
-            new Column<FuturesFill, String>(7, "month1", Form.MONTH,
-                    "29", "contract month of leg 1");
+            new Column<FuturesFill, String>(7, "month1", Form.MONTH, "29",
+                    "contract month of leg 1");
 
     /** Contract month of leg 2. */
     public static final Column<FuturesFill, String> MONTH2 =
-            new Column<FuturesFill, String>(8, "month2", Form.MONTH,
-                    "W0 V9", "contract month of leg 2");
+            new Column<FuturesFill, String>(8, "month2", Form.MONTH, "W0 V9",
+                    "contract month of leg 2");
 
     /** Call or put, leg 1. */
     public static final Column<FuturesFill, Code<CallPut>> CALL_PUT1 =
-            new Column<FuturesFill, Code<CallPut>>(9, "callPut1", Form.code(CallPut.values()),
-                    "V8", "call or put, leg 1");
+            new Column<FuturesFill, Code<CallPut>>(9, "callPut1", Form.code(CallPut.values()), "V8",
+                    "call or put, leg 1");
 
     /** Call or put, leg 2. */
     public static final Column<FuturesFill, Code<CallPut>> CALL_PUT2 =
@@ -63,61 +62,61 @@ public final class FuturesFill extends Row<FuturesFill> {
 
     /** Strike price of leg 1. */
     public static final Column<FuturesFill, BigDecimal> STRIKE1 =
-            new Column<FuturesFill, BigDecimal>(11, "strike1", Form.TEN_THOUSANDTHS,
-                    "34", "strike price of leg 1");
+            new Column<FuturesFill, BigDecimal>(11, "strike1", Form.TEN_THOUSANDTHS, "34",
+                    "strike price of leg 1");
 
     /** Strike price of leg 2. */
     public static final Column<FuturesFill, BigDecimal> STRIKE2 =
-            new Column<FuturesFill, BigDecimal>(12, "strike2", Form.TEN_THOUSANDTHS,
-                    "W2 V9", "strike price of leg 2");
+            new Column<FuturesFill, BigDecimal>(12, "strike2", Form.TEN_THOUSANDTHS, "W2 V9",
+                    "strike price of leg 2");
 
     /** Contracts that remain. */
     public static final Column<FuturesFill, Long> REMAINING_QUANTITY =
-            new Column<FuturesFill, Long>(13, "remainingQuantity", Form.COUNT,
-                    "70 37", "contracts that remain");
+            new Column<FuturesFill, Long>(13, "remainingQuantity", Form.COUNT, "70 37",
+                    "contracts that remain");
 
     /** Filled contracts. */
     public static final Column<FuturesFill, Long> FILLED_QUANTITY =
-            new Column<FuturesFill, Long>(14, "filledQuantity", Form.COUNT,
-                    "47", "filled contracts");
+            new Column<FuturesFill, Long>(14, "filledQuantity", Form.COUNT, "47",
+                    "filled contracts");
 
     /** Price of the order. */
     public static final Column<FuturesFill, BigDecimal> PRICE =
-            new Column<FuturesFill, BigDecimal>(15, "price", Form.TEN_THOUSANDTHS,
-                    "31", "price of the order");
+            new Column<FuturesFill, BigDecimal>(15, "price", Form.TEN_THOUSANDTHS, "31",
+                    "price of the order");
 
     /** Price in tag 48. */
     public static final Column<FuturesFill, BigDecimal> PRICE48 =
-            new Column<FuturesFill, BigDecimal>(16, "price48", Form.TEN_THOUSANDTHS,
-                    "48", "price in tag 48");
+            new Column<FuturesFill, BigDecimal>(16, "price48", Form.TEN_THOUSANDTHS, "48",
+                    "price in tag 48");
 
     /** Time of entry. */
     public static final Column<FuturesFill, TradeTime> ENTRY_TIME =
-            new Column<FuturesFill, TradeTime>(17, "entryTime", Form.TIME,
-                    "22", "time of entry");
+            new Column<FuturesFill, TradeTime>(17, "entryTime", Form.TIME, "22", "time of entry");
 
     /** Time in tag 51. */
     public static final Column<FuturesFill, TradeTime> TIME51 =
-            new Column<FuturesFill, TradeTime>(18, "time51", Form.TIME,
-                    "51", "time in tag 51");
+            new Column<FuturesFill, TradeTime>(18, "time51", Form.TIME, "51", "time in tag 51");
 
     /** MT flag, a blank when there is none. */
     public static final Column<FuturesFill, String> FLAG_MT =
-            new Column<FuturesFill, String>(19, "flagMT", Form.TEXT,
-                    "MT", "MT flag, a blank when there is none");
+            new Column<FuturesFill, String>(19, "flagMT", Form.TEXT, "MT",
+                    "MT flag, a blank when there is none");
 
     /** Date of the order. */
     public static final Column<FuturesFill, TradeDate> ORDER_DATE =
-            new Column<FuturesFill, TradeDate>(20, "orderDate", Form.DATE,
-                    "44", "date of the order");
+            new Column<FuturesFill, TradeDate>(20, "orderDate", Form.DATE, "44",
+                    "date of the order");
 
     /** Date in tag 50. */
     public static final Column<FuturesFill, TradeDate> DATE50 =
-            new Column<FuturesFill, TradeDate>(21, "date50", Form.DATE,
-                    "50", "date in tag 50");
+            new Column<FuturesFill, TradeDate>(21, "date50", Form.DATE, "50", "date in tag 50");
 
-    static final Shape<FuturesFill> SHAPE = new Shape<FuturesFill>("futures fill", "0&1@2|3@4&5&6&7|8&9|10&11|12@13&14@15&16@@@17&18@19@20&21",
-            ORDER_NUMBER, GATEWAY_NUMBER, LEG_CODE1, LEG_CODE2, EXCHANGE, PRODUCT, COMMODITY1, MONTH1, MONTH2, CALL_PUT1, CALL_PUT2, STRIKE1, STRIKE2, REMAINING_QUANTITY, FILLED_QUANTITY, PRICE, PRICE48, ENTRY_TIME, TIME51, FLAG_MT, ORDER_DATE, DATE50) {
+    static final Shape<FuturesFill> SHAPE = new Shape<FuturesFill>("futures fill",
+            "0&1@2|3@4&5&6&7|8&9|10&11|12@13&14@15&16@@@17&18@19@20&21",
+            ORDER_NUMBER, GATEWAY_NUMBER, LEG_CODE1, LEG_CODE2, EXCHANGE, PRODUCT, COMMODITY1,
+            MONTH1, MONTH2, CALL_PUT1, CALL_PUT2, STRIKE1, STRIKE2, REMAINING_QUANTITY,
+            FILLED_QUANTITY, PRICE, PRICE48, ENTRY_TIME, TIME51, FLAG_MT, ORDER_DATE, DATE50) {
         @Override
         FuturesFill row(String text, int start, int end) {
             return new FuturesFill(this, text, start, end);

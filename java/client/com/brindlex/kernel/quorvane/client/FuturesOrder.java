@@ -4,17 +4,17 @@ package com.brindlex.kernel.quorvane.client;
 import java.math.BigDecimal;
 import org.jetbrains.annotations.NotNull;
 import org.jetbrains.annotations.Nullable;
+
 /** One futures order. Never changes. */
 public final class FuturesOrder extends Row<FuturesOrder> {
     /** Number of the order at the gateway. */
     public static final Column<FuturesOrder, String> GATEWAY_NUMBER =
-            new Column<FuturesOrder, String>(0, "gatewayNumber", Form.TEXT,
-                    "46", "number of the order at the gateway");
+            new Column<FuturesOrder, String>(0, "gatewayNumber", Form.TEXT, "46",
+                    "number of the order at the gateway");
 
     /** Order number. */
     public static final Column<FuturesOrder, String> ORDER_NUMBER =
-            new Column<FuturesOrder, String>(1, "orderNumber", Form.TEXT,
-                    "36", "order number");
+            new Column<FuturesOrder, String>(1, "orderNumber", Form.TEXT, "36", "order number");
 
     /** Side of leg 1. */
     public static final Column<FuturesOrder, Code<LegCode>> LEG_CODE1 =
@@ -28,8 +28,8 @@ public final class FuturesOrder extends Row<FuturesOrder> {
 
     /** Word in front of a contract (TIMEX or TAIMEX). */
     public static final Column<FuturesOrder, String> EXCHANGE =
-            new Column<FuturesOrder, String>(4, "exchange", Form.TEXT,
-                    "", "word in front of a contract (TIMEX or TAIMEX)");
+            new Column<FuturesOrder, String>(4, "exchange", Form.TEXT, "",
+                    "word in front of a contract (TIMEX or TAIMEX)");
 
     /** What the contract is. */
     public static final Column<FuturesOrder, Code<Product>> PRODUCT =
@@ -38,23 +38,23 @@ public final class FuturesOrder extends Row<FuturesOrder> {
 
     /** Commodity of leg 1. */
     public static final Column<FuturesOrder, String> COMMODITY1 =
-            new Column<FuturesOrder, String>(6, "commodity1", Form.TEXT,
-                    "33", "commodity of leg 1");
+            new Column<FuturesOrder, String>(6, "commodity1", Form.TEXT, "33",
+                    "commodity of leg 1");
 
     /** Commodity of leg 2. */
     public static final Column<FuturesOrder, String> COMMODITY2 =
-            new Column<FuturesOrder, String>(7, "commodity2", Form.TEXT,
-                    "V9 V8 EL W3", "commodity of leg 2");
+            new Column<FuturesOrder, String>(7, "commodity2", Form.TEXT, "V9 V8 EL W3",
+                    "commodity of leg 2");
 
     /** Contract month of leg 1. */
     public static final Column<FuturesOrder, String> MONTH1 =
-            new Column<FuturesOrder, String>(8, "month1", Form.MONTH,
-                    "29", "contract month of leg 1");
+            new Column<FuturesOrder, String>(8, "month1", Form.MONTH, "29",
+                    "contract month of leg 1");
 
     /** Contract month of leg 2. */
     public static final Column<FuturesOrder, String> MONTH2 =
-            new Column<FuturesOrder, String>(9, "month2", Form.MONTH,
-                    "W0", "contract month of leg 2");
+            new Column<FuturesOrder, String>(9, "month2", Form.MONTH, "W0",
+                    "contract month of leg 2");
 
     /** Call or put, leg 1. */
     public static final Column<FuturesOrder, Code<CallPut>> CALL_PUT1 =
@@ -68,81 +68,83 @@ public final class FuturesOrder extends Row<FuturesOrder> {
 
     /** Strike price of leg 1. */
     public static final Column<FuturesOrder, BigDecimal> STRIKE1 =
-            new Column<FuturesOrder, BigDecimal>(12, "strike1", Form.BOOK_STRIKE,
-                    "34", "strike price of leg 1");
+            new Column<FuturesOrder, BigDecimal>(12, "strike1", Form.BOOK_STRIKE, "34",
+                    "strike price of leg 1");
 
     /** Strike price of leg 2. */
     public static final Column<FuturesOrder, BigDecimal> STRIKE2 =
-            new Column<FuturesOrder, BigDecimal>(13, "strike2", Form.BOOK_STRIKE,
-                    "W2", "strike price of leg 2");
+            new Column<FuturesOrder, BigDecimal>(13, "strike2", Form.BOOK_STRIKE, "W2",
+                    "strike price of leg 2");
 
     /** Ordered contracts. */
     public static final Column<FuturesOrder, Long> ORDERED_QUANTITY =
-            new Column<FuturesOrder, Long>(14, "orderedQuantity", Form.COUNT,
-                    "70", "ordered contracts");
+            new Column<FuturesOrder, Long>(14, "orderedQuantity", Form.COUNT, "70",
+                    "ordered contracts");
 
     /** State of the order. */
     public static final Column<FuturesOrder, Code<OrderStatus>> STATE =
-            new Column<FuturesOrder, Code<OrderStatus>>(15, "state", Form.code(OrderStatus.values()),
-                    "39 70 47 37 41 N6 O4 V5", "state of the order");
+            new Column<FuturesOrder, Code<OrderStatus>>(15, "state",
+                    Form.code(OrderStatus.values()), "39 70 47 37 41 N6 O4 V5",
+                    "state of the order");
 
     /** Why the order failed. */
     public static final Column<FuturesOrder, String> GATEWAY_TEXT =
-            new Column<FuturesOrder, String>(16, "gatewayText", Form.TEXT,
-                    "39 K1", "why the order failed");
+            new Column<FuturesOrder, String>(16, "gatewayText", Form.TEXT, "39 K1",
+                    "why the order failed");
 
     /** Filled contracts. */
     public static final Column<FuturesOrder, Long> FILLED_QUANTITY =
-            new Column<FuturesOrder, Long>(17, "filledQuantity", Form.COUNT,
-                    "47", "filled contracts");
+            new Column<FuturesOrder, Long>(17, "filledQuantity", Form.COUNT, "47",
+                    "filled contracts");
 
     /** Cancelled quantity: the sum of both tags. */
     public static final Column<FuturesOrder, Long> CANCELLED_QUANTITY =
-            new Column<FuturesOrder, Long>(18, "cancelledQuantity", Form.COUNT,
-                    "37 41", "cancelled quantity: the sum of both tags");
+            new Column<FuturesOrder, Long>(18, "cancelledQuantity", Form.COUNT, "37 41",
+                    "cancelled quantity: the sum of both tags");
 
     /** Order price. */
     public static final Column<FuturesOrder, Price> PRICE =
-            new Column<FuturesOrder, Price>(19, "price", Form.PRICE_4,
-                    "27 31", "order price");
+            new Column<FuturesOrder, Price>(19, "price", Form.PRICE_4, "27 31", "order price");
 
     /** Time of entry. */
     public static final Column<FuturesOrder, TradeTime> ENTRY_TIME =
-            new Column<FuturesOrder, TradeTime>(20, "entryTime", Form.TIME,
-                    "22", "time of entry");
+            new Column<FuturesOrder, TradeTime>(20, "entryTime", Form.TIME, "22", "time of entry");
 
     /** Date of entry. */
     public static final Column<FuturesOrder, TradeDate> ENTRY_DATE =
-            new Column<FuturesOrder, TradeDate>(21, "entryDate", Form.DATE,
-                    "21", "date of entry");
+            new Column<FuturesOrder, TradeDate>(21, "entryDate", Form.DATE, "21", "date of entry");
 
     /** Date of the order. */
     public static final Column<FuturesOrder, TradeDate> ORDER_DATE =
-            new Column<FuturesOrder, TradeDate>(22, "orderDate", Form.DATE,
-                    "44", "date of the order");
+            new Column<FuturesOrder, TradeDate>(22, "orderDate", Form.DATE, "44",
+                    "date of the order");
 
     /** Handling flag of the broker. */
     public static final Column<FuturesOrder, String> HANDLING_FLAG =
-            new Column<FuturesOrder, String>(23, "handlingFlag", Form.TEXT,
-                    "N6", "handling flag of the broker");
+            new Column<FuturesOrder, String>(23, "handlingFlag", Form.TEXT, "N6",
+                    "handling flag of the broker");
 
     /** Whether the order can be changed. */
     public static final Column<FuturesOrder, Code<Amendable>> CHANGEABLE =
-            new Column<FuturesOrder, Code<Amendable>>(24, "changeable", Form.code(Amendable.values()),
-                    "JV 39 K1", "whether the order can be changed");
+            new Column<FuturesOrder, Code<Amendable>>(24, "changeable",
+                    Form.code(Amendable.values()), "JV 39 K1", "whether the order can be changed");
 
     /** Time in force. */
     public static final Column<FuturesOrder, Code<TimeInForce>> TIME_IN_FORCE =
-            new Column<FuturesOrder, Code<TimeInForce>>(25, "timeInForce", Form.code(TimeInForce.values()),
-                    "O4 V5", "time in force");
+            new Column<FuturesOrder, Code<TimeInForce>>(25, "timeInForce",
+                    Form.code(TimeInForce.values()), "O4 V5", "time in force");
 
     /** MT flag, a blank when there is none. */
     public static final Column<FuturesOrder, String> FLAG_MT =
-            new Column<FuturesOrder, String>(26, "flagMT", Form.TEXT,
-                    "MT", "MT flag, a blank when there is none");
+            new Column<FuturesOrder, String>(26, "flagMT", Form.TEXT, "MT",
+                    "MT flag, a blank when there is none");
 
-    static final Shape<FuturesOrder> SHAPE = new Shape<FuturesOrder>("futures order", "0@1@?2|3@4&5&6|7&8|9&10|11&12|13@14@15&16@17@18@?19@20@21@22@23@24@25@26",
-            GATEWAY_NUMBER, ORDER_NUMBER, LEG_CODE1, LEG_CODE2, EXCHANGE, PRODUCT, COMMODITY1, COMMODITY2, MONTH1, MONTH2, CALL_PUT1, CALL_PUT2, STRIKE1, STRIKE2, ORDERED_QUANTITY, STATE, GATEWAY_TEXT, FILLED_QUANTITY, CANCELLED_QUANTITY, PRICE, ENTRY_TIME, ENTRY_DATE, ORDER_DATE, HANDLING_FLAG, CHANGEABLE, TIME_IN_FORCE, FLAG_MT) {
+    static final Shape<FuturesOrder> SHAPE = new Shape<FuturesOrder>("futures order",
+            "0@1@?2|3@4&5&6|7&8|9&10|11&12|13@14@15&16@17@18@?19@20@21@22@23@24@25@26",
+            GATEWAY_NUMBER, ORDER_NUMBER, LEG_CODE1, LEG_CODE2, EXCHANGE, PRODUCT, COMMODITY1,
+            COMMODITY2, MONTH1, MONTH2, CALL_PUT1, CALL_PUT2, STRIKE1, STRIKE2, ORDERED_QUANTITY,
+            STATE, GATEWAY_TEXT, FILLED_QUANTITY, CANCELLED_QUANTITY, PRICE, ENTRY_TIME, ENTRY_DATE,
+            ORDER_DATE, HANDLING_FLAG, CHANGEABLE, TIME_IN_FORCE, FLAG_MT) {
         @Override
         FuturesOrder row(String text, int start, int end) {
             return new FuturesOrder(this, text, start, end);

@@ -3,29 +3,31 @@ package com.brindlex.kernel.quorvane.client;
 
 import org.jetbrains.annotations.NotNull;
 import org.jetbrains.annotations.Nullable;
+
 /** One futures order receipt. Never changes. */
 public final class FuturesOrderReceipt extends Row<FuturesOrderReceipt> {
     /** Number of the order at the gateway. */
     public static final Column<FuturesOrderReceipt, String> GATEWAY_NUMBER =
-            new Column<FuturesOrderReceipt, String>(0, "gatewayNumber", Form.TEXT,
-                    "46", "number of the order at the gateway");
+            new Column<FuturesOrderReceipt, String>(0, "gatewayNumber", Form.TEXT, "46",
+                    "number of the order at the gateway");
 
     /** Date of the order. */
     public static final Column<FuturesOrderReceipt, TradeDate> ORDER_DATE =
-            new Column<FuturesOrderReceipt, TradeDate>(1, "orderDate", Form.DATE,
-                    "44", "date of the order");
+            new Column<FuturesOrderReceipt, TradeDate>(1, "orderDate", Form.DATE, "44",
+                    "date of the order");
 
     /** Acceptance letter of the gateway. */
     public static final Column<FuturesOrderReceipt, Code<Acceptance>> ACCEPTANCE =
-            new Column<FuturesOrderReceipt, Code<Acceptance>>(2, "acceptance", Form.code(Acceptance.values()),
-                    "19", "acceptance letter of the gateway");
+            new Column<FuturesOrderReceipt, Code<Acceptance>>(2, "acceptance",
+                    Form.code(Acceptance.values()), "19", "acceptance letter of the gateway");
 
     /** MT flag: 0, 1 or empty. */
     public static final Column<FuturesOrderReceipt, String> FLAG_MT =
-            new Column<FuturesOrderReceipt, String>(3, "flagMT", Form.TEXT,
-                    "MT", "MT flag: 0, 1 or empty");
+            new Column<FuturesOrderReceipt, String>(3, "flagMT", Form.TEXT, "MT",
+                    "MT flag: 0, 1 or empty");
 
-    static final Shape<FuturesOrderReceipt> SHAPE = new Shape<FuturesOrderReceipt>("futures order receipt", "0@1@@2@3@",
+    static final Shape<FuturesOrderReceipt> SHAPE = new Shape<FuturesOrderReceipt>("futures order receipt",
+            "0@1@@2@3@",
             GATEWAY_NUMBER, ORDER_DATE, ACCEPTANCE, FLAG_MT) {
         @Override
         FuturesOrderReceipt row(String text, int start, int end) {

@@ -4,22 +4,23 @@ package com.brindlex.kernel.quorvane.client;
 import java.math.BigDecimal;
 import org.jetbrains.annotations.NotNull;
 import org.jetbrains.annotations.Nullable;
+
 /** One futures position. Never changes. */
 public final class FuturesPosition extends Row<FuturesPosition> {
     /** Side of leg 1. */
     public static final Column<FuturesPosition, Code<Side>> SIDE1 =
-            new Column<FuturesPosition, Code<Side>>(0, "side1", Form.code(Side.values()),
-                    "32", "side of leg 1");
+            new Column<FuturesPosition, Code<Side>>(0, "side1", Form.code(Side.values()), "32",
+                    "side of leg 1");
 
     /** Side of leg 2. */
     public static final Column<FuturesPosition, Code<Side>> SIDE2 =
-            new Column<FuturesPosition, Code<Side>>(1, "side2", Form.code(Side.values()),
-                    "EL V9", "side of leg 2");
+            new Column<FuturesPosition, Code<Side>>(1, "side2", Form.code(Side.values()), "EL V9",
+                    "side of leg 2");
 
     /** Word in front of a contract (TIMEX or TAIMEX). */
     public static final Column<FuturesPosition, String> EXCHANGE =
-            new Column<FuturesPosition, String>(2, "exchange", Form.TEXT,
-                    "", "word in front of a contract (TIMEX or TAIMEX)");
+            new Column<FuturesPosition, String>(2, "exchange", Form.TEXT, "",
+                    "word in front of a contract (TIMEX or TAIMEX)");
 
     /** What the contract is. */
     public static final Column<FuturesPosition, Code<Product>> PRODUCT =
@@ -28,46 +29,47 @@ public final class FuturesPosition extends Row<FuturesPosition> {
 
     /** Commodity of leg 1. */
     public static final Column<FuturesPosition, String> COMMODITY1 =
-            new Column<FuturesPosition, String>(4, "commodity1", Form.TEXT,
-                    "33", "commodity of leg 1");
+            new Column<FuturesPosition, String>(4, "commodity1", Form.TEXT, "33",
+                    "commodity of leg 1");
 
     /** Contract month of leg 1. */
     public static final Column<FuturesPosition, String> MONTH1 =
-            new Column<FuturesPosition, String>(5, "month1", Form.MONTH,
-                    "29", "contract month of leg 1");
+            new Column<FuturesPosition, String>(5, "month1", Form.MONTH, "29",
+                    "contract month of leg 1");
 
     /** Contract month of leg 2. */
     public static final Column<FuturesPosition, String> MONTH2 =
-            new Column<FuturesPosition, String>(6, "month2", Form.MONTH,
-                    "W0 V9", "contract month of leg 2");
+            new Column<FuturesPosition, String>(6, "month2", Form.MONTH, "W0 V9",
+                    "contract month of leg 2");
 
     /** Quantity in tag R8. */
     public static final Column<FuturesPosition, Long> QUANTITY_R8 =
-            new Column<FuturesPosition, Long>(7, "quantityR8", Form.COUNT,
-                    "R8", "quantity in tag R8");
+            new Column<FuturesPosition, Long>(7, "quantityR8", Form.COUNT, "R8",
+                    "quantity in tag R8");
 
     /** Price in tag 48. */
     public static final Column<FuturesPosition, BigDecimal> PRICE48 =
-            new Column<FuturesPosition, BigDecimal>(8, "price48", Form.TEN_THOUSANDTHS,
-                    "48", "price in tag 48");
+            new Column<FuturesPosition, BigDecimal>(8, "price48", Form.TEN_THOUSANDTHS, "48",
+                    "price in tag 48");
 
     /** Price in tag W5. */
     public static final Column<FuturesPosition, BigDecimal> PRICE_W5 =
-            new Column<FuturesPosition, BigDecimal>(9, "priceW5", Form.TEN_THOUSANDTHS,
-                    "W5 V9", "price in tag W5");
+            new Column<FuturesPosition, BigDecimal>(9, "priceW5", Form.TEN_THOUSANDTHS, "W5 V9",
+                    "price in tag W5");
 
     /** Date in tag 50. */
     public static final Column<FuturesPosition, TradeDate> DATE50 =
-            new Column<FuturesPosition, TradeDate>(10, "date50", Form.DATE,
-                    "50", "date in tag 50");
+            new Column<FuturesPosition, TradeDate>(10, "date50", Form.DATE, "50", "date in tag 50");
 
     /** Currency. */
     public static final Column<FuturesPosition, Code<Currency>> CURRENCY =
-            new Column<FuturesPosition, Code<Currency>>(11, "currency", Form.code(Currency.values()),
-                    "28", "currency");
+            new Column<FuturesPosition, Code<Currency>>(11, "currency",
+                    Form.code(Currency.values()), "28", "currency");
 
-    static final Shape<FuturesPosition> SHAPE = new Shape<FuturesPosition>("futures position", "0|1@2&3&4&5|6@7@8|9@10@11",
-            SIDE1, SIDE2, EXCHANGE, PRODUCT, COMMODITY1, MONTH1, MONTH2, QUANTITY_R8, PRICE48, PRICE_W5, DATE50, CURRENCY) {
+    static final Shape<FuturesPosition> SHAPE = new Shape<FuturesPosition>("futures position",
+            "0|1@2&3&4&5|6@7@8|9@10@11",
+            SIDE1, SIDE2, EXCHANGE, PRODUCT, COMMODITY1, MONTH1, MONTH2, QUANTITY_R8, PRICE48,
+            PRICE_W5, DATE50, CURRENCY) {
         @Override
         FuturesPosition row(String text, int start, int end) {
             return new FuturesPosition(this, text, start, end);

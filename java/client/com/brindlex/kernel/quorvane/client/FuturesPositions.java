@@ -29,7 +29,8 @@ public final class FuturesPositions {
 
     @Override
     public boolean equals(Object other) {
-        return other instanceof FuturesPositions && ((FuturesPositions) other).result.equals(result);
+        return other instanceof FuturesPositions
+                && ((FuturesPositions) other).result.equals(result);
     }
 
     @Override

@@ -2,6 +2,7 @@
 package com.brindlex.kernel.quorvane.client;
 
 import org.jetbrains.annotations.NotNull;
+
 /**
  * Side of one leg with flag W3 in one code: odd codes buy, even codes sell.
  *

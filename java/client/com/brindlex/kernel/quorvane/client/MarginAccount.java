@@ -4,6 +4,7 @@ package com.brindlex.kernel.quorvane.client;
 import java.math.BigDecimal;
 import org.jetbrains.annotations.NotNull;
 import org.jetbrains.annotations.Nullable;
+
 /** One margin account. Never changes. */
 public final class MarginAccount extends Row<MarginAccount> {
     /** Currency, always TWD. */
@@ -13,76 +14,79 @@ public final class MarginAccount extends Row<MarginAccount> {
 
     /** Margin amount LO with two decimals. */
     public static final Column<MarginAccount, BigDecimal> AMOUNT_LO_HUNDREDTHS =
-            new Column<MarginAccount, BigDecimal>(1, "amountLOHundredths", Form.HUNDREDTHS,
-                    "LO", "margin amount LO with two decimals");
+            new Column<MarginAccount, BigDecimal>(1, "amountLOHundredths", Form.HUNDREDTHS, "LO",
+                    "margin amount LO with two decimals");
 
     /** Margin amount PN. */
     public static final Column<MarginAccount, BigDecimal> AMOUNT_PN =
-            new Column<MarginAccount, BigDecimal>(2, "amountPN", Form.AMOUNT_OR_TEXT,
-                    "PN", "margin amount PN");
+            new Column<MarginAccount, BigDecimal>(2, "amountPN", Form.AMOUNT_OR_TEXT, "PN",
+                    "margin amount PN");
 
     /** Margin amount RA. */
     public static final Column<MarginAccount, BigDecimal> AMOUNT_RA =
-            new Column<MarginAccount, BigDecimal>(3, "amountRA", Form.TEN_THOUSANDTHS,
-                    "RA", "margin amount RA");
+            new Column<MarginAccount, BigDecimal>(3, "amountRA", Form.TEN_THOUSANDTHS, "RA",
+                    "margin amount RA");
 
     /** Margin amount LO. */
     public static final Column<MarginAccount, BigDecimal> AMOUNT_LO =
-            new Column<MarginAccount, BigDecimal>(4, "amountLO", Form.TEN_THOUSANDTHS,
-                    "LO", "margin amount LO");
+            new Column<MarginAccount, BigDecimal>(4, "amountLO", Form.TEN_THOUSANDTHS, "LO",
+                    "margin amount LO");
 
     /** Margin amount QY. */
     public static final Column<MarginAccount, BigDecimal> AMOUNT_QY =
-            new Column<MarginAccount, BigDecimal>(5, "amountQY", Form.TEN_THOUSANDTHS,
-                    "QY", "margin amount QY");
+            new Column<MarginAccount, BigDecimal>(5, "amountQY", Form.TEN_THOUSANDTHS, "QY",
+                    "margin amount QY");
 
     /** Margin amount QX. */
     public static final Column<MarginAccount, BigDecimal> AMOUNT_QX =
-            new Column<MarginAccount, BigDecimal>(6, "amountQX", Form.TEN_THOUSANDTHS,
-                    "QX", "margin amount QX");
+            new Column<MarginAccount, BigDecimal>(6, "amountQX", Form.TEN_THOUSANDTHS, "QX",
+                    "margin amount QX");
 
     /** Margin amount U5. */
     public static final Column<MarginAccount, BigDecimal> AMOUNT_U5 =
-            new Column<MarginAccount, BigDecimal>(7, "amountU5", Form.TEN_THOUSANDTHS,
-                    "U5", "margin amount U5");
+            new Column<MarginAccount, BigDecimal>(7, "amountU5", Form.TEN_THOUSANDTHS, "U5",
+                    "margin amount U5");
 
     /** Margin amount U9. */
     public static final Column<MarginAccount, BigDecimal> AMOUNT_U9 =
-            new Column<MarginAccount, BigDecimal>(8, "amountU9", Form.TEN_THOUSANDTHS,
-                    "U9", "margin amount U9");
+            new Column<MarginAccount, BigDecimal>(8, "amountU9", Form.TEN_THOUSANDTHS, "U9",
+                    "margin amount U9");
 
     /** Margin amount U5 again. */
     public static final Column<MarginAccount, BigDecimal> AMOUNT_U5_REPEATED =
-            new Column<MarginAccount, BigDecimal>(9, "amountU5Repeated", Form.TEN_THOUSANDTHS,
-                    "U5", "margin amount U5 again");
+            new Column<MarginAccount, BigDecimal>(9, "amountU5Repeated", Form.TEN_THOUSANDTHS, "U5",
+                    "margin amount U5 again");
 
     /** Margin amount RF. */
     public static final Column<MarginAccount, BigDecimal> AMOUNT_RF =
-            new Column<MarginAccount, BigDecimal>(10, "amountRF", Form.TEN_THOUSANDTHS,
-                    "RF", "margin amount RF");
+            new Column<MarginAccount, BigDecimal>(10, "amountRF", Form.TEN_THOUSANDTHS, "RF",
+                    "margin amount RF");
 
     /** Margin amount F0. */
     public static final Column<MarginAccount, BigDecimal> AMOUNT_F0 =
-            new Column<MarginAccount, BigDecimal>(11, "amountF0", Form.TEN_THOUSANDTHS,
-                    "F0", "margin amount F0");
+            new Column<MarginAccount, BigDecimal>(11, "amountF0", Form.TEN_THOUSANDTHS, "F0",
+                    "margin amount F0");
 
     /** Margin amount F1. */
     public static final Column<MarginAccount, BigDecimal> AMOUNT_F1 =
-            new Column<MarginAccount, BigDecimal>(12, "amountF1", Form.TEN_THOUSANDTHS,
-                    "F1", "margin amount F1");
+            new Column<MarginAccount, BigDecimal>(12, "amountF1", Form.TEN_THOUSANDTHS, "F1",
+                    "margin amount F1");
 
     /** Margin amount F2. */
     public static final Column<MarginAccount, BigDecimal> AMOUNT_F2 =
-            new Column<MarginAccount, BigDecimal>(13, "amountF2", Form.TEN_THOUSANDTHS,
-                    "F2", "margin amount F2");
+            new Column<MarginAccount, BigDecimal>(13, "amountF2", Form.TEN_THOUSANDTHS, "F2",
+                    "margin amount F2");
 
     /** Margin amount F3. */
     public static final Column<MarginAccount, BigDecimal> AMOUNT_F3 =
-            new Column<MarginAccount, BigDecimal>(14, "amountF3", Form.TEN_THOUSANDTHS,
-                    "F3", "margin amount F3");
+            new Column<MarginAccount, BigDecimal>(14, "amountF3", Form.TEN_THOUSANDTHS, "F3",
+                    "margin amount F3");
 
-    static final Shape<MarginAccount> SHAPE = new Shape<MarginAccount>("margin account", "0@@1@@2@3@4@5@@6@@7@@@@@8@9@@@@@10@@@@@11@12@13@14@",
-            CURRENCY, AMOUNT_LO_HUNDREDTHS, AMOUNT_PN, AMOUNT_RA, AMOUNT_LO, AMOUNT_QY, AMOUNT_QX, AMOUNT_U5, AMOUNT_U9, AMOUNT_U5_REPEATED, AMOUNT_RF, AMOUNT_F0, AMOUNT_F1, AMOUNT_F2, AMOUNT_F3) {
+    static final Shape<MarginAccount> SHAPE = new Shape<MarginAccount>("margin account",
+            "0@@1@@2@3@4@5@@6@@7@@@@@8@9@@@@@10@@@@@11@12@13@14@",
+            CURRENCY, AMOUNT_LO_HUNDREDTHS, AMOUNT_PN, AMOUNT_RA, AMOUNT_LO, AMOUNT_QY, AMOUNT_QX,
+            AMOUNT_U5, AMOUNT_U9, AMOUNT_U5_REPEATED, AMOUNT_RF, AMOUNT_F0, AMOUNT_F1, AMOUNT_F2,
+            AMOUNT_F3) {
         @Override
         MarginAccount row(String text, int start, int end) {
             return new MarginAccount(this, text, start, end);

@@ -2,6 +2,7 @@
 package com.brindlex.kernel.quorvane.client;
 
 import org.jetbrains.annotations.NotNull;
+
 /**
  * Query type of the margin account. Any other is sent unchanged. Which account or currency a
  * number selects is not known. Never changes.

@@ -2,6 +2,7 @@
 package com.brindlex.kernel.quorvane.client;
 
 import com.brindlex.kernel.quorvane.gatewayjni;
+
 /** Calls the natives. */
 final class Natives {
     private Natives() {}
@@ -10,164 +11,185 @@ final class Natives {
             Operation operation, int market, Session session, Object[] v, int[] status) {
         switch (operation) {
             case AUTH_ENCODE:
-                return gatewayjni.AuthEncode(market,
-                        session.platform().number(), session.sequence(),
-                        session.serialNumber(), session.localAddress(),
+                return gatewayjni.AuthEncode(market, session.platform().number(),
+                        session.sequence(), session.serialNumber(), session.localAddress(),
                         (String) v[0], (String) v[1], (String) v[2], status);
             case GET_TOTAL_ACCOUNT_ENCODE:
-                return gatewayjni.GetTotalAccountEncode(market,
-                        session.platform().number(), session.sequence(),
-                        session.serialNumber(), session.localAddress(),
+                return gatewayjni.GetTotalAccountEncode(market, session.platform().number(),
+                        session.sequence(), session.serialNumber(), session.localAddress(),
                         (String) v[0], (String) v[1], (String) v[2], status);
             case OPEN_ACCOUNT_ENCODE:
-                return gatewayjni.OpenAccountEncode(market,
-                        session.platform().number(), session.sequence(),
-                        session.serialNumber(), session.localAddress(),
-                        (String) v[0], (String) v[1], (String) v[2], (String) v[3], (String) v[4], (String) v[5], ((Integer) v[6]).byteValue(), ((Integer) v[7]).byteValue(), status);
+                return gatewayjni.OpenAccountEncode(market, session.platform().number(),
+                        session.sequence(), session.serialNumber(), session.localAddress(),
+                        (String) v[0], (String) v[1], (String) v[2], (String) v[3], (String) v[4],
+                        (String) v[5], ((Integer) v[6]).byteValue(), ((Integer) v[7]).byteValue(),
+                        status);
             case CHANGE_PASSWORD_ENCODE:
-                return gatewayjni.ChangePasswordEncode(market,
-                        session.platform().number(), session.sequence(),
-                        session.serialNumber(), session.localAddress(),
+                return gatewayjni.ChangePasswordEncode(market, session.platform().number(),
+                        session.sequence(), session.serialNumber(), session.localAddress(),
                         (String) v[0], (String) v[1], (String) v[2], (String) v[3], status);
             case QUERY_BANK_REMAIN_ENCODE:
-                return gatewayjni.QueryBankRemainEncode(market,
-                        session.platform().number(), session.sequence(),
-                        session.serialNumber(), session.localAddress(),
+                return gatewayjni.QueryBankRemainEncode(market, session.platform().number(),
+                        session.sequence(), session.serialNumber(), session.localAddress(),
                         (String) v[0], (String) v[1], (String) v[2], status);
             case REGISTER_CERT_ENCODE:
-                return gatewayjni.RegisterCertEncode(market,
-                        session.platform().number(), session.sequence(),
-                        session.serialNumber(), session.localAddress(),
+                return gatewayjni.RegisterCertEncode(market, session.platform().number(),
+                        session.sequence(), session.serialNumber(), session.localAddress(),
                         (String) v[0], status);
             case GET_CERT_ENCODE:
-                return gatewayjni.GetCertEncode(market,
-                        session.platform().number(), session.sequence(),
-                        session.serialNumber(), session.localAddress(),
+                return gatewayjni.GetCertEncode(market, session.platform().number(),
+                        session.sequence(), session.serialNumber(), session.localAddress(),
                         (String) v[0], status);
             case GET_CERT_ENCODE2:
-                return gatewayjni.GetCertEncode2(market,
-                        session.platform().number(), session.sequence(),
-                        session.serialNumber(), session.localAddress(),
+                return gatewayjni.GetCertEncode2(market, session.platform().number(),
+                        session.sequence(), session.serialNumber(), session.localAddress(),
                         (String) v[0], status);
             case APPLY_CERT_ENCODE:
-                return gatewayjni.ApplyCertEncode(market,
-                        session.platform().number(), session.sequence(),
-                        session.serialNumber(), session.localAddress(),
-                        (String) v[0], (String) v[1], (String) v[2], (String) v[3], (String) v[4], status);
+                return gatewayjni.ApplyCertEncode(market, session.platform().number(),
+                        session.sequence(), session.serialNumber(), session.localAddress(),
+                        (String) v[0], (String) v[1], (String) v[2], (String) v[3], (String) v[4],
+                        status);
             case REVOKE_CERT_ENCODE:
-                return gatewayjni.RevokeCertEncode(market,
-                        session.platform().number(), session.sequence(),
-                        session.serialNumber(), session.localAddress(),
-                        (String) v[0], (String) v[1], (String) v[2], (String) v[3], (String) v[4], status);
+                return gatewayjni.RevokeCertEncode(market, session.platform().number(),
+                        session.sequence(), session.serialNumber(), session.localAddress(),
+                        (String) v[0], (String) v[1], (String) v[2], (String) v[3], (String) v[4],
+                        status);
             case RE_NEW_CERT_ENCODE:
-                return gatewayjni.ReNewCertEncode(market,
-                        session.platform().number(), session.sequence(),
-                        session.serialNumber(), session.localAddress(),
-                        (String) v[0], (String) v[1], (String) v[2], (String) v[3], (String) v[4], status);
+                return gatewayjni.ReNewCertEncode(market, session.platform().number(),
+                        session.sequence(), session.serialNumber(), session.localAddress(),
+                        (String) v[0], (String) v[1], (String) v[2], (String) v[3], (String) v[4],
+                        status);
             case GET_CERT_STATUS_ENCODE:
-                return gatewayjni.GetCertStatusEncode(market,
-                        session.platform().number(), session.sequence(),
-                        session.serialNumber(), session.localAddress(),
+                return gatewayjni.GetCertStatusEncode(market, session.platform().number(),
+                        session.sequence(), session.serialNumber(), session.localAddress(),
                         (String) v[0], status);
             case INSTALL_CERT_OK_ENCODE:
-                return gatewayjni.InstallCertOKEncode(market,
-                        session.platform().number(), session.sequence(),
-                        session.serialNumber(), session.localAddress(),
+                return gatewayjni.InstallCertOKEncode(market, session.platform().number(),
+                        session.sequence(), session.serialNumber(), session.localAddress(),
                         (String) v[0], status);
             case OPEN_CERT_ENCODE:
-                return gatewayjni.OpenCertEncode(market,
-                        session.platform().number(), session.sequence(),
-                        session.serialNumber(), session.localAddress(),
+                return gatewayjni.OpenCertEncode(market, session.platform().number(),
+                        session.sequence(), session.serialNumber(), session.localAddress(),
                         (String) v[0], status);
             case SUBMIT_ORDER_ENCODE:
-                return gatewayjni.SubmitOrderEncode(market,
-                        session.platform().number(), session.sequence(),
-                        session.serialNumber(), session.localAddress(),
-                        (String) v[0], (String) v[1], (String) v[2], (String) v[3], (String) v[4], (Integer) v[5], (Integer) v[6], (Integer) v[7], (byte) ((Character) v[8]).charValue(), (byte) ((Character) v[9]).charValue(), ((Integer) v[10]).byteValue(), ((Integer) v[11]).byteValue(), ((Integer) v[12]).byteValue(), ((Integer) v[13]).byteValue(), status);
+                return gatewayjni.SubmitOrderEncode(market, session.platform().number(),
+                        session.sequence(), session.serialNumber(), session.localAddress(),
+                        (String) v[0], (String) v[1], (String) v[2], (String) v[3], (String) v[4],
+                        (Integer) v[5], (Integer) v[6], (Integer) v[7],
+                        (byte) ((Character) v[8]).charValue(),
+                        (byte) ((Character) v[9]).charValue(), ((Integer) v[10]).byteValue(),
+                        ((Integer) v[11]).byteValue(), ((Integer) v[12]).byteValue(),
+                        ((Integer) v[13]).byteValue(), status);
             case SUBMIT_ORDER_ENCODE1:
-                return gatewayjni.SubmitOrderEncode1(market,
-                        session.platform().number(), session.sequence(),
-                        session.serialNumber(), session.localAddress(),
-                        (String) v[0], (String) v[1], (String) v[2], (String) v[3], (String) v[4], (Integer) v[5], (Integer) v[6], (Integer) v[7], (byte) ((Character) v[8]).charValue(), (byte) ((Character) v[9]).charValue(), ((Integer) v[10]).byteValue(), ((Integer) v[11]).byteValue(), ((Integer) v[12]).byteValue(), ((Integer) v[13]).byteValue(), status);
+                return gatewayjni.SubmitOrderEncode1(market, session.platform().number(),
+                        session.sequence(), session.serialNumber(), session.localAddress(),
+                        (String) v[0], (String) v[1], (String) v[2], (String) v[3], (String) v[4],
+                        (Integer) v[5], (Integer) v[6], (Integer) v[7],
+                        (byte) ((Character) v[8]).charValue(),
+                        (byte) ((Character) v[9]).charValue(), ((Integer) v[10]).byteValue(),
+                        ((Integer) v[11]).byteValue(), ((Integer) v[12]).byteValue(),
+                        ((Integer) v[13]).byteValue(), status);
             case SUBMIT_ORDER_ENCODE2:
-                return gatewayjni.SubmitOrderEncode2(market,
-                        session.platform().number(), session.sequence(),
-                        session.serialNumber(), session.localAddress(),
-                        (String) v[0], (String) v[1], (String) v[2], (byte) ((Character) v[3]).charValue(), ((Integer) v[4]).byteValue());
+                return gatewayjni.SubmitOrderEncode2(market, session.platform().number(),
+                        session.sequence(), session.serialNumber(), session.localAddress(),
+                        (String) v[0], (String) v[1], (String) v[2],
+                        (byte) ((Character) v[3]).charValue(), ((Integer) v[4]).byteValue());
             case CANCEL_ORDER_ENCODE:
-                return gatewayjni.CancelOrderEncode(market,
-                        session.platform().number(), session.sequence(),
-                        session.serialNumber(), session.localAddress(),
-                        (String) v[0], (String) v[1], (String) v[2], (String) v[3], (String) v[4], (String) v[5], (Integer) v[6], (Integer) v[7], (Integer) v[8], (byte) ((Character) v[9]).charValue(), (byte) ((Character) v[10]).charValue(), ((Integer) v[11]).byteValue(), ((Integer) v[12]).byteValue(), ((Integer) v[13]).byteValue(), ((Integer) v[14]).byteValue(), status);
+                return gatewayjni.CancelOrderEncode(market, session.platform().number(),
+                        session.sequence(), session.serialNumber(), session.localAddress(),
+                        (String) v[0], (String) v[1], (String) v[2], (String) v[3], (String) v[4],
+                        (String) v[5], (Integer) v[6], (Integer) v[7], (Integer) v[8],
+                        (byte) ((Character) v[9]).charValue(),
+                        (byte) ((Character) v[10]).charValue(), ((Integer) v[11]).byteValue(),
+                        ((Integer) v[12]).byteValue(), ((Integer) v[13]).byteValue(),
+                        ((Integer) v[14]).byteValue(), status);
             case CANCEL_ORDER_ENCODE1:
-                return gatewayjni.CancelOrderEncode1(market,
-                        session.platform().number(), session.sequence(),
-                        session.serialNumber(), session.localAddress(),
-                        (String) v[0], (String) v[1], (String) v[2], (String) v[3], (String) v[4], (String) v[5], (Integer) v[6], (Integer) v[7], (Integer) v[8], (byte) ((Character) v[9]).charValue(), (byte) ((Character) v[10]).charValue(), ((Integer) v[11]).byteValue(), ((Integer) v[12]).byteValue(), ((Integer) v[13]).byteValue(), ((Integer) v[14]).byteValue(), status);
+                return gatewayjni.CancelOrderEncode1(market, session.platform().number(),
+                        session.sequence(), session.serialNumber(), session.localAddress(),
+                        (String) v[0], (String) v[1], (String) v[2], (String) v[3], (String) v[4],
+                        (String) v[5], (Integer) v[6], (Integer) v[7], (Integer) v[8],
+                        (byte) ((Character) v[9]).charValue(),
+                        (byte) ((Character) v[10]).charValue(), ((Integer) v[11]).byteValue(),
+                        ((Integer) v[12]).byteValue(), ((Integer) v[13]).byteValue(),
+                        ((Integer) v[14]).byteValue(), status);
             case CHANGE_ORDER_ENCODE:
-                return gatewayjni.ChangeOrderEncode(market,
-                        session.platform().number(), session.sequence(),
-                        session.serialNumber(), session.localAddress(),
-                        (String) v[0], (String) v[1], (String) v[2], (String) v[3], (String) v[4], (String) v[5], (Integer) v[6], (Integer) v[7], (Integer) v[8], (byte) ((Character) v[9]).charValue(), (byte) ((Character) v[10]).charValue(), ((Integer) v[11]).byteValue(), ((Integer) v[12]).byteValue(), ((Integer) v[13]).byteValue(), ((Integer) v[14]).byteValue(), status);
+                return gatewayjni.ChangeOrderEncode(market, session.platform().number(),
+                        session.sequence(), session.serialNumber(), session.localAddress(),
+                        (String) v[0], (String) v[1], (String) v[2], (String) v[3], (String) v[4],
+                        (String) v[5], (Integer) v[6], (Integer) v[7], (Integer) v[8],
+                        (byte) ((Character) v[9]).charValue(),
+                        (byte) ((Character) v[10]).charValue(), ((Integer) v[11]).byteValue(),
+                        ((Integer) v[12]).byteValue(), ((Integer) v[13]).byteValue(),
+                        ((Integer) v[14]).byteValue(), status);
             case CHANGE_ORDER_ENCODE1:
-                return gatewayjni.ChangeOrderEncode1(market,
-                        session.platform().number(), session.sequence(),
-                        session.serialNumber(), session.localAddress(),
-                        (String) v[0], (String) v[1], (String) v[2], (String) v[3], (String) v[4], (String) v[5], (Integer) v[6], (Integer) v[7], (Integer) v[8], (byte) ((Character) v[9]).charValue(), (byte) ((Character) v[10]).charValue(), ((Integer) v[11]).byteValue(), ((Integer) v[12]).byteValue(), ((Integer) v[13]).byteValue(), ((Integer) v[14]).byteValue(), status);
+                return gatewayjni.ChangeOrderEncode1(market, session.platform().number(),
+                        session.sequence(), session.serialNumber(), session.localAddress(),
+                        (String) v[0], (String) v[1], (String) v[2], (String) v[3], (String) v[4],
+                        (String) v[5], (Integer) v[6], (Integer) v[7], (Integer) v[8],
+                        (byte) ((Character) v[9]).charValue(),
+                        (byte) ((Character) v[10]).charValue(), ((Integer) v[11]).byteValue(),
+                        ((Integer) v[12]).byteValue(), ((Integer) v[13]).byteValue(),
+                        ((Integer) v[14]).byteValue(), status);
             case QUERY_ORDER_ENCODE:
-                return gatewayjni.QueryOrderEncode(market,
-                        session.platform().number(), session.sequence(),
-                        session.serialNumber(), session.localAddress(),
-                        (String) v[0], (String) v[1], (String) v[2], (String) v[3], (Integer) v[4], status);
+                return gatewayjni.QueryOrderEncode(market, session.platform().number(),
+                        session.sequence(), session.serialNumber(), session.localAddress(),
+                        (String) v[0], (String) v[1], (String) v[2], (String) v[3], (Integer) v[4],
+                        status);
             case QUERY_REPLY_ENCODE:
-                return gatewayjni.QueryReplyEncode(market,
-                        session.platform().number(), session.sequence(),
-                        session.serialNumber(), session.localAddress(),
-                        (String) v[0], (String) v[1], (String) v[2], (String) v[3], (String) v[4], status);
+                return gatewayjni.QueryReplyEncode(market, session.platform().number(),
+                        session.sequence(), session.serialNumber(), session.localAddress(),
+                        (String) v[0], (String) v[1], (String) v[2], (String) v[3], (String) v[4],
+                        status);
             case QUERY_INVENTORY_ENCODE:
-                return gatewayjni.QueryInventoryEncode(market,
-                        session.platform().number(), session.sequence(),
-                        session.serialNumber(), session.localAddress(),
+                return gatewayjni.QueryInventoryEncode(market, session.platform().number(),
+                        session.sequence(), session.serialNumber(), session.localAddress(),
                         (String) v[0], (String) v[1], (String) v[2], status);
             case QUERY_CREDIT_INFO_ENCODE:
-                return gatewayjni.QueryCreditInfoEncode(market,
-                        session.platform().number(), session.sequence(),
-                        session.serialNumber(), session.localAddress(),
+                return gatewayjni.QueryCreditInfoEncode(market, session.platform().number(),
+                        session.sequence(), session.serialNumber(), session.localAddress(),
                         (String) v[0], (String) v[1], (String) v[2], (String) v[3], status);
             case PAYMENT_ENCODE:
-                return gatewayjni.PaymentEncode(market,
-                        session.platform().number(), session.sequence(),
-                        session.serialNumber(), session.localAddress(),
-                        (String) v[0], (String) v[1], (String) v[2], (String) v[3], (String) v[4], status);
+                return gatewayjni.PaymentEncode(market, session.platform().number(),
+                        session.sequence(), session.serialNumber(), session.localAddress(),
+                        (String) v[0], (String) v[1], (String) v[2], (String) v[3], (String) v[4],
+                        status);
             case FUT_SUBMIT_ORDER_ENCODE:
-                return gatewayjni.FutSubmitOrderEncode(market,
-                        session.platform().number(), session.sequence(),
-                        session.serialNumber(), session.localAddress(),
-                        (String) v[0], (String) v[1], (String) v[2], (String) v[3], (String) v[4], (String) v[5], (String) v[6], (String) v[7], (String) v[8], (String) v[9], (String) v[10], (String) v[11], (String) v[12], ((Integer) v[13]).byteValue(), ((Integer) v[14]).byteValue(), ((Integer) v[15]).byteValue(), (Character) v[16], (Character) v[17], (Character) v[18], (Character) v[19], (Character) v[20], (Character) v[21], (Integer) v[22], (Integer) v[23], (Integer) v[24], status);
+                return gatewayjni.FutSubmitOrderEncode(market, session.platform().number(),
+                        session.sequence(), session.serialNumber(), session.localAddress(),
+                        (String) v[0], (String) v[1], (String) v[2], (String) v[3], (String) v[4],
+                        (String) v[5], (String) v[6], (String) v[7], (String) v[8], (String) v[9],
+                        (String) v[10], (String) v[11], (String) v[12],
+                        ((Integer) v[13]).byteValue(), ((Integer) v[14]).byteValue(),
+                        ((Integer) v[15]).byteValue(), (Character) v[16], (Character) v[17],
+                        (Character) v[18], (Character) v[19], (Character) v[20], (Character) v[21],
+                        (Integer) v[22], (Integer) v[23], (Integer) v[24], status);
             case FUT_SUBMIT_ORDER_ENCODE1:
-                return gatewayjni.FutSubmitOrderEncode1(market,
-                        session.platform().number(), session.sequence(),
-                        session.serialNumber(), session.localAddress(),
-                        (String) v[0], (String) v[1], (String) v[2], (String) v[3], (String) v[4], (String) v[5], (String) v[6], (String) v[7], (String) v[8], (String) v[9], (String) v[10], (String) v[11], (String) v[12], ((Integer) v[13]).byteValue(), ((Integer) v[14]).byteValue(), ((Integer) v[15]).byteValue(), (Character) v[16], (Character) v[17], (Character) v[18], (Character) v[19], (Character) v[20], (Character) v[21], (Integer) v[22], (Integer) v[23], (Integer) v[24], status);
+                return gatewayjni.FutSubmitOrderEncode1(market, session.platform().number(),
+                        session.sequence(), session.serialNumber(), session.localAddress(),
+                        (String) v[0], (String) v[1], (String) v[2], (String) v[3], (String) v[4],
+                        (String) v[5], (String) v[6], (String) v[7], (String) v[8], (String) v[9],
+                        (String) v[10], (String) v[11], (String) v[12],
+                        ((Integer) v[13]).byteValue(), ((Integer) v[14]).byteValue(),
+                        ((Integer) v[15]).byteValue(), (Character) v[16], (Character) v[17],
+                        (Character) v[18], (Character) v[19], (Character) v[20], (Character) v[21],
+                        (Integer) v[22], (Integer) v[23], (Integer) v[24], status);
             case FUT_QUERY_ORDER_ENCODE:
-                return gatewayjni.FutQueryOrderEncode(market,
-                        session.platform().number(), session.sequence(),
-                        session.serialNumber(), session.localAddress(),
-                        (String) v[0], (String) v[1], (String) v[2], (String) v[3], (Integer) v[4], status);
+                return gatewayjni.FutQueryOrderEncode(market, session.platform().number(),
+                        session.sequence(), session.serialNumber(), session.localAddress(),
+                        (String) v[0], (String) v[1], (String) v[2], (String) v[3], (Integer) v[4],
+                        status);
             case FUT_QUERY_REPLY_ENCODE:
-                return gatewayjni.FutQueryReplyEncode(market,
-                        session.platform().number(), session.sequence(),
-                        session.serialNumber(), session.localAddress(),
-                        (String) v[0], (String) v[1], (String) v[2], (String) v[3], (String) v[4], status);
+                return gatewayjni.FutQueryReplyEncode(market, session.platform().number(),
+                        session.sequence(), session.serialNumber(), session.localAddress(),
+                        (String) v[0], (String) v[1], (String) v[2], (String) v[3], (String) v[4],
+                        status);
             case FUT_QUERY_INVENTORY_ENCODE:
-                return gatewayjni.FutQueryInventoryEncode(market,
-                        session.platform().number(), session.sequence(),
-                        session.serialNumber(), session.localAddress(),
+                return gatewayjni.FutQueryInventoryEncode(market, session.platform().number(),
+                        session.sequence(), session.serialNumber(), session.localAddress(),
                         (String) v[0], (String) v[1], (String) v[2], status);
             case QUERY_FINANCE_ENCODE:
-                return gatewayjni.QueryFinanceEncode(market,
-                        session.platform().number(), session.sequence(),
-                        session.serialNumber(), session.localAddress(),
+                return gatewayjni.QueryFinanceEncode(market, session.platform().number(),
+                        session.sequence(), session.serialNumber(), session.localAddress(),
                         (String) v[0], (String) v[1], (String) v[2], (Integer) v[3], status);
             default:
                 throw new IllegalArgumentException(operation + " builds no request");

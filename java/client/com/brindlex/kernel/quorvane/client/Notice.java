@@ -2,19 +2,19 @@
 package com.brindlex.kernel.quorvane.client;
 
 import org.jetbrains.annotations.NotNull;
+
 /** One notice. Never changes. */
 public final class Notice extends Row<Notice> {
     /** The mark {@code <M>}. */
     public static final Column<Notice, String> NOTICE_MARK =
-            new Column<Notice, String>(0, "noticeMark", Form.TEXT,
-                    "", "the mark `<M>`");
+            new Column<Notice, String>(0, "noticeMark", Form.TEXT, "", "the mark `<M>`");
 
     /** Notice of the broker. */
     public static final Column<Notice, String> NOTICE =
-            new Column<Notice, String>(1, "notice", Form.TEXT,
-                    "M3", "notice of the broker");
+            new Column<Notice, String>(1, "notice", Form.TEXT, "M3", "notice of the broker");
 
-    static final Shape<Notice> SHAPE = new Shape<Notice>("notice", "0@*1",
+    static final Shape<Notice> SHAPE = new Shape<Notice>("notice",
+            "0@*1",
             NOTICE_MARK, NOTICE) {
         @Override
         Notice row(String text, int start, int end) {

@@ -7,80 +7,85 @@ import java.util.Collections;
 import java.util.List;
 import org.jetbrains.annotations.NotNull;
 import org.jetbrains.annotations.Nullable;
+
 /** The operations of the library, one for each native method. */
 public enum Operation {
     /** Login. */
-    AUTH_ENCODE("AuthEncode", "login", "CGatewayPub",
-            "AuthDecode", Arguments.BRANCH, Arguments.IDENTITY, Arguments.PASSWORD),
+    AUTH_ENCODE("AuthEncode", "login", "CGatewayPub", "AuthDecode", Arguments.BRANCH,
+            Arguments.IDENTITY, Arguments.PASSWORD),
     /** Accounts of the user, perhaps a notice. */
-    AUTH_DECODE("AuthDecode", "accounts of the user, perhaps a notice", "CGatewayPub",
-            "", Arguments.REPLY),
+    AUTH_DECODE("AuthDecode", "accounts of the user, perhaps a notice", "CGatewayPub", "",
+            Arguments.REPLY),
     /** List of all trading accounts. */
     GET_TOTAL_ACCOUNT_ENCODE("GetTotalAccountEncode", "list of all trading accounts", "CGatewayPub",
             "GetTotalAccountDecode", Arguments.BRANCH, Arguments.IDENTITY, Arguments.PASSWORD),
     /** All trading accounts. */
-    GET_TOTAL_ACCOUNT_DECODE("GetTotalAccountDecode", "all trading accounts", "CGatewayPub",
-            "", Arguments.REPLY),
+    GET_TOTAL_ACCOUNT_DECODE("GetTotalAccountDecode", "all trading accounts", "CGatewayPub", "",
+            Arguments.REPLY),
     /** Opening of an account. */
     OPEN_ACCOUNT_ENCODE("OpenAccountEncode", "opening of an account", "CGatewayPub",
-            "OpenAccountDecode", Arguments.EXTRA1, Arguments.IDENTITY, Arguments.EXTRA2, Arguments.NAME, Arguments.ADDRESS, Arguments.TEL, Arguments.TIME, Arguments.ITEM),
+            "OpenAccountDecode", Arguments.EXTRA1, Arguments.IDENTITY, Arguments.EXTRA2,
+            Arguments.NAME, Arguments.ADDRESS, Arguments.TEL, Arguments.TIME, Arguments.ITEM),
     /** Outcome of an account opening. */
-    OPEN_ACCOUNT_DECODE("OpenAccountDecode", "outcome of an account opening", "CGatewayPub",
-            "", Arguments.REPLY),
+    OPEN_ACCOUNT_DECODE("OpenAccountDecode", "outcome of an account opening", "CGatewayPub", "",
+            Arguments.REPLY),
     /** Change of the trading password. */
     CHANGE_PASSWORD_ENCODE("ChangePasswordEncode", "change of the trading password", "CGatewayPub",
-            "ChangePasswordDecode", Arguments.BRANCH, Arguments.IDENTITY, Arguments.PASSWORD, Arguments.NEW_PASSWORD),
+            "ChangePasswordDecode", Arguments.BRANCH, Arguments.IDENTITY, Arguments.PASSWORD,
+            Arguments.NEW_PASSWORD),
     /** Outcome of a password change. */
     CHANGE_PASSWORD_DECODE("ChangePasswordDecode", "outcome of a password change", "CGatewayPub",
             "", Arguments.REPLY),
     /** Balance of the linked bank account. */
-    QUERY_BANK_REMAIN_ENCODE("QueryBankRemainEncode", "balance of the linked bank account", "CGatewayPub",
-            "QueryBankRemainDecode", Arguments.BRANCH, Arguments.IDENTITY, Arguments.PASSWORD),
+    QUERY_BANK_REMAIN_ENCODE("QueryBankRemainEncode", "balance of the linked bank account",
+            "CGatewayPub", "QueryBankRemainDecode", Arguments.BRANCH, Arguments.IDENTITY,
+            Arguments.PASSWORD),
     /** Balance of the linked bank account. */
-    QUERY_BANK_REMAIN_DECODE("QueryBankRemainDecode", "balance of the linked bank account", "CGatewayPub",
-            "", Arguments.REPLY),
+    QUERY_BANK_REMAIN_DECODE("QueryBankRemainDecode", "balance of the linked bank account",
+            "CGatewayPub", "", Arguments.REPLY),
     /** Registration of a certificate. */
     REGISTER_CERT_ENCODE("RegisterCertEncode", "registration of a certificate", "CGatewayPub",
             "RegisterCertDecode", Arguments.CERT_MSG),
     /** Answer to a registration. */
-    REGISTER_CERT_DECODE("RegisterCertDecode", "answer to a registration", "CGatewayPub",
-            "", Arguments.REPLY),
+    REGISTER_CERT_DECODE("RegisterCertDecode", "answer to a registration", "CGatewayPub", "",
+            Arguments.REPLY),
     /** Fetching of a certificate. */
-    GET_CERT_ENCODE("GetCertEncode", "fetching of a certificate", "CGatewayPub",
-            "GetCertDecode", Arguments.CERT_MSG_2),
+    GET_CERT_ENCODE("GetCertEncode", "fetching of a certificate", "CGatewayPub", "GetCertDecode",
+            Arguments.CERT_MSG_2),
     /** Fetching of a certificate, its steps logged. */
     GET_CERT_ENCODE2("GetCertEncode2", "fetching of a certificate, its steps logged", "CGatewayPub",
             "GetCertDecode", Arguments.CERT_MSG_2),
     /** The certificate. */
-    GET_CERT_DECODE("GetCertDecode", "the certificate", "CGatewayPub",
-            "", Arguments.REPLY),
+    GET_CERT_DECODE("GetCertDecode", "the certificate", "CGatewayPub", "", Arguments.REPLY),
     /** Application for a certificate. */
     APPLY_CERT_ENCODE("ApplyCertEncode", "application for a certificate", "CGatewayPub",
-            "ApplyCertDecode", Arguments.BRANCH, Arguments.IDENTITY, Arguments.PASSWORD, Arguments.BIRTH, Arguments.CERT_MSG_2),
+            "ApplyCertDecode", Arguments.BRANCH, Arguments.IDENTITY, Arguments.PASSWORD,
+            Arguments.BIRTH, Arguments.CERT_MSG_2),
     /** Answer to an application. */
-    APPLY_CERT_DECODE("ApplyCertDecode", "answer to an application", "CGatewayPub",
-            "", Arguments.REPLY),
+    APPLY_CERT_DECODE("ApplyCertDecode", "answer to an application", "CGatewayPub", "",
+            Arguments.REPLY),
     /** Revocation of a certificate. */
     REVOKE_CERT_ENCODE("RevokeCertEncode", "revocation of a certificate", "CGatewayPub",
-            "RevokeCertDecode", Arguments.BRANCH, Arguments.IDENTITY, Arguments.PASSWORD, Arguments.BIRTH, Arguments.CERT_MSG_2),
+            "RevokeCertDecode", Arguments.BRANCH, Arguments.IDENTITY, Arguments.PASSWORD,
+            Arguments.BIRTH, Arguments.CERT_MSG_2),
     /** Answer to a revocation. */
-    REVOKE_CERT_DECODE("RevokeCertDecode", "answer to a revocation", "CGatewayPub",
-            "", Arguments.REPLY),
+    REVOKE_CERT_DECODE("RevokeCertDecode", "answer to a revocation", "CGatewayPub", "",
+            Arguments.REPLY),
     /** Renewal of a certificate. */
     RE_NEW_CERT_ENCODE("ReNewCertEncode", "renewal of a certificate", "CGatewayPub",
-            "ReNewCertDecode", Arguments.BRANCH, Arguments.IDENTITY, Arguments.PASSWORD, Arguments.BIRTH, Arguments.CERT_MSG_2),
+            "ReNewCertDecode", Arguments.BRANCH, Arguments.IDENTITY, Arguments.PASSWORD,
+            Arguments.BIRTH, Arguments.CERT_MSG_2),
     /** Answer to a renewal. */
-    RE_NEW_CERT_DECODE("ReNewCertDecode", "answer to a renewal", "CGatewayPub",
-            "", Arguments.REPLY),
+    RE_NEW_CERT_DECODE("ReNewCertDecode", "answer to a renewal", "CGatewayPub", "", Arguments.REPLY),
     /** State of a certificate. */
     GET_CERT_STATUS_ENCODE("GetCertStatusEncode", "state of a certificate", "CGatewayPub",
             "GetCertStatusDecode", Arguments.CERT_MSG_2),
     /** State of the certificate. */
-    GET_CERT_STATUS_DECODE("GetCertStatusDecode", "state of the certificate", "CGatewayPub",
-            "", Arguments.REPLY),
+    GET_CERT_STATUS_DECODE("GetCertStatusDecode", "state of the certificate", "CGatewayPub", "",
+            Arguments.REPLY),
     /** Confirmation that a certificate is installed. */
-    INSTALL_CERT_OK_ENCODE("InstallCertOKEncode", "confirmation that a certificate is installed", "CGatewayPub",
-            "InstallCertOKDecode", Arguments.CERT_MSG_2),
+    INSTALL_CERT_OK_ENCODE("InstallCertOKEncode", "confirmation that a certificate is installed",
+            "CGatewayPub", "InstallCertOKDecode", Arguments.CERT_MSG_2),
     /** Answer to an installation report. */
     INSTALL_CERT_OK_DECODE("InstallCertOKDecode", "answer to an installation report", "CGatewayPub",
             "", Arguments.REPLY),
@@ -88,104 +93,147 @@ public enum Operation {
     OPEN_CERT_ENCODE("OpenCertEncode", "confirmation that a certificate is opened", "CGatewayPub",
             "OpenCertDecode", Arguments.CERT_MSG_2),
     /** Answer to an opening report. */
-    OPEN_CERT_DECODE("OpenCertDecode", "answer to an opening report", "CGatewayPub",
-            "", Arguments.REPLY),
+    OPEN_CERT_DECODE("OpenCertDecode", "answer to an opening report", "CGatewayPub", "",
+            Arguments.REPLY),
     /** New stock order. */
-    SUBMIT_ORDER_ENCODE("SubmitOrderEncode", "new stock order", "CGatewayStk",
-            "SubmitOrderDecode", Arguments.BRANCH, Arguments.IDENTITY, Arguments.PASSWORD, Arguments.STOCK_CODE, Arguments.ORDER_DATE, Arguments.QUANTITY, Arguments.UNIT, Arguments.PRICE, Arguments.SIDE, Arguments.FLAG13, Arguments.ORDER_KIND, Arguments.PRICE_KIND, Arguments.TRADE_TYPE, Arguments.HANDLING_FLAG),
+    SUBMIT_ORDER_ENCODE("SubmitOrderEncode", "new stock order", "CGatewayStk", "SubmitOrderDecode",
+            Arguments.BRANCH, Arguments.IDENTITY, Arguments.PASSWORD, Arguments.STOCK_CODE,
+            Arguments.ORDER_DATE, Arguments.QUANTITY, Arguments.UNIT, Arguments.PRICE,
+            Arguments.SIDE, Arguments.FLAG13, Arguments.ORDER_KIND, Arguments.PRICE_KIND,
+            Arguments.TRADE_TYPE, Arguments.HANDLING_FLAG),
     /** New stock order, signature in tag PL. */
-    SUBMIT_ORDER_ENCODE1("SubmitOrderEncode1", "new stock order, signature in tag PL", "CGatewayStk",
-            "SubmitOrderDecode", Arguments.BRANCH, Arguments.IDENTITY, Arguments.PASSWORD, Arguments.STOCK_CODE, Arguments.ORDER_DATE_2, Arguments.QUANTITY, Arguments.UNIT, Arguments.PRICE, Arguments.SIDE, Arguments.FLAG13, Arguments.ORDER_KIND, Arguments.PRICE_KIND, Arguments.TRADE_TYPE, Arguments.HANDLING_FLAG),
+    SUBMIT_ORDER_ENCODE1("SubmitOrderEncode1", "new stock order, signature in tag PL",
+            "CGatewayStk", "SubmitOrderDecode", Arguments.BRANCH, Arguments.IDENTITY,
+            Arguments.PASSWORD, Arguments.STOCK_CODE, Arguments.ORDER_DATE_2, Arguments.QUANTITY,
+            Arguments.UNIT, Arguments.PRICE, Arguments.SIDE, Arguments.FLAG13, Arguments.ORDER_KIND,
+            Arguments.PRICE_KIND, Arguments.TRADE_TYPE, Arguments.HANDLING_FLAG),
     /** Short notice of a stock order. */
     SUBMIT_ORDER_ENCODE2("SubmitOrderEncode2", "short notice of a stock order", "CGatewayStk",
-            "SubmitOrderDecode", Arguments.BRANCH, Arguments.IDENTITY, Arguments.PASSWORD, Arguments.FUNCTION, Arguments.TRADE_TYPE_2),
+            "SubmitOrderDecode", Arguments.BRANCH, Arguments.IDENTITY, Arguments.PASSWORD,
+            Arguments.FUNCTION, Arguments.TRADE_TYPE_2),
     /** Cancellation of a stock order. */
     CANCEL_ORDER_ENCODE("CancelOrderEncode", "cancellation of a stock order", "CGatewayStk",
-            "CancelChangeOrderDecode", Arguments.BRANCH, Arguments.IDENTITY, Arguments.PASSWORD, Arguments.STOCK_CODE, Arguments.ORDER_DATE, Arguments.ORDER_REFERENCE, Arguments.QUANTITY_2, Arguments.UNIT_2, Arguments.PRICE_2, Arguments.SIDE, Arguments.FLAG13, Arguments.ORDER_KIND, Arguments.UNREAD_PRICE_KIND, Arguments.TRADE_TYPE, Arguments.HANDLING_FLAG),
+            "CancelChangeOrderDecode", Arguments.BRANCH, Arguments.IDENTITY, Arguments.PASSWORD,
+            Arguments.STOCK_CODE, Arguments.ORDER_DATE, Arguments.ORDER_REFERENCE,
+            Arguments.QUANTITY_2, Arguments.UNIT_2, Arguments.PRICE_2, Arguments.SIDE,
+            Arguments.FLAG13, Arguments.ORDER_KIND, Arguments.UNREAD_PRICE_KIND,
+            Arguments.TRADE_TYPE, Arguments.HANDLING_FLAG),
     /** Cancellation of a stock order, signature in tag PL. */
-    CANCEL_ORDER_ENCODE1("CancelOrderEncode1", "cancellation of a stock order, signature in tag PL", "CGatewayStk",
-            "CancelChangeOrderDecode", Arguments.BRANCH, Arguments.IDENTITY, Arguments.PASSWORD, Arguments.STOCK_CODE, Arguments.ORDER_DATE, Arguments.ORDER_REFERENCE, Arguments.QUANTITY_3, Arguments.UNIT, Arguments.PRICE_2, Arguments.SIDE, Arguments.FLAG13_2, Arguments.ORDER_KIND, Arguments.UNREAD_PRICE_KIND, Arguments.TRADE_TYPE, Arguments.HANDLING_FLAG),
+    CANCEL_ORDER_ENCODE1("CancelOrderEncode1", "cancellation of a stock order, signature in tag PL",
+            "CGatewayStk", "CancelChangeOrderDecode", Arguments.BRANCH, Arguments.IDENTITY,
+            Arguments.PASSWORD, Arguments.STOCK_CODE, Arguments.ORDER_DATE,
+            Arguments.ORDER_REFERENCE, Arguments.QUANTITY_3, Arguments.UNIT, Arguments.PRICE_2,
+            Arguments.SIDE, Arguments.FLAG13_2, Arguments.ORDER_KIND, Arguments.UNREAD_PRICE_KIND,
+            Arguments.TRADE_TYPE, Arguments.HANDLING_FLAG),
     /** Change of a stock order. */
     CHANGE_ORDER_ENCODE("ChangeOrderEncode", "change of a stock order", "CGatewayStk",
-            "CancelChangeOrderDecode", Arguments.BRANCH, Arguments.IDENTITY, Arguments.PASSWORD, Arguments.STOCK_CODE, Arguments.ORDER_DATE, Arguments.ORDER_REFERENCE, Arguments.QUANTITY_4, Arguments.UNIT, Arguments.PRICE_2, Arguments.SIDE, Arguments.FLAG13, Arguments.ORDER_KIND, Arguments.UNREAD_PRICE_KIND, Arguments.TRADE_TYPE, Arguments.HANDLING_FLAG),
+            "CancelChangeOrderDecode", Arguments.BRANCH, Arguments.IDENTITY, Arguments.PASSWORD,
+            Arguments.STOCK_CODE, Arguments.ORDER_DATE, Arguments.ORDER_REFERENCE,
+            Arguments.QUANTITY_4, Arguments.UNIT, Arguments.PRICE_2, Arguments.SIDE,
+            Arguments.FLAG13, Arguments.ORDER_KIND, Arguments.UNREAD_PRICE_KIND,
+            Arguments.TRADE_TYPE, Arguments.HANDLING_FLAG),
     /** Change of a stock order, signature in tag PL. */
-    CHANGE_ORDER_ENCODE1("ChangeOrderEncode1", "change of a stock order, signature in tag PL", "CGatewayStk",
-            "CancelChangeOrderDecode", Arguments.BRANCH, Arguments.IDENTITY, Arguments.PASSWORD, Arguments.STOCK_CODE, Arguments.ORDER_DATE, Arguments.ORDER_REFERENCE, Arguments.QUANTITY_4, Arguments.UNIT, Arguments.PRICE_2, Arguments.SIDE, Arguments.FLAG13_2, Arguments.ORDER_KIND, Arguments.UNREAD_PRICE_KIND, Arguments.TRADE_TYPE, Arguments.HANDLING_FLAG),
+    CHANGE_ORDER_ENCODE1("ChangeOrderEncode1", "change of a stock order, signature in tag PL",
+            "CGatewayStk", "CancelChangeOrderDecode", Arguments.BRANCH, Arguments.IDENTITY,
+            Arguments.PASSWORD, Arguments.STOCK_CODE, Arguments.ORDER_DATE,
+            Arguments.ORDER_REFERENCE, Arguments.QUANTITY_4, Arguments.UNIT, Arguments.PRICE_2,
+            Arguments.SIDE, Arguments.FLAG13_2, Arguments.ORDER_KIND, Arguments.UNREAD_PRICE_KIND,
+            Arguments.TRADE_TYPE, Arguments.HANDLING_FLAG),
     /** Receipt of a new stock order. */
-    SUBMIT_ORDER_DECODE("SubmitOrderDecode", "receipt of a new stock order", "CGatewayStk",
-            "", Arguments.REPLY),
+    SUBMIT_ORDER_DECODE("SubmitOrderDecode", "receipt of a new stock order", "CGatewayStk", "",
+            Arguments.REPLY),
     /** Outcome of a cancellation or change. */
-    CANCEL_CHANGE_ORDER_DECODE("CancelChangeOrderDecode", "outcome of a cancellation or change", "CGatewayStk",
-            "", Arguments.REPLY),
+    CANCEL_CHANGE_ORDER_DECODE("CancelChangeOrderDecode", "outcome of a cancellation or change",
+            "CGatewayStk", "", Arguments.REPLY),
     /** Stock order book of one day. */
     QUERY_ORDER_ENCODE("QueryOrderEncode", "stock order book of one day", "CGatewayStk",
-            "QueryOrderDecode", Arguments.BRANCH, Arguments.IDENTITY, Arguments.PASSWORD, Arguments.DATE, Arguments.TRADE_TYPE_3),
+            "QueryOrderDecode", Arguments.BRANCH, Arguments.IDENTITY, Arguments.PASSWORD,
+            Arguments.DATE, Arguments.TRADE_TYPE_3),
     /** Stock order book. */
-    QUERY_ORDER_DECODE("QueryOrderDecode", "stock order book", "CGatewayStk",
-            "", Arguments.MARKET_2, Arguments.REPLY),
+    QUERY_ORDER_DECODE("QueryOrderDecode", "stock order book", "CGatewayStk", "",
+            Arguments.MARKET_2, Arguments.REPLY),
     /** Stock fills of a period. */
     QUERY_REPLY_ENCODE("QueryReplyEncode", "stock fills of a period", "CGatewayStk",
-            "QueryReplyDecode", Arguments.BRANCH, Arguments.IDENTITY, Arguments.PASSWORD, Arguments.START_DATE, Arguments.END_DATE),
+            "QueryReplyDecode", Arguments.BRANCH, Arguments.IDENTITY, Arguments.PASSWORD,
+            Arguments.START_DATE, Arguments.END_DATE),
     /** Stock fills. */
-    QUERY_REPLY_DECODE("QueryReplyDecode", "stock fills", "CGatewayStk",
-            "", Arguments.REPLY),
+    QUERY_REPLY_DECODE("QueryReplyDecode", "stock fills", "CGatewayStk", "", Arguments.REPLY),
     /** Stock positions. */
     QUERY_INVENTORY_ENCODE("QueryInventoryEncode", "stock positions", "CGatewayStk",
-            "QueryInventoryDecode QueryInventoryDecodeJZG", Arguments.BRANCH, Arguments.IDENTITY, Arguments.PASSWORD),
+            "QueryInventoryDecode QueryInventoryDecodeJZG", Arguments.BRANCH, Arguments.IDENTITY,
+            Arguments.PASSWORD),
     /** Stock positions. */
-    QUERY_INVENTORY_DECODE("QueryInventoryDecode", "stock positions", "CGatewayStk",
-            "", Arguments.REPLY),
+    QUERY_INVENTORY_DECODE("QueryInventoryDecode", "stock positions", "CGatewayStk", "",
+            Arguments.REPLY),
     /** Stock positions at brokerage JZG. */
-    QUERY_INVENTORY_DECODE_JZG("QueryInventoryDecodeJZG", "stock positions at brokerage JZG", "CGatewayStk",
-            "", Arguments.REPLY),
+    QUERY_INVENTORY_DECODE_JZG("QueryInventoryDecodeJZG", "stock positions at brokerage JZG",
+            "CGatewayStk", "", Arguments.REPLY),
     /** Credit figures of one stock. */
     QUERY_CREDIT_INFO_ENCODE("QueryCreditInfoEncode", "credit figures of one stock", "CGatewayStk",
-            "QueryCreditInfoDecode", Arguments.BRANCH, Arguments.IDENTITY, Arguments.PASSWORD, Arguments.STOCK_CODE_2),
+            "QueryCreditInfoDecode", Arguments.BRANCH, Arguments.IDENTITY, Arguments.PASSWORD,
+            Arguments.STOCK_CODE_2),
     /** Credit figures of one stock. */
     QUERY_CREDIT_INFO_DECODE("QueryCreditInfoDecode", "credit figures of one stock", "CGatewayStk",
             "", Arguments.REPLY),
     /** Stock settlement of a period. */
     PAYMENT_ENCODE("PaymentEncode", "stock settlement of a period", "CGatewayStk",
-            "PaymentDecode PaymentDecodeJZG", Arguments.BRANCH, Arguments.IDENTITY, Arguments.PASSWORD, Arguments.PERIOD_OR_START_DATE, Arguments.END_DATE_2),
+            "PaymentDecode PaymentDecodeJZG", Arguments.BRANCH, Arguments.IDENTITY,
+            Arguments.PASSWORD, Arguments.PERIOD_OR_START_DATE, Arguments.END_DATE_2),
     /** Settled trades. */
-    PAYMENT_DECODE("PaymentDecode", "settled trades", "CGatewayStk",
-            "", Arguments.REPLY),
+    PAYMENT_DECODE("PaymentDecode", "settled trades", "CGatewayStk", "", Arguments.REPLY),
     /** Settled trades at brokerage JZG. */
-    PAYMENT_DECODE_JZG("PaymentDecodeJZG", "settled trades at brokerage JZG", "CGatewayStk",
-            "", Arguments.REPLY),
+    PAYMENT_DECODE_JZG("PaymentDecodeJZG", "settled trades at brokerage JZG", "CGatewayStk", "",
+            Arguments.REPLY),
     /** Futures or options order. */
     FUT_SUBMIT_ORDER_ENCODE("FutSubmitOrderEncode", "futures or options order", "CGatewayFut",
-            "FutSubmitOrderDecode", Arguments.BRANCH, Arguments.IDENTITY, Arguments.PASSWORD, Arguments.ORDER_REFERENCE_2, Arguments.ORDER_DATE, Arguments.COMMODITY1, Arguments.COMMODITY2, Arguments.MONTH1, Arguments.MONTH2, Arguments.STRIKE1, Arguments.STRIKE2, Arguments.CALL_PUT1, Arguments.CALL_PUT2, Arguments.HANDLING_FLAG, Arguments.ORDER_KIND_2, Arguments.PRICE_TYPE, Arguments.FUNCTION_2, Arguments.FLAG_W3, Arguments.TIME_IN_FORCE, Arguments.UNREAD_LETTER, Arguments.SIDE1, Arguments.SIDE2, Arguments.QUANTITY_5, Arguments.UNREAD_NUMBER, Arguments.PRICE_3),
+            "FutSubmitOrderDecode", Arguments.BRANCH, Arguments.IDENTITY, Arguments.PASSWORD,
+            Arguments.ORDER_REFERENCE_2, Arguments.ORDER_DATE, Arguments.COMMODITY1,
+            Arguments.COMMODITY2, Arguments.MONTH1, Arguments.MONTH2, Arguments.STRIKE1,
+            Arguments.STRIKE2, Arguments.CALL_PUT1, Arguments.CALL_PUT2, Arguments.HANDLING_FLAG,
+            Arguments.ORDER_KIND_2, Arguments.PRICE_TYPE, Arguments.FUNCTION_2, Arguments.FLAG_W3,
+            Arguments.TIME_IN_FORCE, Arguments.UNREAD_LETTER, Arguments.SIDE1, Arguments.SIDE2,
+            Arguments.QUANTITY_5, Arguments.UNREAD_NUMBER, Arguments.PRICE_3),
     /** Futures or options order, signature in tag PL. */
-    FUT_SUBMIT_ORDER_ENCODE1("FutSubmitOrderEncode1", "futures or options order, signature in tag PL", "CGatewayFut",
-            "FutSubmitOrderDecode", Arguments.BRANCH, Arguments.IDENTITY, Arguments.PASSWORD, Arguments.ORDER_REFERENCE_2, Arguments.ORDER_DATE_2, Arguments.COMMODITY1, Arguments.COMMODITY2, Arguments.MONTH1, Arguments.MONTH2, Arguments.STRIKE1, Arguments.STRIKE2, Arguments.CALL_PUT1, Arguments.CALL_PUT2, Arguments.HANDLING_FLAG, Arguments.ORDER_KIND_2, Arguments.PRICE_TYPE, Arguments.FUNCTION_2, Arguments.FLAG_W3, Arguments.TIME_IN_FORCE, Arguments.UNREAD_LETTER, Arguments.SIDE1, Arguments.SIDE2, Arguments.QUANTITY_5, Arguments.UNREAD_NUMBER, Arguments.PRICE_3),
+    FUT_SUBMIT_ORDER_ENCODE1("FutSubmitOrderEncode1",
+            "futures or options order, signature in tag PL", "CGatewayFut", "FutSubmitOrderDecode",
+            Arguments.BRANCH, Arguments.IDENTITY, Arguments.PASSWORD, Arguments.ORDER_REFERENCE_2,
+            Arguments.ORDER_DATE_2, Arguments.COMMODITY1, Arguments.COMMODITY2, Arguments.MONTH1,
+            Arguments.MONTH2, Arguments.STRIKE1, Arguments.STRIKE2, Arguments.CALL_PUT1,
+            Arguments.CALL_PUT2, Arguments.HANDLING_FLAG, Arguments.ORDER_KIND_2,
+            Arguments.PRICE_TYPE, Arguments.FUNCTION_2, Arguments.FLAG_W3, Arguments.TIME_IN_FORCE,
+            Arguments.UNREAD_LETTER, Arguments.SIDE1, Arguments.SIDE2, Arguments.QUANTITY_5,
+            Arguments.UNREAD_NUMBER, Arguments.PRICE_3),
     /** Receipt of a futures order. */
-    FUT_SUBMIT_ORDER_DECODE("FutSubmitOrderDecode", "receipt of a futures order", "CGatewayFut",
-            "", Arguments.REPLY),
+    FUT_SUBMIT_ORDER_DECODE("FutSubmitOrderDecode", "receipt of a futures order", "CGatewayFut", "",
+            Arguments.REPLY),
     /** Futures order book of one day. */
     FUT_QUERY_ORDER_ENCODE("FutQueryOrderEncode", "futures order book of one day", "CGatewayFut",
-            "FutQueryOrderDecode", Arguments.BRANCH, Arguments.IDENTITY, Arguments.PASSWORD, Arguments.DATE_2, Arguments.SELECTION),
+            "FutQueryOrderDecode", Arguments.BRANCH, Arguments.IDENTITY, Arguments.PASSWORD,
+            Arguments.DATE_2, Arguments.SELECTION),
     /** Futures order book. */
-    FUT_QUERY_ORDER_DECODE("FutQueryOrderDecode", "futures order book", "CGatewayFut",
-            "", Arguments.REPLY),
+    FUT_QUERY_ORDER_DECODE("FutQueryOrderDecode", "futures order book", "CGatewayFut", "",
+            Arguments.REPLY),
     /** Futures fills of a period. */
     FUT_QUERY_REPLY_ENCODE("FutQueryReplyEncode", "futures fills of a period", "CGatewayFut",
-            "FutQueryReplyDecode", Arguments.BRANCH, Arguments.IDENTITY, Arguments.PASSWORD, Arguments.START_DATE_2, Arguments.END_DATE_3),
+            "FutQueryReplyDecode", Arguments.BRANCH, Arguments.IDENTITY, Arguments.PASSWORD,
+            Arguments.START_DATE_2, Arguments.END_DATE_3),
     /** Futures fills. */
-    FUT_QUERY_REPLY_DECODE("FutQueryReplyDecode", "futures fills", "CGatewayFut",
-            "", Arguments.REPLY),
+    FUT_QUERY_REPLY_DECODE("FutQueryReplyDecode", "futures fills", "CGatewayFut", "",
+            Arguments.REPLY),
     /** Futures and options positions. */
-    FUT_QUERY_INVENTORY_ENCODE("FutQueryInventoryEncode", "futures and options positions", "CGatewayFut",
-            "FutQueryInventoryDecode", Arguments.BRANCH, Arguments.IDENTITY, Arguments.PASSWORD),
+    FUT_QUERY_INVENTORY_ENCODE("FutQueryInventoryEncode", "futures and options positions",
+            "CGatewayFut", "FutQueryInventoryDecode", Arguments.BRANCH, Arguments.IDENTITY,
+            Arguments.PASSWORD),
     /** Futures and options positions. */
-    FUT_QUERY_INVENTORY_DECODE("FutQueryInventoryDecode", "futures and options positions", "CGatewayFut",
-            "", Arguments.REPLY),
+    FUT_QUERY_INVENTORY_DECODE("FutQueryInventoryDecode", "futures and options positions",
+            "CGatewayFut", "", Arguments.REPLY),
     /** Margin account. */
     QUERY_FINANCE_ENCODE("QueryFinanceEncode", "margin account", "CGatewayFut",
-            "QueryFinanceDecode", Arguments.BRANCH, Arguments.IDENTITY, Arguments.PASSWORD, Arguments.QUERY_TYPE),
+            "QueryFinanceDecode", Arguments.BRANCH, Arguments.IDENTITY, Arguments.PASSWORD,
+            Arguments.QUERY_TYPE),
     /** The margin account. */
-    QUERY_FINANCE_DECODE("QueryFinanceDecode", "the margin account", "CGatewayFut",
-            "", Arguments.REPLY);
+    QUERY_FINANCE_DECODE("QueryFinanceDecode", "the margin account", "CGatewayFut", "",
+            Arguments.REPLY);
 
     private final String method;
     private final String title;

@@ -4,22 +4,23 @@ package com.brindlex.kernel.quorvane.client;
 import java.math.BigDecimal;
 import org.jetbrains.annotations.NotNull;
 import org.jetbrains.annotations.Nullable;
+
 /** One options position. Never changes. */
 public final class OptionsPosition extends Row<OptionsPosition> {
     /** Side of leg 1. */
     public static final Column<OptionsPosition, Code<Side>> SIDE1 =
-            new Column<OptionsPosition, Code<Side>>(0, "side1", Form.code(Side.values()),
-                    "32", "side of leg 1");
+            new Column<OptionsPosition, Code<Side>>(0, "side1", Form.code(Side.values()), "32",
+                    "side of leg 1");
 
     /** Side of leg 2. */
     public static final Column<OptionsPosition, Code<Side>> SIDE2 =
-            new Column<OptionsPosition, Code<Side>>(1, "side2", Form.code(Side.values()),
-                    "EL V9", "side of leg 2");
+            new Column<OptionsPosition, Code<Side>>(1, "side2", Form.code(Side.values()), "EL V9",
+                    "side of leg 2");
 
     /** Word in front of a contract (TIMEX or TAIMEX). */
     public static final Column<OptionsPosition, String> EXCHANGE =
-            new Column<OptionsPosition, String>(2, "exchange", Form.TEXT,
-                    "", "word in front of a contract (TIMEX or TAIMEX)");
+            new Column<OptionsPosition, String>(2, "exchange", Form.TEXT, "",
+                    "word in front of a contract (TIMEX or TAIMEX)");
 
     /** What the contract is. */
     public static final Column<OptionsPosition, Code<Product>> PRODUCT =
@@ -28,23 +29,23 @@ public final class OptionsPosition extends Row<OptionsPosition> {
 
     /** Commodity of leg 1. */
     public static final Column<OptionsPosition, String> COMMODITY1 =
-            new Column<OptionsPosition, String>(4, "commodity1", Form.TEXT,
-                    "33", "commodity of leg 1");
+            new Column<OptionsPosition, String>(4, "commodity1", Form.TEXT, "33",
+                    "commodity of leg 1");
 
     /** Commodity of leg 2. */
     public static final Column<OptionsPosition, String> COMMODITY2 =
-            new Column<OptionsPosition, String>(5, "commodity2", Form.TEXT,
-                    "V9", "commodity of leg 2");
+            new Column<OptionsPosition, String>(5, "commodity2", Form.TEXT, "V9",
+                    "commodity of leg 2");
 
     /** Contract month of leg 1. */
     public static final Column<OptionsPosition, String> MONTH1 =
-            new Column<OptionsPosition, String>(6, "month1", Form.MONTH,
-                    "29", "contract month of leg 1");
+            new Column<OptionsPosition, String>(6, "month1", Form.MONTH, "29",
+                    "contract month of leg 1");
 
     /** Contract month of leg 2. */
     public static final Column<OptionsPosition, String> MONTH2 =
-            new Column<OptionsPosition, String>(7, "month2", Form.MONTH,
-                    "W0 V9", "contract month of leg 2");
+            new Column<OptionsPosition, String>(7, "month2", Form.MONTH, "W0 V9",
+                    "contract month of leg 2");
 
     /** Call or put, leg 1. */
     public static final Column<OptionsPosition, Code<CallPut>> CALL_PUT1 =
@@ -58,36 +59,37 @@ public final class OptionsPosition extends Row<OptionsPosition> {
 
     /** Strike price of leg 1. */
     public static final Column<OptionsPosition, BigDecimal> STRIKE1 =
-            new Column<OptionsPosition, BigDecimal>(10, "strike1", Form.TEN_THOUSANDTHS,
-                    "34", "strike price of leg 1");
+            new Column<OptionsPosition, BigDecimal>(10, "strike1", Form.TEN_THOUSANDTHS, "34",
+                    "strike price of leg 1");
 
     /** Strike price of leg 2. */
     public static final Column<OptionsPosition, BigDecimal> STRIKE2 =
-            new Column<OptionsPosition, BigDecimal>(11, "strike2", Form.TEN_THOUSANDTHS,
-                    "W2 V9", "strike price of leg 2");
+            new Column<OptionsPosition, BigDecimal>(11, "strike2", Form.TEN_THOUSANDTHS, "W2 V9",
+                    "strike price of leg 2");
 
     /** Quantity in tag R8. */
     public static final Column<OptionsPosition, Long> QUANTITY_R8 =
-            new Column<OptionsPosition, Long>(12, "quantityR8", Form.COUNT,
-                    "R8", "quantity in tag R8");
+            new Column<OptionsPosition, Long>(12, "quantityR8", Form.COUNT, "R8",
+                    "quantity in tag R8");
 
     /** Price in tag 48. */
     public static final Column<OptionsPosition, BigDecimal> PRICE48 =
-            new Column<OptionsPosition, BigDecimal>(13, "price48", Form.TEN_THOUSANDTHS,
-                    "48", "price in tag 48");
+            new Column<OptionsPosition, BigDecimal>(13, "price48", Form.TEN_THOUSANDTHS, "48",
+                    "price in tag 48");
 
     /** Price in tag W5. */
     public static final Column<OptionsPosition, BigDecimal> PRICE_W5 =
-            new Column<OptionsPosition, BigDecimal>(14, "priceW5", Form.TEN_THOUSANDTHS,
-                    "W5 V9", "price in tag W5");
+            new Column<OptionsPosition, BigDecimal>(14, "priceW5", Form.TEN_THOUSANDTHS, "W5 V9",
+                    "price in tag W5");
 
     /** Date in tag 50. */
     public static final Column<OptionsPosition, TradeDate> DATE50 =
-            new Column<OptionsPosition, TradeDate>(15, "date50", Form.DATE,
-                    "50", "date in tag 50");
+            new Column<OptionsPosition, TradeDate>(15, "date50", Form.DATE, "50", "date in tag 50");
 
-    static final Shape<OptionsPosition> SHAPE = new Shape<OptionsPosition>("options position", "0|1@2&3&4|5&6|7&8|9&10|11@12@13|14@15",
-            SIDE1, SIDE2, EXCHANGE, PRODUCT, COMMODITY1, COMMODITY2, MONTH1, MONTH2, CALL_PUT1, CALL_PUT2, STRIKE1, STRIKE2, QUANTITY_R8, PRICE48, PRICE_W5, DATE50) {
+    static final Shape<OptionsPosition> SHAPE = new Shape<OptionsPosition>("options position",
+            "0|1@2&3&4|5&6|7&8|9&10|11@12@13|14@15",
+            SIDE1, SIDE2, EXCHANGE, PRODUCT, COMMODITY1, COMMODITY2, MONTH1, MONTH2, CALL_PUT1,
+            CALL_PUT2, STRIKE1, STRIKE2, QUANTITY_R8, PRICE48, PRICE_W5, DATE50) {
         @Override
         OptionsPosition row(String text, int start, int end) {
             return new OptionsPosition(this, text, start, end);

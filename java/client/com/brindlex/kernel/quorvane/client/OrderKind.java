@@ -2,6 +2,7 @@
 package com.brindlex.kernel.quorvane.client;
 
 import org.jetbrains.annotations.NotNull;
+
 /**
  * Order kind of a stock order (tag 27). What the kinds stand for is not known here; they keep
  * their numbers. Never changes.

@@ -2,6 +2,7 @@
 package com.brindlex.kernel.quorvane.client;
 
 import org.jetbrains.annotations.NotNull;
+
 /**
  * Which futures orders to list (tag 28). What a number stands for is the broker's. Never changes.
  *

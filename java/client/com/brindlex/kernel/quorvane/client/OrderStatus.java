@@ -2,6 +2,7 @@
 package com.brindlex.kernel.quorvane.client;
 
 import org.jetbrains.annotations.NotNull;
+
 /** State of an order, which the order books work out. */
 public enum OrderStatus implements Coded {
     /** Failed. */

@@ -2,6 +2,7 @@
 package com.brindlex.kernel.quorvane.client;
 
 import org.jetbrains.annotations.NotNull;
+
 /**
  * Client edition: what tag 11 sends. A row outside the table is sent as NO DEFINE. Never changes.
  *

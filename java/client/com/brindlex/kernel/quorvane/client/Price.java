@@ -65,7 +65,9 @@ public final class Price {
         return new Price(null, word);
     }
 
-    /** The price that stands in a result: a whole number with implied decimals or a word; or null. */
+    /**
+     * The price that stands in a result: a whole number with implied decimals or a word; or null.
+     */
     @Nullable
     static Price parse(String text, int decimals) {
         BigDecimal amount = Numbers.scaled(text, decimals);

@@ -2,6 +2,7 @@
 package com.brindlex.kernel.quorvane.client;
 
 import org.jetbrains.annotations.NotNull;
+
 /** What stands in place of a price that is no number. */
 public enum PriceWord implements Coded {
     /** Market price. */

@@ -2,6 +2,7 @@
 package com.brindlex.kernel.quorvane.client;
 
 import org.jetbrains.annotations.NotNull;
+
 /**
  * What a futures order, fill or position is made of. The list of fills writes every product of two
  * legs as X.

@@ -15,9 +15,9 @@ import org.jetbrains.annotations.Nullable;
  * Reply<StockOrderReceipt> reply = order.read(send(order.text()));
  * }</pre>
  *
- * <p>Whatever cannot be sent is refused by an {@link InvalidRequestException} that tells all that is
- * wrong, here or by the {@code build()} of what is returned. The first call loads the library; see
- * {@link com.brindlex.kernel.quorvane.NativeLibrary}.
+ * <p>Whatever cannot be sent is refused by an {@link InvalidRequestException} that tells all that
+ * is wrong, here or by the {@code build()} of what is returned. The first call loads the library;
+ * see {@link com.brindlex.kernel.quorvane.NativeLibrary}.
  */
 public final class Requests {
     private final Session session;

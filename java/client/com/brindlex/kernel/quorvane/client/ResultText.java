@@ -117,7 +117,8 @@ public final class ResultText {
         for (int i = 0; i < layout.shapes().size(); i++) {
             String mark = layout.mark(i);
             int at = marked.at(mark);
-            int end = i + 1 < layout.shapes().size() ? marked.at(layout.mark(i + 1)) : text.length();
+            boolean last = i + 1 == layout.shapes().size();
+            int end = last ? text.length() : marked.at(layout.mark(i + 1));
             if (at == text.length() && !text.equals(mark + "!")) {
                 faults.add(new Fault(at, "no section " + mark, true));
             } else {

@@ -4,95 +4,95 @@ package com.brindlex.kernel.quorvane.client;
 import java.math.BigDecimal;
 import org.jetbrains.annotations.NotNull;
 import org.jetbrains.annotations.Nullable;
+
 /** One settled trade. Never changes. */
 public final class SettledTrade extends Row<SettledTrade> {
     /** Date in tag 50. */
     public static final Column<SettledTrade, TradeDate> DATE50 =
-            new Column<SettledTrade, TradeDate>(0, "date50", Form.DATE,
-                    "50", "date in tag 50");
+            new Column<SettledTrade, TradeDate>(0, "date50", Form.DATE, "50", "date in tag 50");
 
     /** Type of the trade. */
     public static final Column<SettledTrade, Code<SettlementType>> TYPE =
-            new Column<SettledTrade, Code<SettlementType>>(1, "type", Form.code(SettlementType.values()),
-                    "27 28 32", "type of the trade");
+            new Column<SettledTrade, Code<SettlementType>>(1, "type",
+                    Form.code(SettlementType.values()), "27 28 32", "type of the trade");
 
     /** Stock code. */
     public static final Column<SettledTrade, String> STOCK_CODE =
-            new Column<SettledTrade, String>(2, "stockCode", Form.TEXT,
-                    "29", "stock code");
+            new Column<SettledTrade, String>(2, "stockCode", Form.TEXT, "29", "stock code");
 
     /** Quantity in tag 47. */
     public static final Column<SettledTrade, BigDecimal> QUANTITY47 =
-            new Column<SettledTrade, BigDecimal>(3, "quantity47", Form.NUMBER,
-                    "47", "quantity in tag 47");
+            new Column<SettledTrade, BigDecimal>(3, "quantity47", Form.NUMBER, "47",
+                    "quantity in tag 47");
 
     /** Price in tag 48. */
     public static final Column<SettledTrade, BigDecimal> PRICE48 =
-            new Column<SettledTrade, BigDecimal>(4, "price48", Form.HUNDREDTHS,
-                    "48", "price in tag 48");
+            new Column<SettledTrade, BigDecimal>(4, "price48", Form.HUNDREDTHS, "48",
+                    "price in tag 48");
 
     /** Settlement amount 49. */
     public static final Column<SettledTrade, BigDecimal> AMOUNT49 =
-            new Column<SettledTrade, BigDecimal>(5, "amount49", Form.NUMBER,
-                    "49", "settlement amount 49");
+            new Column<SettledTrade, BigDecimal>(5, "amount49", Form.NUMBER, "49",
+                    "settlement amount 49");
 
     /** Settlement amount 79. */
     public static final Column<SettledTrade, BigDecimal> AMOUNT79 =
-            new Column<SettledTrade, BigDecimal>(6, "amount79", Form.NUMBER,
-                    "79", "settlement amount 79");
+            new Column<SettledTrade, BigDecimal>(6, "amount79", Form.NUMBER, "79",
+                    "settlement amount 79");
 
     /** Settlement amount 78. */
     public static final Column<SettledTrade, BigDecimal> AMOUNT78 =
-            new Column<SettledTrade, BigDecimal>(7, "amount78", Form.NUMBER,
-                    "78", "settlement amount 78");
+            new Column<SettledTrade, BigDecimal>(7, "amount78", Form.NUMBER, "78",
+                    "settlement amount 78");
 
     /** Settlement amount 84. */
     public static final Column<SettledTrade, BigDecimal> AMOUNT84 =
-            new Column<SettledTrade, BigDecimal>(8, "amount84", Form.NUMBER,
-                    "84", "settlement amount 84");
+            new Column<SettledTrade, BigDecimal>(8, "amount84", Form.NUMBER, "84",
+                    "settlement amount 84");
 
     /** Amount 81 or 85, by the order kind, or 0. */
     public static final Column<SettledTrade, BigDecimal> PAIR_FIRST =
-            new Column<SettledTrade, BigDecimal>(9, "pairFirst", Form.NUMBER,
-                    "27 81 85", "amount 81 or 85, by the order kind, or 0");
+            new Column<SettledTrade, BigDecimal>(9, "pairFirst", Form.NUMBER, "27 81 85",
+                    "amount 81 or 85, by the order kind, or 0");
 
     /** Amount 82 or 87 likewise, or 0. */
     public static final Column<SettledTrade, BigDecimal> PAIR_SECOND =
-            new Column<SettledTrade, BigDecimal>(10, "pairSecond", Form.NUMBER,
-                    "27 82 87", "amount 82 or 87 likewise, or 0");
+            new Column<SettledTrade, BigDecimal>(10, "pairSecond", Form.NUMBER, "27 82 87",
+                    "amount 82 or 87 likewise, or 0");
 
     /** Settlement amount 86; 0 when absent. */
     public static final Column<SettledTrade, BigDecimal> AMOUNT86 =
-            new Column<SettledTrade, BigDecimal>(11, "amount86", Form.NUMBER,
-                    "86", "settlement amount 86; 0 when absent");
+            new Column<SettledTrade, BigDecimal>(11, "amount86", Form.NUMBER, "86",
+                    "settlement amount 86; 0 when absent");
 
     /** Settlement amount 89; 0 when absent. */
     public static final Column<SettledTrade, BigDecimal> AMOUNT89 =
-            new Column<SettledTrade, BigDecimal>(12, "amount89", Form.NUMBER,
-                    "89", "settlement amount 89; 0 when absent");
+            new Column<SettledTrade, BigDecimal>(12, "amount89", Form.NUMBER, "89",
+                    "settlement amount 89; 0 when absent");
 
     /** Settlement amount 88; 0 when absent. */
     public static final Column<SettledTrade, BigDecimal> AMOUNT88 =
-            new Column<SettledTrade, BigDecimal>(13, "amount88", Form.NUMBER,
-                    "88", "settlement amount 88; 0 when absent");
+            new Column<SettledTrade, BigDecimal>(13, "amount88", Form.NUMBER, "88",
+                    "settlement amount 88; 0 when absent");
 
     /** Sign: {@code -} or empty. */
     public static final Column<SettledTrade, String> SIGN =
-            new Column<SettledTrade, String>(14, "sign", Form.TEXT,
-                    "96", "sign: `-` or empty");
+            new Column<SettledTrade, String>(14, "sign", Form.TEXT, "96", "sign: `-` or empty");
 
     /** Settlement amount 97. */
     public static final Column<SettledTrade, BigDecimal> AMOUNT97 =
-            new Column<SettledTrade, BigDecimal>(15, "amount97", Form.NUMBER,
-                    "97", "settlement amount 97");
+            new Column<SettledTrade, BigDecimal>(15, "amount97", Form.NUMBER, "97",
+                    "settlement amount 97");
 
     /** Type of the trade, as the brokerage says it. */
     public static final Column<SettledTrade, String> TYPE_TEXT =
-            new Column<SettledTrade, String>(16, "typeText", Form.TEXT,
-                    "KT", "type of the trade, as the brokerage says it");
+            new Column<SettledTrade, String>(16, "typeText", Form.TEXT, "KT",
+                    "type of the trade, as the brokerage says it");
 
-    static final Shape<SettledTrade> SHAPE = new Shape<SettledTrade>("settled trade", "0@@1@2@3@4@5@6@7@8@9@10@11@12@13@14@15",
-            DATE50, TYPE, STOCK_CODE, QUANTITY47, PRICE48, AMOUNT49, AMOUNT79, AMOUNT78, AMOUNT84, PAIR_FIRST, PAIR_SECOND, AMOUNT86, AMOUNT89, AMOUNT88, SIGN, AMOUNT97, TYPE_TEXT) {
+    static final Shape<SettledTrade> SHAPE = new Shape<SettledTrade>("settled trade",
+            "0@@1@2@3@4@5@6@7@8@9@10@11@12@13@14@15",
+            DATE50, TYPE, STOCK_CODE, QUANTITY47, PRICE48, AMOUNT49, AMOUNT79, AMOUNT78, AMOUNT84,
+            PAIR_FIRST, PAIR_SECOND, AMOUNT86, AMOUNT89, AMOUNT88, SIGN, AMOUNT97, TYPE_TEXT) {
         @Override
         SettledTrade row(String text, int start, int end) {
             return new SettledTrade(this, text, start, end);
@@ -100,8 +100,10 @@ public final class SettledTrade extends Row<SettledTrade> {
     };
 
 
-    static final Shape<SettledTrade> SHAPE_JZG = new Shape<SettledTrade>("settled trade", "0@@16@2@3@4@5@6@7@8@9@10@11@12@13@14@15",
-            DATE50, TYPE, STOCK_CODE, QUANTITY47, PRICE48, AMOUNT49, AMOUNT79, AMOUNT78, AMOUNT84, PAIR_FIRST, PAIR_SECOND, AMOUNT86, AMOUNT89, AMOUNT88, SIGN, AMOUNT97, TYPE_TEXT) {
+    static final Shape<SettledTrade> SHAPE_JZG = new Shape<SettledTrade>("settled trade",
+            "0@@16@2@3@4@5@6@7@8@9@10@11@12@13@14@15",
+            DATE50, TYPE, STOCK_CODE, QUANTITY47, PRICE48, AMOUNT49, AMOUNT79, AMOUNT78, AMOUNT84,
+            PAIR_FIRST, PAIR_SECOND, AMOUNT86, AMOUNT89, AMOUNT88, SIGN, AMOUNT97, TYPE_TEXT) {
         @Override
         SettledTrade row(String text, int start, int end) {
             return new SettledTrade(this, text, start, end);

@@ -2,6 +2,7 @@
 package com.brindlex.kernel.quorvane.client;
 
 import org.jetbrains.annotations.NotNull;
+
 /**
  * Period of a settlement list, 1 to 6. There is no period code 3. Which days a period covers is
  * not known. Never changes.

@@ -2,6 +2,7 @@
 package com.brindlex.kernel.quorvane.client;
 
 import org.jetbrains.annotations.NotNull;
+
 /**
  * Type of a settled trade: as an order type up to 14; the kinds from 5 on have codes of their own.
  *

@@ -11,8 +11,8 @@ import org.jetbrains.annotations.NotNull;
  *
  * <p>A shape is written as a record is, with the number of a column where its text stands: fields
  * are separated by {@code @}, their parts by {@code &}, and what stands within these by bars. An
- * empty place is always empty; a field that opens with {@code ?} may be missing altogether, one that
- * opens with {@code *} takes all that is left.
+ * empty place is always empty; a field that opens with {@code ?} may be missing altogether, one
+ * that opens with {@code *} takes all that is left.
  *
  * @param <R> the rows
  */

@@ -2,6 +2,7 @@
 package com.brindlex.kernel.quorvane.client;
 
 import org.jetbrains.annotations.NotNull;
+
 /** Buy or sell. */
 public enum Side implements Coded {
     /** Buy. */

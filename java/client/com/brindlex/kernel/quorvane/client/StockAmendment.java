@@ -5,9 +5,9 @@ import org.jetbrains.annotations.Nullable;
 
 /**
  * A cancellation or a change of quantity of an order of the book. What its row shows is taken from
- * there; what it does not show must be given, and is told by {@link #build} when it is not: with the
- * bare signature the flag of tag 13, with the one in tag PL shares per lot, and for some order types
- * order kind, trade type or side. For one thread.
+ * there; what it does not show must be given, and is told by {@link #build} when it is not: with
+ * the bare signature the flag of tag 13, with the one in tag PL shares per lot, and for some order
+ * types order kind, trade type or side. For one thread.
  */
 public final class StockAmendment {
     private final Session session;

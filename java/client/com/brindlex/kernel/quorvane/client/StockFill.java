@@ -4,12 +4,12 @@ package com.brindlex.kernel.quorvane.client;
 import java.math.BigDecimal;
 import org.jetbrains.annotations.NotNull;
 import org.jetbrains.annotations.Nullable;
+
 /** One stock fill. Never changes. */
 public final class StockFill extends Row<StockFill> {
     /** Order number. */
     public static final Column<StockFill, String> ORDER_NUMBER =
-            new Column<StockFill, String>(0, "orderNumber", Form.TEXT,
-                    "36", "order number");
+            new Column<StockFill, String>(0, "orderNumber", Form.TEXT, "36", "order number");
 
     /** Order type. */
     public static final Column<StockFill, Code<OrderType>> TYPE =
@@ -18,35 +18,31 @@ public final class StockFill extends Row<StockFill> {
 
     /** Stock code. */
     public static final Column<StockFill, String> STOCK_CODE =
-            new Column<StockFill, String>(2, "stockCode", Form.TEXT,
-                    "29", "stock code");
+            new Column<StockFill, String>(2, "stockCode", Form.TEXT, "29", "stock code");
 
     /** Filled quantity. */
     public static final Column<StockFill, Long> FILLED_QUANTITY =
-            new Column<StockFill, Long>(3, "filledQuantity", Form.COUNT,
-                    "47", "filled quantity");
+            new Column<StockFill, Long>(3, "filledQuantity", Form.COUNT, "47", "filled quantity");
 
     /** Price of the fill. */
     public static final Column<StockFill, BigDecimal> FILL_PRICE =
-            new Column<StockFill, BigDecimal>(4, "fillPrice", Form.HUNDREDTHS,
-                    "48", "price of the fill");
+            new Column<StockFill, BigDecimal>(4, "fillPrice", Form.HUNDREDTHS, "48",
+                    "price of the fill");
 
     /** Number in tag 49. */
     public static final Column<StockFill, Long> NUMBER49 =
-            new Column<StockFill, Long>(5, "number49", Form.COUNT,
-                    "49", "number in tag 49");
+            new Column<StockFill, Long>(5, "number49", Form.COUNT, "49", "number in tag 49");
 
     /** Date in tag 50. */
     public static final Column<StockFill, TradeDate> DATE50 =
-            new Column<StockFill, TradeDate>(6, "date50", Form.DATE,
-                    "50", "date in tag 50");
+            new Column<StockFill, TradeDate>(6, "date50", Form.DATE, "50", "date in tag 50");
 
     /** Time in tag 51. */
     public static final Column<StockFill, TradeTime> TIME51 =
-            new Column<StockFill, TradeTime>(7, "time51", Form.TIME,
-                    "51", "time in tag 51");
+            new Column<StockFill, TradeTime>(7, "time51", Form.TIME, "51", "time in tag 51");
 
-    static final Shape<StockFill> SHAPE = new Shape<StockFill>("stock fill", "0@1@2@3@4@5@6@7",
+    static final Shape<StockFill> SHAPE = new Shape<StockFill>("stock fill",
+            "0@1@2@3@4@5@6@7",
             ORDER_NUMBER, TYPE, STOCK_CODE, FILLED_QUANTITY, FILL_PRICE, NUMBER49, DATE50, TIME51) {
         @Override
         StockFill row(String text, int start, int end) {

@@ -2,6 +2,7 @@
 package com.brindlex.kernel.quorvane.client;
 
 import org.jetbrains.annotations.NotNull;
+
 /** Function letter of a stock order (tag 14). */
 public enum StockFunction implements Coded {
     /** New. */

@@ -3,17 +3,17 @@ package com.brindlex.kernel.quorvane.client;
 
 import org.jetbrains.annotations.NotNull;
 import org.jetbrains.annotations.Nullable;
+
 /** One stock order. Never changes. */
 public final class StockOrder extends Row<StockOrder> {
     /** Number of the order at the gateway. */
     public static final Column<StockOrder, String> GATEWAY_NUMBER =
-            new Column<StockOrder, String>(0, "gatewayNumber", Form.TEXT,
-                    "46", "number of the order at the gateway");
+            new Column<StockOrder, String>(0, "gatewayNumber", Form.TEXT, "46",
+                    "number of the order at the gateway");
 
     /** Order number. */
     public static final Column<StockOrder, String> ORDER_NUMBER =
-            new Column<StockOrder, String>(1, "orderNumber", Form.TEXT,
-                    "36", "order number");
+            new Column<StockOrder, String>(1, "orderNumber", Form.TEXT, "36", "order number");
 
     /** Order type. */
     public static final Column<StockOrder, Code<OrderType>> TYPE =
@@ -22,13 +22,12 @@ public final class StockOrder extends Row<StockOrder> {
 
     /** Stock code. */
     public static final Column<StockOrder, String> STOCK_CODE =
-            new Column<StockOrder, String>(3, "stockCode", Form.TEXT,
-                    "29", "stock code");
+            new Column<StockOrder, String>(3, "stockCode", Form.TEXT, "29", "stock code");
 
     /** Ordered quantity. */
     public static final Column<StockOrder, Long> ORDERED_QUANTITY =
-            new Column<StockOrder, Long>(4, "orderedQuantity", Form.COUNT,
-                    "70", "ordered quantity");
+            new Column<StockOrder, Long>(4, "orderedQuantity", Form.COUNT, "70",
+                    "ordered quantity");
 
     /** State of the order. */
     public static final Column<StockOrder, Code<OrderStatus>> STATE =
@@ -37,51 +36,50 @@ public final class StockOrder extends Row<StockOrder> {
 
     /** Why the order failed. */
     public static final Column<StockOrder, String> GATEWAY_TEXT =
-            new Column<StockOrder, String>(6, "gatewayText", Form.TEXT,
-                    "39 K1", "why the order failed");
+            new Column<StockOrder, String>(6, "gatewayText", Form.TEXT, "39 K1",
+                    "why the order failed");
 
     /** Filled quantity. */
     public static final Column<StockOrder, Long> FILLED_QUANTITY =
-            new Column<StockOrder, Long>(7, "filledQuantity", Form.COUNT,
-                    "47", "filled quantity");
+            new Column<StockOrder, Long>(7, "filledQuantity", Form.COUNT, "47", "filled quantity");
 
     /** Cancelled quantity: the sum of both tags. */
     public static final Column<StockOrder, Long> CANCELLED_QUANTITY =
-            new Column<StockOrder, Long>(8, "cancelledQuantity", Form.COUNT,
-                    "37 41", "cancelled quantity: the sum of both tags");
+            new Column<StockOrder, Long>(8, "cancelledQuantity", Form.COUNT, "37 41",
+                    "cancelled quantity: the sum of both tags");
 
     /** Order price. */
     public static final Column<StockOrder, Price> PRICE =
-            new Column<StockOrder, Price>(9, "price", Form.PRICE_2,
-                    "31 M8", "order price");
+            new Column<StockOrder, Price>(9, "price", Form.PRICE_2, "31 M8", "order price");
 
     /** Time of entry. */
     public static final Column<StockOrder, TradeTime> ENTRY_TIME =
-            new Column<StockOrder, TradeTime>(10, "entryTime", Form.TIME,
-                    "22", "time of entry");
+            new Column<StockOrder, TradeTime>(10, "entryTime", Form.TIME, "22", "time of entry");
 
     /** Date of entry. */
     public static final Column<StockOrder, TradeDate> ENTRY_DATE =
-            new Column<StockOrder, TradeDate>(11, "entryDate", Form.DATE,
-                    "21", "date of entry");
+            new Column<StockOrder, TradeDate>(11, "entryDate", Form.DATE, "21", "date of entry");
 
     /** Date of the order. */
     public static final Column<StockOrder, TradeDate> ORDER_DATE =
-            new Column<StockOrder, TradeDate>(12, "orderDate", Form.DATE,
-                    "44", "date of the order");
+            new Column<StockOrder, TradeDate>(12, "orderDate", Form.DATE, "44",
+                    "date of the order");
 
     /** Handling flag of the broker. */
     public static final Column<StockOrder, String> HANDLING_FLAG =
-            new Column<StockOrder, String>(13, "handlingFlag", Form.TEXT,
-                    "N6", "handling flag of the broker");
+            new Column<StockOrder, String>(13, "handlingFlag", Form.TEXT, "N6",
+                    "handling flag of the broker");
 
     /** Whether the order can be changed. */
     public static final Column<StockOrder, Code<Amendable>> CHANGEABLE =
             new Column<StockOrder, Code<Amendable>>(14, "changeable", Form.code(Amendable.values()),
                     "JV 39 K1", "whether the order can be changed");
 
-    static final Shape<StockOrder> SHAPE = new Shape<StockOrder>("stock order", "0@1@2@3@4@5&6@7@8@9@10@11@12@13@14",
-            GATEWAY_NUMBER, ORDER_NUMBER, TYPE, STOCK_CODE, ORDERED_QUANTITY, STATE, GATEWAY_TEXT, FILLED_QUANTITY, CANCELLED_QUANTITY, PRICE, ENTRY_TIME, ENTRY_DATE, ORDER_DATE, HANDLING_FLAG, CHANGEABLE) {
+    static final Shape<StockOrder> SHAPE = new Shape<StockOrder>("stock order",
+            "0@1@2@3@4@5&6@7@8@9@10@11@12@13@14",
+            GATEWAY_NUMBER, ORDER_NUMBER, TYPE, STOCK_CODE, ORDERED_QUANTITY, STATE, GATEWAY_TEXT,
+            FILLED_QUANTITY, CANCELLED_QUANTITY, PRICE, ENTRY_TIME, ENTRY_DATE, ORDER_DATE,
+            HANDLING_FLAG, CHANGEABLE) {
         @Override
         StockOrder row(String text, int start, int end) {
             return new StockOrder(this, text, start, end);

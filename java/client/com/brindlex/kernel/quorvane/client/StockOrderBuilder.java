@@ -91,8 +91,8 @@ public final class StockOrderBuilder {
     }
 
     /**
-     * Trade type: 0 for lots, 2 for shares of an odd lot, 3 for lots at no price of the order's own.
-     * Unless given, the quantity says whether it is 0 or 2.
+     * Trade type: 0 for lots, 2 for shares of an odd lot, 3 for lots at no price of the order's
+     * own. Unless given, the quantity says whether it is 0 or 2.
      */
     @NotNull
     public StockOrderBuilder tradeType(@NotNull TradeType type) {

@@ -3,24 +3,26 @@ package com.brindlex.kernel.quorvane.client;
 
 import org.jetbrains.annotations.NotNull;
 import org.jetbrains.annotations.Nullable;
+
 /** One stock order receipt. Never changes. */
 public final class StockOrderReceipt extends Row<StockOrderReceipt> {
     /** Number of the order at the gateway. */
     public static final Column<StockOrderReceipt, String> GATEWAY_NUMBER =
-            new Column<StockOrderReceipt, String>(0, "gatewayNumber", Form.TEXT,
-                    "46", "number of the order at the gateway");
+            new Column<StockOrderReceipt, String>(0, "gatewayNumber", Form.TEXT, "46",
+                    "number of the order at the gateway");
 
     /** Date of the order. */
     public static final Column<StockOrderReceipt, TradeDate> ORDER_DATE =
-            new Column<StockOrderReceipt, TradeDate>(1, "orderDate", Form.DATE,
-                    "44", "date of the order");
+            new Column<StockOrderReceipt, TradeDate>(1, "orderDate", Form.DATE, "44",
+                    "date of the order");
 
     /** Acceptance letter of the gateway. */
     public static final Column<StockOrderReceipt, Code<Acceptance>> ACCEPTANCE =
-            new Column<StockOrderReceipt, Code<Acceptance>>(2, "acceptance", Form.code(Acceptance.values()),
-                    "19", "acceptance letter of the gateway");
+            new Column<StockOrderReceipt, Code<Acceptance>>(2, "acceptance",
+                    Form.code(Acceptance.values()), "19", "acceptance letter of the gateway");
 
-    static final Shape<StockOrderReceipt> SHAPE = new Shape<StockOrderReceipt>("stock order receipt", "0@1@@2",
+    static final Shape<StockOrderReceipt> SHAPE = new Shape<StockOrderReceipt>("stock order receipt",
+            "0@1@@2",
             GATEWAY_NUMBER, ORDER_DATE, ACCEPTANCE) {
         @Override
         StockOrderReceipt row(String text, int start, int end) {

@@ -3,29 +3,30 @@ package com.brindlex.kernel.quorvane.client;
 
 import org.jetbrains.annotations.NotNull;
 import org.jetbrains.annotations.Nullable;
+
 /** One stock position 0. Never changes. */
 public final class StockPosition0 extends Row<StockPosition0> {
     /** Stock code. */
     public static final Column<StockPosition0, String> STOCK_CODE =
-            new Column<StockPosition0, String>(0, "stockCode", Form.TEXT,
-                    "29", "stock code");
+            new Column<StockPosition0, String>(0, "stockCode", Form.TEXT, "29", "stock code");
 
     /** Quantity in tag 75. */
     public static final Column<StockPosition0, Long> QUANTITY75 =
-            new Column<StockPosition0, Long>(1, "quantity75", Form.COUNT,
-                    "75", "quantity in tag 75");
+            new Column<StockPosition0, Long>(1, "quantity75", Form.COUNT, "75",
+                    "quantity in tag 75");
 
     /** Quantity in tag 751. */
     public static final Column<StockPosition0, Long> QUANTITY751 =
-            new Column<StockPosition0, Long>(2, "quantity751", Form.COUNT,
-                    "751", "quantity in tag 751");
+            new Column<StockPosition0, Long>(2, "quantity751", Form.COUNT, "751",
+                    "quantity in tag 751");
 
     /** Quantity in tag 752. */
     public static final Column<StockPosition0, Long> QUANTITY752 =
-            new Column<StockPosition0, Long>(3, "quantity752", Form.COUNT,
-                    "752", "quantity in tag 752");
+            new Column<StockPosition0, Long>(3, "quantity752", Form.COUNT, "752",
+                    "quantity in tag 752");
 
-    static final Shape<StockPosition0> SHAPE = new Shape<StockPosition0>("stock position 0", "0@1|2",
+    static final Shape<StockPosition0> SHAPE = new Shape<StockPosition0>("stock position 0",
+            "0@1|2",
             STOCK_CODE, QUANTITY75, QUANTITY751, QUANTITY752) {
         @Override
         StockPosition0 row(String text, int start, int end) {
@@ -34,7 +35,8 @@ public final class StockPosition0 extends Row<StockPosition0> {
     };
 
 
-    static final Shape<StockPosition0> SHAPE_JZG = new Shape<StockPosition0>("stock position 0", "0@1|2|3",
+    static final Shape<StockPosition0> SHAPE_JZG = new Shape<StockPosition0>("stock position 0",
+            "0@1|2|3",
             STOCK_CODE, QUANTITY75, QUANTITY751, QUANTITY752) {
         @Override
         StockPosition0 row(String text, int start, int end) {

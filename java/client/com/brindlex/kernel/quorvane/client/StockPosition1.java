@@ -3,29 +3,30 @@ package com.brindlex.kernel.quorvane.client;
 
 import org.jetbrains.annotations.NotNull;
 import org.jetbrains.annotations.Nullable;
+
 /** One stock position 1. Never changes. */
 public final class StockPosition1 extends Row<StockPosition1> {
     /** Stock code. */
     public static final Column<StockPosition1, String> STOCK_CODE =
-            new Column<StockPosition1, String>(0, "stockCode", Form.TEXT,
-                    "29", "stock code");
+            new Column<StockPosition1, String>(0, "stockCode", Form.TEXT, "29", "stock code");
 
     /** Quantity in tag 76. */
     public static final Column<StockPosition1, Long> QUANTITY76 =
-            new Column<StockPosition1, Long>(1, "quantity76", Form.COUNT,
-                    "76", "quantity in tag 76");
+            new Column<StockPosition1, Long>(1, "quantity76", Form.COUNT, "76",
+                    "quantity in tag 76");
 
     /** Quantity in tag 761. */
     public static final Column<StockPosition1, Long> QUANTITY761 =
-            new Column<StockPosition1, Long>(2, "quantity761", Form.COUNT,
-                    "761", "quantity in tag 761");
+            new Column<StockPosition1, Long>(2, "quantity761", Form.COUNT, "761",
+                    "quantity in tag 761");
 
     /** Quantity in tag 762. */
     public static final Column<StockPosition1, Long> QUANTITY762 =
-            new Column<StockPosition1, Long>(3, "quantity762", Form.COUNT,
-                    "762", "quantity in tag 762");
+            new Column<StockPosition1, Long>(3, "quantity762", Form.COUNT, "762",
+                    "quantity in tag 762");
 
-    static final Shape<StockPosition1> SHAPE = new Shape<StockPosition1>("stock position 1", "0@1|2@@@@@",
+    static final Shape<StockPosition1> SHAPE = new Shape<StockPosition1>("stock position 1",
+            "0@1|2@@@@@",
             STOCK_CODE, QUANTITY76, QUANTITY761, QUANTITY762) {
         @Override
         StockPosition1 row(String text, int start, int end) {
@@ -34,7 +35,8 @@ public final class StockPosition1 extends Row<StockPosition1> {
     };
 
 
-    static final Shape<StockPosition1> SHAPE_JZG = new Shape<StockPosition1>("stock position 1", "0@1|2|3@@@@@",
+    static final Shape<StockPosition1> SHAPE_JZG = new Shape<StockPosition1>("stock position 1",
+            "0@1|2|3@@@@@",
             STOCK_CODE, QUANTITY76, QUANTITY761, QUANTITY762) {
         @Override
         StockPosition1 row(String text, int start, int end) {

@@ -3,29 +3,30 @@ package com.brindlex.kernel.quorvane.client;
 
 import org.jetbrains.annotations.NotNull;
 import org.jetbrains.annotations.Nullable;
+
 /** One stock position 2. Never changes. */
 public final class StockPosition2 extends Row<StockPosition2> {
     /** Stock code. */
     public static final Column<StockPosition2, String> STOCK_CODE =
-            new Column<StockPosition2, String>(0, "stockCode", Form.TEXT,
-                    "29", "stock code");
+            new Column<StockPosition2, String>(0, "stockCode", Form.TEXT, "29", "stock code");
 
     /** Quantity in tag 77. */
     public static final Column<StockPosition2, Long> QUANTITY77 =
-            new Column<StockPosition2, Long>(1, "quantity77", Form.COUNT,
-                    "77", "quantity in tag 77");
+            new Column<StockPosition2, Long>(1, "quantity77", Form.COUNT, "77",
+                    "quantity in tag 77");
 
     /** Quantity in tag 771. */
     public static final Column<StockPosition2, Long> QUANTITY771 =
-            new Column<StockPosition2, Long>(2, "quantity771", Form.COUNT,
-                    "771", "quantity in tag 771");
+            new Column<StockPosition2, Long>(2, "quantity771", Form.COUNT, "771",
+                    "quantity in tag 771");
 
     /** Quantity in tag 772. */
     public static final Column<StockPosition2, Long> QUANTITY772 =
-            new Column<StockPosition2, Long>(3, "quantity772", Form.COUNT,
-                    "772", "quantity in tag 772");
+            new Column<StockPosition2, Long>(3, "quantity772", Form.COUNT, "772",
+                    "quantity in tag 772");
 
-    static final Shape<StockPosition2> SHAPE = new Shape<StockPosition2>("stock position 2", "0@1|2@@@@",
+    static final Shape<StockPosition2> SHAPE = new Shape<StockPosition2>("stock position 2",
+            "0@1|2@@@@",
             STOCK_CODE, QUANTITY77, QUANTITY771, QUANTITY772) {
         @Override
         StockPosition2 row(String text, int start, int end) {
@@ -34,7 +35,8 @@ public final class StockPosition2 extends Row<StockPosition2> {
     };
 
 
-    static final Shape<StockPosition2> SHAPE_JZG = new Shape<StockPosition2>("stock position 2", "0@1|2|3@@@@",
+    static final Shape<StockPosition2> SHAPE_JZG = new Shape<StockPosition2>("stock position 2",
+            "0@1|2|3@@@@",
             STOCK_CODE, QUANTITY77, QUANTITY771, QUANTITY772) {
         @Override
         StockPosition2 row(String text, int start, int end) {

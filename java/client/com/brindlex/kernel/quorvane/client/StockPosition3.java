@@ -3,29 +3,28 @@ package com.brindlex.kernel.quorvane.client;
 
 import org.jetbrains.annotations.NotNull;
 import org.jetbrains.annotations.Nullable;
+
 /** One stock position 3. Never changes. */
 public final class StockPosition3 extends Row<StockPosition3> {
     /** Stock code. */
     public static final Column<StockPosition3, String> STOCK_CODE =
-            new Column<StockPosition3, String>(0, "stockCode", Form.TEXT,
-                    "29", "stock code");
+            new Column<StockPosition3, String>(0, "stockCode", Form.TEXT, "29", "stock code");
 
     /** Quantity in tag PS. */
     public static final Column<StockPosition3, Long> QUANTITY_PS =
-            new Column<StockPosition3, Long>(1, "quantityPS", Form.COUNT,
-                    "PS", "quantity in tag PS");
+            new Column<StockPosition3, Long>(1, "quantityPS", Form.COUNT, "PS",
+                    "quantity in tag PS");
 
     /** Always 0. */
     public static final Column<StockPosition3, Long> ZERO1 =
-            new Column<StockPosition3, Long>(2, "zero1", Form.COUNT,
-                    "", "always 0");
+            new Column<StockPosition3, Long>(2, "zero1", Form.COUNT, "", "always 0");
 
     /** Always 0. */
     public static final Column<StockPosition3, Long> ZERO2 =
-            new Column<StockPosition3, Long>(3, "zero2", Form.COUNT,
-                    "", "always 0");
+            new Column<StockPosition3, Long>(3, "zero2", Form.COUNT, "", "always 0");
 
-    static final Shape<StockPosition3> SHAPE = new Shape<StockPosition3>("stock position 3", "0@1|2|3",
+    static final Shape<StockPosition3> SHAPE = new Shape<StockPosition3>("stock position 3",
+            "0@1|2|3",
             STOCK_CODE, QUANTITY_PS, ZERO1, ZERO2) {
         @Override
         StockPosition3 row(String text, int start, int end) {

@@ -46,7 +46,8 @@ final class Terms {
                     + new java.math.BigDecimal(Integer.MAX_VALUE).movePointLeft(decimals) + ", not "
                     + price);
         } else if (scaled < least) {
-            draft.refuse("price", "must be at least " + least + " of its last decimal, not " + price);
+            draft.refuse("price", "must " + (least == 0 ? "not be below" : "be above") + " 0, not "
+                    + price);
         } else {
             draft.set("price", scaled);
         }

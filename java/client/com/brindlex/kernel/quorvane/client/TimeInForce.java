@@ -2,6 +2,7 @@
 package com.brindlex.kernel.quorvane.client;
 
 import org.jetbrains.annotations.NotNull;
+
 /** How long a futures order stands. */
 public enum TimeInForce implements Coded {
     /** Rest of day. */

@@ -2,6 +2,7 @@
 package com.brindlex.kernel.quorvane.client;
 
 import org.jetbrains.annotations.NotNull;
+
 /**
  * Trade type of a stock order (tag 28). Orders take 0, 2 and 3; the lists know 1 too, as 0. Never
  * changes.

@@ -7,6 +7,7 @@
  * com.brindlex.kernel.quorvane.client.Reply}: a result, a failure, or an order that is on its way.
  *
  * <p>Nothing here keeps a connection, a file or a thread. Values, requests, replies and rows never
- * change and may be shared by threads; {@code Requests} may be too; a builder belongs to one thread.
+ * change and may be shared by threads; {@code Requests} may be too; a builder belongs to one
+ * thread.
  */
 package com.brindlex.kernel.quorvane.client;

@@ -15,7 +15,9 @@ import java.util.stream.Stream;
 import org.junit.jupiter.params.ParameterizedTest;
 import org.junit.jupiter.params.provider.MethodSource;
 
-/** Whatever a decoder returns is a result, a failure or on its way; a value that is none says so. */
+/**
+ * Whatever a decoder returns is a result, a failure or on its way; a value that is none says so.
+ */
 class RandomReplyTest {
     private static final int ROUNDS = 1000;
     private static final String[] VALUES = {
