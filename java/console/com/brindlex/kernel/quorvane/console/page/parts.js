@@ -35,6 +35,13 @@ export async function ask(path, options) {
   return null;
 }
 
+/** On a narrow screen an answer stands below the form that asked for it. */
+export function bringIntoView(element) {
+  if (element.getBoundingClientRect().top > window.innerHeight / 2) {
+    element.scrollIntoView({ block: 'start' });
+  }
+}
+
 export const tell = (path, value) => ask(path, { method: 'POST', body: JSON.stringify(value) });
 
 export function faultLine(fault) {

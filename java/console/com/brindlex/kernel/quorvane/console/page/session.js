@@ -1,5 +1,5 @@
 // Session: orders to the simulated gateway, and what the exchange makes of them.
-import { ask, byId, h, messageTable, note, resultTable, tell } from './parts.js';
+import { ask, bringIntoView, byId, h, messageTable, note, resultTable, tell } from './parts.js';
 import { allForms, choice, inputs, problems, written } from './try.js';
 
 const ACTS = {
@@ -30,6 +30,7 @@ function showSent(value) {
       h('div', { className: 'pair' }, ...['request', 'reply'].map(kind =>
           h('section', null, h('h2', null, (kind === 'request' ? '→ ' : '← ') + value[kind].words),
               ...messageTable(value[kind])))));
+  bringIntoView(byId('session-lists'));
 }
 
 function showForm(all, name) {

@@ -1,5 +1,5 @@
 // Try: a form for each operation; the library itself encodes and decodes.
-import { ask, byId, bytes, h, messageTable, note, resultTable, tell } from './parts.js';
+import { ask, bringIntoView, byId, bytes, h, messageTable, note, resultTable, tell } from './parts.js';
 
 let forms = null;
 
@@ -88,6 +88,7 @@ function showResult(value) {
   }
   parts.push(copyButtons(value.copies));
   byId('try-result').replaceChildren(...parts);
+  bringIntoView(byId('try-result'));
 }
 
 function show(all, name) {

@@ -205,6 +205,22 @@ class PageServerTest {
     }
 
     @Test
+    void aCallIsCopiedAsSourceText() throws IOException {
+        JsonObject asked = new JsonObject();
+        asked.addProperty("operation", "AuthDecode");
+        asked.addProperty("reply", "a\"b\\c$d\n\u2028 ");
+        JsonObject copies = ask("POST", "api/decode", asked.toString()).json()
+                .getAsJsonObject("copies");
+        String call = "RawReply.of(Operation.AUTH_DECODE, Market.SECURITIES,\n        ";
+        assertEquals("RawReply read = " + call + "\"a\\\"b\\\\c$d\\n\u2028 \");\n",
+                copies.get("java").getAsString());
+        assertEquals("val read = " + call + "\"a\\\"b\\\\c\\$d\\n\u2028 \")\n",
+                copies.get("kotlin").getAsString());
+        assertEquals("== title that says the point of the case\nop AuthDecode\n"
+                + "reply str a\"b\\\\c$d\\n\u2028\\s\n", copies.get("golden").getAsString());
+    }
+
+    @Test
     void aMaskedLogIsSavedWithoutItsSecrets() throws IOException {
         read(REQUEST);
         String id = ask("POST", "api/mask?log=1&keep=account", "").json().get("log").getAsString();
