@@ -148,9 +148,17 @@ function section(row, message) {
   const about = ['line ' + row.line, row.time, message.operations.slice(0, 3).join(' or '),
     row.requestId && 'request ' + row.requestId,
     row.millis === null ? '' : 'after ' + row.millis + ' ms'].filter(each => each).join(' · ');
-  return h('section', { 'aria-label': row.isRequest ? 'Request' : 'Answer' },
+  const element = h('section', { 'aria-label': row.isRequest ? 'Request' : 'Answer' },
       h('h2', null, (row.isRequest ? '→ ' : '← ') + message.words),
       h('p', { className: 'about' }, about), ...messageTable(message));
+  const first = element.querySelector('tr.bad');
+  if (first) {
+    const show = h('button', { type: 'button' }, row.faults.length === 1
+        ? 'Show the fault' : 'Show the first of ' + row.faults.length + ' faults');
+    show.addEventListener('click', () => first.scrollIntoView({ block: 'center' }));
+    element.querySelector('.about').after(show);
+  }
+  return element;
 }
 
 function nextFailure(step) {
