@@ -10,6 +10,11 @@ final class Unwrap {
             "(?<![A-Za-z0-9|])(?:F=[17]\\||\\|(?:F|00|68|39)=|\\[GATEWAY\\]error|\\[BROKER\\]timeout)");
     private static final Pattern RESULT = Pattern.compile("(?<=[\"'])(?:[0-9]{1,9}|<[0-9]>)!");
 
+    /** What the patterns cannot do without: most texts hold none of it, and need no search. */
+    private static final String[] MARKS = {
+        "F=1|", "F=7|", "|00=", "|68=", "|39=", "|F=", "[GATEWAY]error", "[BROKER]timeout"};
+    private static final String[] QUOTES = {"\"", "'"};
+
     private Unwrap() {}
 
     /**
@@ -22,8 +27,9 @@ final class Unwrap {
         if (text.indexOf('|') < 0 && text.indexOf('[') < 0 && text.indexOf('!') < 0) {
             return null;
         }
-        Matcher begin = BEGIN.matcher(text);
-        if (!begin.find() && !(begin = RESULT.matcher(text)).find()) {
+        Matcher begin = find(BEGIN, text, MARKS);
+        begin = begin == null ? find(RESULT, text, QUOTES) : begin;
+        if (begin == null) {
             return null;
         }
         int from = begin.start();
@@ -36,5 +42,15 @@ final class Unwrap {
             to -= feed ? 2 : 0;
         }
         return new int[] {from, to};
+    }
+
+    private static Matcher find(Pattern pattern, String text, String[] needed) {
+        for (String each : needed) {
+            if (text.contains(each)) {
+                Matcher matcher = pattern.matcher(text);
+                return matcher.find() ? matcher : null;
+            }
+        }
+        return null;
     }
 }

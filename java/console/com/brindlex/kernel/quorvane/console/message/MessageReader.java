@@ -13,9 +13,9 @@ public final class MessageReader {
             "\\[(?:strResult2?|status)\\].*|test1|(?:gatewayjni_)?GetCertEncode2?(?:_+[0-9])?"
             + "|Java_com_brindlex_kernel_quorvane_gatewayjni_\\w+");
     private static final Pattern RESULT = Pattern.compile(
-            "(?s)[0-9]{1,9}!.*|<[0-9]>!.*|[^|=]*@[^|]*!");
+            "[0-9]{1,9}!|<[0-9]>!|[^|=]*@[^|]*!\\z");
     private static final Pattern FIELDS =
-            Pattern.compile("(?s)[A-Z0-9]{1,7}=[^|]*\\|.*|[^|]{0,40}\\|[A-Z0-9]{1,7}=.*");
+            Pattern.compile("[A-Z0-9]{1,7}=[^|]*\\||[^|]{0,40}\\|[A-Z0-9]{1,7}=");
     private static final String[] OF_REQUESTS = {"|BHNO=", "|CB=", "|IP=", "|VER=", "|SN=", "|11="};
     private static final String[] SOURCES = {"[CLIENT]", "[GATEWAY]", "[BROKER]", "[CERT]"};
 
@@ -43,10 +43,10 @@ public final class MessageReader {
                 return Kind.MESSAGE;
             }
         }
-        if (RESULT.matcher(text).matches()) {
+        if (RESULT.matcher(text).lookingAt()) {
             return Kind.RESULT;
         }
-        if (FIELDS.matcher(text).matches()) {
+        if (FIELDS.matcher(text).lookingAt()) {
             return isRequest(text) ? Kind.REQUEST : Kind.REPLY;
         }
         return isKnownMessage(text) ? Kind.MESSAGE : Kind.TEXT;
@@ -68,8 +68,11 @@ public final class MessageReader {
         int found = 0;
         for (String tag : OF_REQUESTS) {
             found += text.contains(tag) ? 1 : 0;
+            if (found == 2) {
+                return true;
+            }
         }
-        return found >= 2;
+        return false;
     }
 
     private static boolean isKnownMessage(String text) {

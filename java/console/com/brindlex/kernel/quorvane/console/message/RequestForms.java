@@ -6,17 +6,34 @@ import com.brindlex.kernel.quorvane.console.dictionary.Operation;
 import java.util.ArrayList;
 import java.util.HashMap;
 import java.util.HashSet;
+import java.util.LinkedHashMap;
 import java.util.List;
 import java.util.Map;
 import java.util.Set;
 
 /** Every form that a request can have, found by the tags of a request in their order. */
 final class RequestForms {
+    /** What a request is for: values that weigh more than a field in common. */
+    private static final List<String> TELLING = List.of("F", "FUNC", "FUNC1", "14", "KIND", "15");
+
+    /** So many kinds of damaged requests are remembered with the forms that come closest. */
+    private static final int MOST_REMEMBERED = 256;
+    private static final int LONGEST_REMEMBERED = 1000;
+
     private static final Header.Identity NOBODY = new Header.Identity("any", "any", "");
 
     private final List<Template> all = new ArrayList<>();
     private final Map<String, List<Template>> byTags = new HashMap<>();
     private final Set<String> headers = new HashSet<>();
+    private final Map<List<String>, List<Template>> closest =
+            new LinkedHashMap<>(16, 0.75f, true) {
+                private static final long serialVersionUID = 1;
+
+                @Override
+                protected boolean removeEldestEntry(Map.Entry<List<String>, List<Template>> last) {
+                    return size() > MOST_REMEMBERED;
+                }
+            };
 
     private static final class Holder {
         static final RequestForms INSTANCE = new RequestForms(Dictionary.get());
@@ -66,6 +83,18 @@ final class RequestForms {
 
     /** The forms that come closest to the fields of a damaged request. */
     List<Template> closest(List<Cut.Piece> pieces) {
+        List<String> telling = new ArrayList<>(TELLING.size() + 1);
+        telling.add(Cut.tags(pieces));
+        TELLING.forEach(tag -> telling.add(Cut.value(pieces, tag)));
+        if (telling.stream().mapToInt(String::length).sum() > LONGEST_REMEMBERED) {
+            return search(pieces);
+        }
+        synchronized (closest) {
+            return closest.computeIfAbsent(telling, each -> search(pieces));
+        }
+    }
+
+    private List<Template> search(List<Cut.Piece> pieces) {
         List<Template> best = new ArrayList<>();
         int most = Integer.MIN_VALUE;
         for (Template template : all) {
@@ -84,7 +113,7 @@ final class RequestForms {
     /** Fields in common, with weight on those that tell what a request is for. */
     private static int score(Template template, List<Cut.Piece> pieces) {
         int score = 0;
-        for (String tag : new String[] {"F", "FUNC", "FUNC1", "14", "KIND", "15"}) {
+        for (String tag : TELLING) {
             String constant = template.constant(tag);
             String value = Cut.value(pieces, tag);
             if (constant != null && !value.isEmpty()) {

@@ -21,11 +21,19 @@ final class ResultReader {
     private final List<Fault> faults = new ArrayList<>();
     private final List<Group> groups = new ArrayList<>();
     private final boolean full;
+    private final boolean sections;
+    private final boolean isList;
+    private final int places;
     private int records;
 
     private ResultReader(String text, boolean full) {
         this.full = full;
         this.text = text;
+        this.sections = text.startsWith("<");
+        Matcher list = LIST.matcher(text);
+        this.isList = list.matches();
+        String all = isList ? list.group(2) : text;
+        this.places = isList && all.isEmpty() ? 0 : places(first(all));
     }
 
     static Message read(String text, List<String> decoders, boolean full) {
@@ -34,7 +42,7 @@ final class ResultReader {
         for (Operation operation : Dictionary.get().operations()) {
             Reply reply = Dictionary.get().reply(operation.name());
             boolean wanted = decoders.isEmpty() || decoders.contains(operation.name());
-            if (reply != null && wanted && fits(text, reply)) {
+            if (reply != null && wanted && reader.fits(reply)) {
                 fitting.add(reply);
             }
         }
@@ -48,20 +56,16 @@ final class ResultReader {
                 reader.groups, reader.faults, facts);
     }
 
-    private static boolean fits(String text, Reply reply) {
-        boolean sections = text.startsWith("<");
+    private boolean fits(Reply reply) {
         switch (reply.result()) {
             case "sections":
                 return sections && text.startsWith(reply.tables().get(0).mark())
                         && text.contains(lastMark(reply)) == (reply.tables().size() > 1)
                         && count(text) == reply.tables().size();
             case "list":
-                Matcher list = LIST.matcher(text);
-                return list.matches() && (list.group(2).isEmpty()
-                        || places(first(list.group(2))) == places(reply.tables().get(0)));
+                return isList && (places == 0 || places == places(reply.tables().get(0)));
             case "record":
-                return !sections && !LIST.matcher(text).matches()
-                        && places(first(text)) == places(reply.tables().get(0));
+                return !sections && !isList && places == places(reply.tables().get(0));
             default:
                 return false;
         }
