@@ -13,25 +13,25 @@ namespace {
 
 // Of the amounts no more is known than where the result shows them, two of them twice.
 enum Field {
-  kAmountLO,
-  kAmountPN,
-  kAmountRA,
-  kAmountQY,
-  kAmountQX,
-  kAmountU5,
-  kAmountU9,
-  kAmountRF,
-  kAmountF0,
-  kAmountF1,
-  kAmountF2,
-  kAmountF3
+  kFigureLO,
+  kFigurePN,
+  kFigureRA,
+  kFigureQY,
+  kFigureQX,
+  kFigureU5,
+  kFigureU9,
+  kFigureRF,
+  kFigureF0,
+  kFigureF1,
+  kFigureF2,
+  kFigureF3
 };
 
 constexpr TagRow kRows[] = {
-    {kAmountLO, "LO", kUnbounded}, {kAmountPN, "PN", 512},        {kAmountRA, "RA", kUnbounded},
-    {kAmountQY, "QY", kUnbounded}, {kAmountQX, "QX", kUnbounded}, {kAmountU5, "U5", kUnbounded},
-    {kAmountU9, "U9", kUnbounded}, {kAmountRF, "RF", kUnbounded}, {kAmountF0, "F0", kUnbounded},
-    {kAmountF1, "F1", kUnbounded}, {kAmountF2, "F2", kUnbounded}, {kAmountF3, "F3", kUnbounded}};
+    {kFigureLO, "LO", kUnbounded}, {kFigurePN, "PN", 512},        {kFigureRA, "RA", kUnbounded},
+    {kFigureQY, "QY", kUnbounded}, {kFigureQX, "QX", kUnbounded}, {kFigureU5, "U5", kUnbounded},
+    {kFigureU9, "U9", kUnbounded}, {kFigureRF, "RF", kUnbounded}, {kFigureF0, "F0", kUnbounded},
+    {kFigureF1, "F1", kUnbounded}, {kFigureF2, "F2", kUnbounded}, {kFigureF3, "F3", kUnbounded}};
 constexpr CTagTable kTags(kRows);
 
 // A place of the record: an amount with its implied decimals, or none.
@@ -43,12 +43,12 @@ struct Place {
 constexpr Place kNothing;
 
 constexpr Place kLayout[] = {
-    kNothing,    {kAmountLO, 2}, kNothing,    {kAmountPN}, {kAmountRA},  // 1 to 5
-    {kAmountLO}, {kAmountQY},    kNothing,    {kAmountQX}, kNothing,     // 6 to 10
-    {kAmountU5}, kNothing,       kNothing,    kNothing,    kNothing,     // 11 to 15
-    {kAmountU9}, {kAmountU5},    kNothing,    kNothing,    kNothing,     // 16 to 20
-    kNothing,    {kAmountRF},    kNothing,    kNothing,    kNothing,     // 21 to 25
-    kNothing,    {kAmountF0},    {kAmountF1}, {kAmountF2}, {kAmountF3},  // 26 to 30
+    kNothing,    {kFigureLO, 2}, kNothing,    {kFigurePN}, {kFigureRA},  // 1 to 5
+    {kFigureLO}, {kFigureQY},    kNothing,    {kFigureQX}, kNothing,     // 6 to 10
+    {kFigureU5}, kNothing,       kNothing,    kNothing,    kNothing,     // 11 to 15
+    {kFigureU9}, {kFigureU5},    kNothing,    kNothing,    kNothing,     // 16 to 20
+    kNothing,    {kFigureRF},    kNothing,    kNothing,    kNothing,     // 21 to 25
+    kNothing,    {kFigureF0},    {kFigureF1}, {kFigureF2}, {kFigureF3},  // 26 to 30
 };
 static_assert(sizeof kLayout / sizeof *kLayout == 30);
 
@@ -56,7 +56,7 @@ static_assert(sizeof kLayout / sizeof *kLayout == 30);
 void AppendPlace(CTextWriter& result, const CRecord& record, const Place& place) {
   if (place.field >= 0) {
     const std::string_view amount = record.Text(place.field);
-    if (place.field == kAmountPN && amount.find('&') != std::string_view::npos) {
+    if (place.field == kFigurePN && amount.find('&') != std::string_view::npos) {
       result.AppendText(amount);
     } else {
       result.Append(WIRE("%ld"), ScaleAmount(amount, place.decimals));

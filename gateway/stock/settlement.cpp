@@ -39,19 +39,19 @@ enum Field {
   kStockCode,
   kQuantity47,
   kPrice48,
-  kAmount49,
-  kAmount79,
-  kAmount78,
-  kAmount84,
-  kAmount81,
-  kAmount82,
-  kAmount85,
-  kAmount87,
-  kAmount86,
-  kAmount89,
-  kAmount88,
+  kFigure49,
+  kFigure79,
+  kFigure78,
+  kFigure84,
+  kFigure81,
+  kFigure82,
+  kFigure85,
+  kFigure87,
+  kFigure86,
+  kFigure89,
+  kFigure88,
   kSign,
-  kAmount97,
+  kFigure97,
   kTypeText
 };
 
@@ -59,11 +59,11 @@ constexpr TagRow kRows[] = {
     {kSequence, "67", 20},      {kResultCode, "68", 20},     {kMessage, "M2", kRecord},
     {kDate50, "50", kRecord},   {kOrderKind, "27", kRecord}, {kTradeType, "28", kRecord},
     {kSide, "32", kRecord},     {kStockCode, "29", kRecord}, {kQuantity47, "47", kRecord},
-    {kPrice48, "48", kRecord},  {kAmount49, "49", kRecord},  {kAmount79, "79", kRecord},
-    {kAmount78, "78", kRecord}, {kAmount84, "84", kRecord},  {kAmount81, "81", kRecord},
-    {kAmount82, "82", kRecord}, {kAmount85, "85", kRecord},  {kAmount87, "87", kRecord},
-    {kAmount86, "86", kRecord}, {kAmount89, "89", kRecord},  {kAmount88, "88", kRecord},
-    {kSign, "96", kRecord},     {kAmount97, "97", kRecord},  {kTypeText, "KT", kRecord}};
+    {kPrice48, "48", kRecord},  {kFigure49, "49", kRecord},  {kFigure79, "79", kRecord},
+    {kFigure78, "78", kRecord}, {kFigure84, "84", kRecord},  {kFigure81, "81", kRecord},
+    {kFigure82, "82", kRecord}, {kFigure85, "85", kRecord},  {kFigure87, "87", kRecord},
+    {kFigure86, "86", kRecord}, {kFigure89, "89", kRecord},  {kFigure88, "88", kRecord},
+    {kSign, "96", kRecord},     {kFigure97, "97", kRecord},  {kTypeText, "KT", kRecord}};
 constexpr CListTable kTags(kRows, kStockList);
 
 // Kinds from 5 on, without regard to trade type and side: `code` is the first kind's, and the
@@ -120,12 +120,12 @@ bool AppendPayment(CResultText& list, const CRecord& record, const PaymentLayout
     list.Append(WIRE("%d"), typeCode);
   }
   list.Append(WIRE("@%s@%s@%d@%s@%s@%s@%s@"), record.Text(kStockCode), record.Text(kQuantity47),
-              ScalePrice(record.Text(kPrice48), 2), record.Text(kAmount49), record.Text(kAmount79),
-              record.Text(kAmount78), record.Text(kAmount84));
+              ScalePrice(record.Text(kPrice48), 2), record.Text(kFigure49), record.Text(kFigure79),
+              record.Text(kFigure78), record.Text(kFigure84));
   AppendPair(list, record, layout.pairs, record.Number(layout.selector));
-  list.Append(WIRE("%s@%s@%s@%s@%s!"), TextOrZero(record, kAmount86), TextOrZero(record, kAmount89),
-              TextOrZero(record, kAmount88), record.Text(kSign) == "-" ? "-" : "",
-              record.Text(kAmount97));
+  list.Append(WIRE("%s@%s@%s@%s@%s!"), TextOrZero(record, kFigure86), TextOrZero(record, kFigure89),
+              TextOrZero(record, kFigure88), record.Text(kSign) == "-" ? "-" : "",
+              record.Text(kFigure97));
   return true;
 }
 
@@ -170,7 +170,7 @@ char* CGatewayStk::PaymentDecode(const char* reply, int* status) {
   static constexpr PaymentLayout kLayout = {
       false,
       kOrderKind,
-      {{SetOf(1, 3), kAmount81, kAmount82}, {SetOf(2, 4), kAmount85, kAmount87}}};
+      {{SetOf(1, 3), kFigure81, kFigure82}, {SetOf(2, 4), kFigure85, kFigure87}}};
   return ListPayments(*this, reply, kLayout, status);
 }
 
@@ -178,6 +178,6 @@ char* CGatewayStk::PaymentDecodeJZG(const char* reply, int* status) {
   static constexpr PaymentLayout kLayout = {
       true,
       kTypeText,
-      {{SetOf(1, 12, 13), kAmount81, kAmount82}, {SetOf(2, 21, 22), kAmount85, kAmount87}}};
+      {{SetOf(1, 12, 13), kFigure81, kFigure82}, {SetOf(2, 21, 22), kFigure85, kFigure87}}};
   return ListPayments(*this, reply, kLayout, status);
 }

@@ -1307,17 +1307,17 @@ public final class gatewayjni {
      * <li>stock code</li>
      * <li>quantity in tag 47</li>
      * <li>price in tag 48</li>
-     * <li>settlement amount 49</li>
-     * <li>settlement amount 79</li>
-     * <li>settlement amount 78</li>
-     * <li>settlement amount 84</li>
-     * <li>amount 81 or 85, by the order kind, or 0</li>
-     * <li>amount 82 or 87 likewise, or 0</li>
-     * <li>settlement amount 86; 0 when absent</li>
-     * <li>settlement amount 89; 0 when absent</li>
-     * <li>settlement amount 88; 0 when absent</li>
+     * <li>settlement figure in tag 49</li>
+     * <li>settlement figure in tag 79</li>
+     * <li>settlement figure in tag 78</li>
+     * <li>settlement figure in tag 84</li>
+     * <li>figure 81 or 85, by the order kind, or 0</li>
+     * <li>figure 82 or 87 likewise, or 0</li>
+     * <li>settlement figure in tag 86; 0 when absent</li>
+     * <li>settlement figure in tag 89; 0 when absent</li>
+     * <li>settlement figure in tag 88; 0 when absent</li>
      * <li>sign: {@code -} or empty</li>
-     * <li>settlement amount 97</li>
+     * <li>settlement figure in tag 97</li>
      * </ol>
      *
      * <p>Nothing to show (code 5001) reads {@code 0!}.
@@ -1343,17 +1343,17 @@ public final class gatewayjni {
      * <li>stock code</li>
      * <li>quantity in tag 47</li>
      * <li>price in tag 48</li>
-     * <li>settlement amount 49</li>
-     * <li>settlement amount 79</li>
-     * <li>settlement amount 78</li>
-     * <li>settlement amount 84</li>
-     * <li>amount 81 or 85, by tag KT, or 0</li>
-     * <li>amount 82 or 87 likewise, or 0</li>
-     * <li>settlement amount 86; 0 when absent</li>
-     * <li>settlement amount 89; 0 when absent</li>
-     * <li>settlement amount 88; 0 when absent</li>
+     * <li>settlement figure in tag 49</li>
+     * <li>settlement figure in tag 79</li>
+     * <li>settlement figure in tag 78</li>
+     * <li>settlement figure in tag 84</li>
+     * <li>figure 81 or 85, by tag KT, or 0</li>
+     * <li>figure 82 or 87 likewise, or 0</li>
+     * <li>settlement figure in tag 86; 0 when absent</li>
+     * <li>settlement figure in tag 89; 0 when absent</li>
+     * <li>settlement figure in tag 88; 0 when absent</li>
      * <li>sign: {@code -} or empty</li>
-     * <li>settlement amount 97</li>
+     * <li>settlement figure in tag 97</li>
      * </ol>
      *
      * <p>Nothing to show (code 5001) reads {@code 0!}.
@@ -1745,35 +1745,35 @@ public final class gatewayjni {
      * <ol start="0">
      * <li>currency, always TWD</li>
      * <li>always empty</li>
-     * <li>margin amount LO with two decimals</li>
+     * <li>margin figure in tag LO with two decimals</li>
      * <li>always empty</li>
-     * <li>margin amount PN</li>
-     * <li>margin amount RA</li>
-     * <li>margin amount LO</li>
-     * <li>margin amount QY</li>
+     * <li>margin figure in tag PN</li>
+     * <li>margin figure in tag RA</li>
+     * <li>margin figure in tag LO</li>
+     * <li>margin figure in tag QY</li>
      * <li>always empty</li>
-     * <li>margin amount QX</li>
+     * <li>margin figure in tag QX</li>
      * <li>always empty</li>
-     * <li>margin amount U5</li>
-     * <li>always empty</li>
-     * <li>always empty</li>
-     * <li>always empty</li>
-     * <li>always empty</li>
-     * <li>margin amount U9</li>
-     * <li>margin amount U5 again</li>
+     * <li>margin figure in tag U5</li>
      * <li>always empty</li>
      * <li>always empty</li>
      * <li>always empty</li>
      * <li>always empty</li>
-     * <li>margin amount RF</li>
+     * <li>margin figure in tag U9</li>
+     * <li>margin figure in tag U5 again</li>
      * <li>always empty</li>
      * <li>always empty</li>
      * <li>always empty</li>
      * <li>always empty</li>
-     * <li>margin amount F0</li>
-     * <li>margin amount F1</li>
-     * <li>margin amount F2</li>
-     * <li>margin amount F3</li>
+     * <li>margin figure in tag RF</li>
+     * <li>always empty</li>
+     * <li>always empty</li>
+     * <li>always empty</li>
+     * <li>always empty</li>
+     * <li>margin figure in tag F0</li>
+     * <li>margin figure in tag F1</li>
+     * <li>margin figure in tag F2</li>
+     * <li>margin figure in tag F3</li>
      * <li>always empty</li>
      * </ol>
      *

@@ -12,81 +12,81 @@ public final class MarginAccount extends Row<MarginAccount> {
             new Column<MarginAccount, Code<Currency>>(0, "currency", Form.code(Currency.values()),
                     "", "currency, always TWD");
 
-    /** Margin amount LO with two decimals. */
-    public static final Column<MarginAccount, BigDecimal> AMOUNT_LO_HUNDREDTHS =
-            new Column<MarginAccount, BigDecimal>(1, "amountLOHundredths", Form.HUNDREDTHS, "LO",
-                    "margin amount LO with two decimals");
+    /** Margin figure in tag LO with two decimals. */
+    public static final Column<MarginAccount, BigDecimal> FIGURE_LO_HUNDREDTHS =
+            new Column<MarginAccount, BigDecimal>(1, "figureLOHundredths", Form.HUNDREDTHS, "LO",
+                    "margin figure in tag LO with two decimals");
 
-    /** Margin amount PN. */
-    public static final Column<MarginAccount, BigDecimal> AMOUNT_PN =
-            new Column<MarginAccount, BigDecimal>(2, "amountPN", Form.AMOUNT_OR_TEXT, "PN",
-                    "margin amount PN");
+    /** Margin figure in tag PN. */
+    public static final Column<MarginAccount, BigDecimal> FIGURE_PN =
+            new Column<MarginAccount, BigDecimal>(2, "figurePN", Form.AMOUNT_OR_TEXT, "PN",
+                    "margin figure in tag PN");
 
-    /** Margin amount RA. */
-    public static final Column<MarginAccount, BigDecimal> AMOUNT_RA =
-            new Column<MarginAccount, BigDecimal>(3, "amountRA", Form.TEN_THOUSANDTHS, "RA",
-                    "margin amount RA");
+    /** Margin figure in tag RA. */
+    public static final Column<MarginAccount, BigDecimal> FIGURE_RA =
+            new Column<MarginAccount, BigDecimal>(3, "figureRA", Form.TEN_THOUSANDTHS, "RA",
+                    "margin figure in tag RA");
 
-    /** Margin amount LO. */
-    public static final Column<MarginAccount, BigDecimal> AMOUNT_LO =
-            new Column<MarginAccount, BigDecimal>(4, "amountLO", Form.TEN_THOUSANDTHS, "LO",
-                    "margin amount LO");
+    /** Margin figure in tag LO. */
+    public static final Column<MarginAccount, BigDecimal> FIGURE_LO =
+            new Column<MarginAccount, BigDecimal>(4, "figureLO", Form.TEN_THOUSANDTHS, "LO",
+                    "margin figure in tag LO");
 
-    /** Margin amount QY. */
-    public static final Column<MarginAccount, BigDecimal> AMOUNT_QY =
-            new Column<MarginAccount, BigDecimal>(5, "amountQY", Form.TEN_THOUSANDTHS, "QY",
-                    "margin amount QY");
+    /** Margin figure in tag QY. */
+    public static final Column<MarginAccount, BigDecimal> FIGURE_QY =
+            new Column<MarginAccount, BigDecimal>(5, "figureQY", Form.TEN_THOUSANDTHS, "QY",
+                    "margin figure in tag QY");
 
-    /** Margin amount QX. */
-    public static final Column<MarginAccount, BigDecimal> AMOUNT_QX =
-            new Column<MarginAccount, BigDecimal>(6, "amountQX", Form.TEN_THOUSANDTHS, "QX",
-                    "margin amount QX");
+    /** Margin figure in tag QX. */
+    public static final Column<MarginAccount, BigDecimal> FIGURE_QX =
+            new Column<MarginAccount, BigDecimal>(6, "figureQX", Form.TEN_THOUSANDTHS, "QX",
+                    "margin figure in tag QX");
 
-    /** Margin amount U5. */
-    public static final Column<MarginAccount, BigDecimal> AMOUNT_U5 =
-            new Column<MarginAccount, BigDecimal>(7, "amountU5", Form.TEN_THOUSANDTHS, "U5",
-                    "margin amount U5");
+    /** Margin figure in tag U5. */
+    public static final Column<MarginAccount, BigDecimal> FIGURE_U5 =
+            new Column<MarginAccount, BigDecimal>(7, "figureU5", Form.TEN_THOUSANDTHS, "U5",
+                    "margin figure in tag U5");
 
-    /** Margin amount U9. */
-    public static final Column<MarginAccount, BigDecimal> AMOUNT_U9 =
-            new Column<MarginAccount, BigDecimal>(8, "amountU9", Form.TEN_THOUSANDTHS, "U9",
-                    "margin amount U9");
+    /** Margin figure in tag U9. */
+    public static final Column<MarginAccount, BigDecimal> FIGURE_U9 =
+            new Column<MarginAccount, BigDecimal>(8, "figureU9", Form.TEN_THOUSANDTHS, "U9",
+                    "margin figure in tag U9");
 
-    /** Margin amount U5 again. */
-    public static final Column<MarginAccount, BigDecimal> AMOUNT_U5_REPEATED =
-            new Column<MarginAccount, BigDecimal>(9, "amountU5Repeated", Form.TEN_THOUSANDTHS, "U5",
-                    "margin amount U5 again");
+    /** Margin figure in tag U5 again. */
+    public static final Column<MarginAccount, BigDecimal> FIGURE_U5_REPEATED =
+            new Column<MarginAccount, BigDecimal>(9, "figureU5Repeated", Form.TEN_THOUSANDTHS, "U5",
+                    "margin figure in tag U5 again");
 
-    /** Margin amount RF. */
-    public static final Column<MarginAccount, BigDecimal> AMOUNT_RF =
-            new Column<MarginAccount, BigDecimal>(10, "amountRF", Form.TEN_THOUSANDTHS, "RF",
-                    "margin amount RF");
+    /** Margin figure in tag RF. */
+    public static final Column<MarginAccount, BigDecimal> FIGURE_RF =
+            new Column<MarginAccount, BigDecimal>(10, "figureRF", Form.TEN_THOUSANDTHS, "RF",
+                    "margin figure in tag RF");
 
-    /** Margin amount F0. */
-    public static final Column<MarginAccount, BigDecimal> AMOUNT_F0 =
-            new Column<MarginAccount, BigDecimal>(11, "amountF0", Form.TEN_THOUSANDTHS, "F0",
-                    "margin amount F0");
+    /** Margin figure in tag F0. */
+    public static final Column<MarginAccount, BigDecimal> FIGURE_F0 =
+            new Column<MarginAccount, BigDecimal>(11, "figureF0", Form.TEN_THOUSANDTHS, "F0",
+                    "margin figure in tag F0");
 
-    /** Margin amount F1. */
-    public static final Column<MarginAccount, BigDecimal> AMOUNT_F1 =
-            new Column<MarginAccount, BigDecimal>(12, "amountF1", Form.TEN_THOUSANDTHS, "F1",
-                    "margin amount F1");
+    /** Margin figure in tag F1. */
+    public static final Column<MarginAccount, BigDecimal> FIGURE_F1 =
+            new Column<MarginAccount, BigDecimal>(12, "figureF1", Form.TEN_THOUSANDTHS, "F1",
+                    "margin figure in tag F1");
 
-    /** Margin amount F2. */
-    public static final Column<MarginAccount, BigDecimal> AMOUNT_F2 =
-            new Column<MarginAccount, BigDecimal>(13, "amountF2", Form.TEN_THOUSANDTHS, "F2",
-                    "margin amount F2");
+    /** Margin figure in tag F2. */
+    public static final Column<MarginAccount, BigDecimal> FIGURE_F2 =
+            new Column<MarginAccount, BigDecimal>(13, "figureF2", Form.TEN_THOUSANDTHS, "F2",
+                    "margin figure in tag F2");
 
-    /** Margin amount F3. */
-    public static final Column<MarginAccount, BigDecimal> AMOUNT_F3 =
-            new Column<MarginAccount, BigDecimal>(14, "amountF3", Form.TEN_THOUSANDTHS, "F3",
-                    "margin amount F3");
+    /** Margin figure in tag F3. */
+    public static final Column<MarginAccount, BigDecimal> FIGURE_F3 =
+            new Column<MarginAccount, BigDecimal>(14, "figureF3", Form.TEN_THOUSANDTHS, "F3",
+                    "margin figure in tag F3");
 
     static final Shape<MarginAccount> SHAPE = new Shape<MarginAccount>("margin account",
             "0@@1@@2@3@4@5@@6@@7@@@@@8@9@@@@@10@@@@@11@12@13@14@",
-            CURRENCY, AMOUNT_LO_HUNDREDTHS, AMOUNT_PN, AMOUNT_RA, AMOUNT_LO, AMOUNT_QY, AMOUNT_QX,
-            AMOUNT_U5, AMOUNT_U9, AMOUNT_U5_REPEATED, AMOUNT_RF, AMOUNT_F0, AMOUNT_F1, AMOUNT_F2,
-            AMOUNT_F3) {
+            CURRENCY, FIGURE_LO_HUNDREDTHS, FIGURE_PN, FIGURE_RA, FIGURE_LO, FIGURE_QY, FIGURE_QX,
+            FIGURE_U5, FIGURE_U9, FIGURE_U5_REPEATED, FIGURE_RF, FIGURE_F0, FIGURE_F1, FIGURE_F2,
+            FIGURE_F3) {
         @Override
         MarginAccount row(String text, int start, int end) {
             return new MarginAccount(this, text, start, end);
@@ -103,87 +103,87 @@ public final class MarginAccount extends Row<MarginAccount> {
         return get(CURRENCY);
     }
 
-    /** Margin amount LO with two decimals; null when there is none. */
+    /** Margin figure in tag LO with two decimals; null when there is none. */
     @Nullable
-    public BigDecimal amountLOHundredths() {
-        return get(AMOUNT_LO_HUNDREDTHS);
+    public BigDecimal figureLOHundredths() {
+        return get(FIGURE_LO_HUNDREDTHS);
     }
 
-    /** Margin amount PN; null when there is none. */
+    /** Margin figure in tag PN; null when there is none. */
     @Nullable
-    public BigDecimal amountPN() {
-        return get(AMOUNT_PN);
+    public BigDecimal figurePN() {
+        return get(FIGURE_PN);
     }
 
-    /** Margin amount RA; null when there is none. */
+    /** Margin figure in tag RA; null when there is none. */
     @Nullable
-    public BigDecimal amountRA() {
-        return get(AMOUNT_RA);
+    public BigDecimal figureRA() {
+        return get(FIGURE_RA);
     }
 
-    /** Margin amount LO; null when there is none. */
+    /** Margin figure in tag LO; null when there is none. */
     @Nullable
-    public BigDecimal amountLO() {
-        return get(AMOUNT_LO);
+    public BigDecimal figureLO() {
+        return get(FIGURE_LO);
     }
 
-    /** Margin amount QY; null when there is none. */
+    /** Margin figure in tag QY; null when there is none. */
     @Nullable
-    public BigDecimal amountQY() {
-        return get(AMOUNT_QY);
+    public BigDecimal figureQY() {
+        return get(FIGURE_QY);
     }
 
-    /** Margin amount QX; null when there is none. */
+    /** Margin figure in tag QX; null when there is none. */
     @Nullable
-    public BigDecimal amountQX() {
-        return get(AMOUNT_QX);
+    public BigDecimal figureQX() {
+        return get(FIGURE_QX);
     }
 
-    /** Margin amount U5; null when there is none. */
+    /** Margin figure in tag U5; null when there is none. */
     @Nullable
-    public BigDecimal amountU5() {
-        return get(AMOUNT_U5);
+    public BigDecimal figureU5() {
+        return get(FIGURE_U5);
     }
 
-    /** Margin amount U9; null when there is none. */
+    /** Margin figure in tag U9; null when there is none. */
     @Nullable
-    public BigDecimal amountU9() {
-        return get(AMOUNT_U9);
+    public BigDecimal figureU9() {
+        return get(FIGURE_U9);
     }
 
-    /** Margin amount U5 again; null when there is none. */
+    /** Margin figure in tag U5 again; null when there is none. */
     @Nullable
-    public BigDecimal amountU5Repeated() {
-        return get(AMOUNT_U5_REPEATED);
+    public BigDecimal figureU5Repeated() {
+        return get(FIGURE_U5_REPEATED);
     }
 
-    /** Margin amount RF; null when there is none. */
+    /** Margin figure in tag RF; null when there is none. */
     @Nullable
-    public BigDecimal amountRF() {
-        return get(AMOUNT_RF);
+    public BigDecimal figureRF() {
+        return get(FIGURE_RF);
     }
 
-    /** Margin amount F0; null when there is none. */
+    /** Margin figure in tag F0; null when there is none. */
     @Nullable
-    public BigDecimal amountF0() {
-        return get(AMOUNT_F0);
+    public BigDecimal figureF0() {
+        return get(FIGURE_F0);
     }
 
-    /** Margin amount F1; null when there is none. */
+    /** Margin figure in tag F1; null when there is none. */
     @Nullable
-    public BigDecimal amountF1() {
-        return get(AMOUNT_F1);
+    public BigDecimal figureF1() {
+        return get(FIGURE_F1);
     }
 
-    /** Margin amount F2; null when there is none. */
+    /** Margin figure in tag F2; null when there is none. */
     @Nullable
-    public BigDecimal amountF2() {
-        return get(AMOUNT_F2);
+    public BigDecimal figureF2() {
+        return get(FIGURE_F2);
     }
 
-    /** Margin amount F3; null when there is none. */
+    /** Margin figure in tag F3; null when there is none. */
     @Nullable
-    public BigDecimal amountF3() {
-        return get(AMOUNT_F3);
+    public BigDecimal figureF3() {
+        return get(FIGURE_F3);
     }
 }

@@ -30,59 +30,59 @@ public final class SettledTrade extends Row<SettledTrade> {
             new Column<SettledTrade, BigDecimal>(4, "price48", Form.HUNDREDTHS, "48",
                     "price in tag 48");
 
-    /** Settlement amount 49. */
-    public static final Column<SettledTrade, BigDecimal> AMOUNT49 =
-            new Column<SettledTrade, BigDecimal>(5, "amount49", Form.NUMBER, "49",
-                    "settlement amount 49");
+    /** Settlement figure in tag 49. */
+    public static final Column<SettledTrade, BigDecimal> FIGURE49 =
+            new Column<SettledTrade, BigDecimal>(5, "figure49", Form.NUMBER, "49",
+                    "settlement figure in tag 49");
 
-    /** Settlement amount 79. */
-    public static final Column<SettledTrade, BigDecimal> AMOUNT79 =
-            new Column<SettledTrade, BigDecimal>(6, "amount79", Form.NUMBER, "79",
-                    "settlement amount 79");
+    /** Settlement figure in tag 79. */
+    public static final Column<SettledTrade, BigDecimal> FIGURE79 =
+            new Column<SettledTrade, BigDecimal>(6, "figure79", Form.NUMBER, "79",
+                    "settlement figure in tag 79");
 
-    /** Settlement amount 78. */
-    public static final Column<SettledTrade, BigDecimal> AMOUNT78 =
-            new Column<SettledTrade, BigDecimal>(7, "amount78", Form.NUMBER, "78",
-                    "settlement amount 78");
+    /** Settlement figure in tag 78. */
+    public static final Column<SettledTrade, BigDecimal> FIGURE78 =
+            new Column<SettledTrade, BigDecimal>(7, "figure78", Form.NUMBER, "78",
+                    "settlement figure in tag 78");
 
-    /** Settlement amount 84. */
-    public static final Column<SettledTrade, BigDecimal> AMOUNT84 =
-            new Column<SettledTrade, BigDecimal>(8, "amount84", Form.NUMBER, "84",
-                    "settlement amount 84");
+    /** Settlement figure in tag 84. */
+    public static final Column<SettledTrade, BigDecimal> FIGURE84 =
+            new Column<SettledTrade, BigDecimal>(8, "figure84", Form.NUMBER, "84",
+                    "settlement figure in tag 84");
 
-    /** Amount 81 or 85, by the order kind, or 0. */
+    /** Figure 81 or 85, by the order kind, or 0. */
     public static final Column<SettledTrade, BigDecimal> PAIR_FIRST =
             new Column<SettledTrade, BigDecimal>(9, "pairFirst", Form.NUMBER, "27 81 85",
-                    "amount 81 or 85, by the order kind, or 0");
+                    "figure 81 or 85, by the order kind, or 0");
 
-    /** Amount 82 or 87 likewise, or 0. */
+    /** Figure 82 or 87 likewise, or 0. */
     public static final Column<SettledTrade, BigDecimal> PAIR_SECOND =
             new Column<SettledTrade, BigDecimal>(10, "pairSecond", Form.NUMBER, "27 82 87",
-                    "amount 82 or 87 likewise, or 0");
+                    "figure 82 or 87 likewise, or 0");
 
-    /** Settlement amount 86; 0 when absent. */
-    public static final Column<SettledTrade, BigDecimal> AMOUNT86 =
-            new Column<SettledTrade, BigDecimal>(11, "amount86", Form.NUMBER, "86",
-                    "settlement amount 86; 0 when absent");
+    /** Settlement figure in tag 86; 0 when absent. */
+    public static final Column<SettledTrade, BigDecimal> FIGURE86 =
+            new Column<SettledTrade, BigDecimal>(11, "figure86", Form.NUMBER, "86",
+                    "settlement figure in tag 86; 0 when absent");
 
-    /** Settlement amount 89; 0 when absent. */
-    public static final Column<SettledTrade, BigDecimal> AMOUNT89 =
-            new Column<SettledTrade, BigDecimal>(12, "amount89", Form.NUMBER, "89",
-                    "settlement amount 89; 0 when absent");
+    /** Settlement figure in tag 89; 0 when absent. */
+    public static final Column<SettledTrade, BigDecimal> FIGURE89 =
+            new Column<SettledTrade, BigDecimal>(12, "figure89", Form.NUMBER, "89",
+                    "settlement figure in tag 89; 0 when absent");
 
-    /** Settlement amount 88; 0 when absent. */
-    public static final Column<SettledTrade, BigDecimal> AMOUNT88 =
-            new Column<SettledTrade, BigDecimal>(13, "amount88", Form.NUMBER, "88",
-                    "settlement amount 88; 0 when absent");
+    /** Settlement figure in tag 88; 0 when absent. */
+    public static final Column<SettledTrade, BigDecimal> FIGURE88 =
+            new Column<SettledTrade, BigDecimal>(13, "figure88", Form.NUMBER, "88",
+                    "settlement figure in tag 88; 0 when absent");
 
     /** Sign: {@code -} or empty. */
     public static final Column<SettledTrade, String> SIGN =
             new Column<SettledTrade, String>(14, "sign", Form.TEXT, "96", "sign: `-` or empty");
 
-    /** Settlement amount 97. */
-    public static final Column<SettledTrade, BigDecimal> AMOUNT97 =
-            new Column<SettledTrade, BigDecimal>(15, "amount97", Form.NUMBER, "97",
-                    "settlement amount 97");
+    /** Settlement figure in tag 97. */
+    public static final Column<SettledTrade, BigDecimal> FIGURE97 =
+            new Column<SettledTrade, BigDecimal>(15, "figure97", Form.NUMBER, "97",
+                    "settlement figure in tag 97");
 
     /** Type of the trade, as the brokerage says it. */
     public static final Column<SettledTrade, String> TYPE_TEXT =
@@ -91,8 +91,8 @@ public final class SettledTrade extends Row<SettledTrade> {
 
     static final Shape<SettledTrade> SHAPE = new Shape<SettledTrade>("settled trade",
             "0@@1@2@3@4@5@6@7@8@9@10@11@12@13@14@15",
-            DATE50, TYPE, STOCK_CODE, QUANTITY47, PRICE48, AMOUNT49, AMOUNT79, AMOUNT78, AMOUNT84,
-            PAIR_FIRST, PAIR_SECOND, AMOUNT86, AMOUNT89, AMOUNT88, SIGN, AMOUNT97, TYPE_TEXT) {
+            DATE50, TYPE, STOCK_CODE, QUANTITY47, PRICE48, FIGURE49, FIGURE79, FIGURE78, FIGURE84,
+            PAIR_FIRST, PAIR_SECOND, FIGURE86, FIGURE89, FIGURE88, SIGN, FIGURE97, TYPE_TEXT) {
         @Override
         SettledTrade row(String text, int start, int end) {
             return new SettledTrade(this, text, start, end);
@@ -102,8 +102,8 @@ public final class SettledTrade extends Row<SettledTrade> {
 
     static final Shape<SettledTrade> SHAPE_JZG = new Shape<SettledTrade>("settled trade",
             "0@@16@2@3@4@5@6@7@8@9@10@11@12@13@14@15",
-            DATE50, TYPE, STOCK_CODE, QUANTITY47, PRICE48, AMOUNT49, AMOUNT79, AMOUNT78, AMOUNT84,
-            PAIR_FIRST, PAIR_SECOND, AMOUNT86, AMOUNT89, AMOUNT88, SIGN, AMOUNT97, TYPE_TEXT) {
+            DATE50, TYPE, STOCK_CODE, QUANTITY47, PRICE48, FIGURE49, FIGURE79, FIGURE78, FIGURE84,
+            PAIR_FIRST, PAIR_SECOND, FIGURE86, FIGURE89, FIGURE88, SIGN, FIGURE97, TYPE_TEXT) {
         @Override
         SettledTrade row(String text, int start, int end) {
             return new SettledTrade(this, text, start, end);
@@ -144,58 +144,58 @@ public final class SettledTrade extends Row<SettledTrade> {
         return get(PRICE48);
     }
 
-    /** Settlement amount 49; null when there is none. */
+    /** Settlement figure in tag 49; null when there is none. */
     @Nullable
-    public BigDecimal amount49() {
-        return get(AMOUNT49);
+    public BigDecimal figure49() {
+        return get(FIGURE49);
     }
 
-    /** Settlement amount 79; null when there is none. */
+    /** Settlement figure in tag 79; null when there is none. */
     @Nullable
-    public BigDecimal amount79() {
-        return get(AMOUNT79);
+    public BigDecimal figure79() {
+        return get(FIGURE79);
     }
 
-    /** Settlement amount 78; null when there is none. */
+    /** Settlement figure in tag 78; null when there is none. */
     @Nullable
-    public BigDecimal amount78() {
-        return get(AMOUNT78);
+    public BigDecimal figure78() {
+        return get(FIGURE78);
     }
 
-    /** Settlement amount 84; null when there is none. */
+    /** Settlement figure in tag 84; null when there is none. */
     @Nullable
-    public BigDecimal amount84() {
-        return get(AMOUNT84);
+    public BigDecimal figure84() {
+        return get(FIGURE84);
     }
 
-    /** Amount 81 or 85, by the order kind, or 0; null when there is none. */
+    /** Figure 81 or 85, by the order kind, or 0; null when there is none. */
     @Nullable
     public BigDecimal pairFirst() {
         return get(PAIR_FIRST);
     }
 
-    /** Amount 82 or 87 likewise, or 0; null when there is none. */
+    /** Figure 82 or 87 likewise, or 0; null when there is none. */
     @Nullable
     public BigDecimal pairSecond() {
         return get(PAIR_SECOND);
     }
 
-    /** Settlement amount 86; 0 when absent; null when there is none. */
+    /** Settlement figure in tag 86; 0 when absent; null when there is none. */
     @Nullable
-    public BigDecimal amount86() {
-        return get(AMOUNT86);
+    public BigDecimal figure86() {
+        return get(FIGURE86);
     }
 
-    /** Settlement amount 89; 0 when absent; null when there is none. */
+    /** Settlement figure in tag 89; 0 when absent; null when there is none. */
     @Nullable
-    public BigDecimal amount89() {
-        return get(AMOUNT89);
+    public BigDecimal figure89() {
+        return get(FIGURE89);
     }
 
-    /** Settlement amount 88; 0 when absent; null when there is none. */
+    /** Settlement figure in tag 88; 0 when absent; null when there is none. */
     @Nullable
-    public BigDecimal amount88() {
-        return get(AMOUNT88);
+    public BigDecimal figure88() {
+        return get(FIGURE88);
     }
 
     /** Sign: {@code -} or empty; empty when there is none. */
@@ -204,10 +204,10 @@ public final class SettledTrade extends Row<SettledTrade> {
         return string(SIGN);
     }
 
-    /** Settlement amount 97; null when there is none. */
+    /** Settlement figure in tag 97; null when there is none. */
     @Nullable
-    public BigDecimal amount97() {
-        return get(AMOUNT97);
+    public BigDecimal figure97() {
+        return get(FIGURE97);
     }
 
     /** Type of the trade, as the brokerage says it; empty when there is none. */

@@ -26,8 +26,8 @@ final class DemoStockLists {
     };
     private static final Column<?, ?>[] SETTLED = {
         SettledTrade.DATE50, SettledTrade.TYPE, SettledTrade.STOCK_CODE, SettledTrade.QUANTITY47,
-        SettledTrade.PRICE48, SettledTrade.AMOUNT49, SettledTrade.AMOUNT79, SettledTrade.AMOUNT78,
-        SettledTrade.SIGN, SettledTrade.AMOUNT97,
+        SettledTrade.PRICE48, SettledTrade.FIGURE49, SettledTrade.FIGURE79, SettledTrade.FIGURE78,
+        SettledTrade.SIGN, SettledTrade.FIGURE97,
     };
     private static final Column<?, ?>[] SETTLED_JZG = SETTLED.clone();
 

@@ -109,7 +109,7 @@ final class OutcomesTest {
         assertEquals(new BigDecimal("1"),
                 balance.read("|68=0000|00=1|68=0000|PN=1|01=").orThrow().bankBalance());
         MarginAccount margin = futures().margin().read("|68=0000|00=1|LO=12.5|01=").orThrow();
-        assertEquals(new BigDecimal("12.50"), margin.amountLOHundredths());
+        assertEquals(new BigDecimal("12.50"), margin.figureLOHundredths());
         assertEquals(Currency.TWD, margin.currency().value());
         assertEquals("5001", balance.read("|68=5001|M2=|00=1|68=5001|01=").failure().code());
     }

@@ -95,11 +95,11 @@ class ResultTextTest {
                 + "@@@@@1@2@3@4@!";
         MarginAccount margin = (MarginAccount) clean(Operation.QUERY_FINANCE_DECODE, text)
                 .sections().get(0).rows().get(0);
-        assertEquals(new BigDecimal("12.50"), margin.amountLOHundredths());
-        assertEquals(new BigDecimal("12.5000"), margin.amountLO());
-        assertEquals("a&b", margin.text(MarginAccount.AMOUNT_PN));
-        assertThrows(MalformedValueException.class, margin::amountPN);
-        assertEquals(new BigDecimal("0.0004"), margin.amountF3());
+        assertEquals(new BigDecimal("12.50"), margin.figureLOHundredths());
+        assertEquals(new BigDecimal("12.5000"), margin.figureLO());
+        assertEquals("a&b", margin.text(MarginAccount.FIGURE_PN));
+        assertThrows(MalformedValueException.class, margin::figurePN);
+        assertEquals(new BigDecimal("0.0004"), margin.figureF3());
     }
 
     @Test
