@@ -8,12 +8,37 @@ import com.brindlex.kernel.quorvane.client.RawRequest;
 import com.brindlex.kernel.quorvane.client.Session;
 import com.brindlex.kernel.quorvane.client.TradeDate;
 import java.util.ArrayList;
+import java.util.LinkedHashMap;
 import java.util.List;
 import java.util.Map;
 import java.util.function.UnaryOperator;
 
 /** Requests whose arguments people write, as options or in a form. */
 public final class WrittenRequest {
+    /** Says at which argument a value was written that nobody understands, and why. */
+    public static final class NotUnderstood extends IllegalArgumentException {
+        private static final long serialVersionUID = 1;
+
+        private final String argument;
+        private final String reason;
+
+        NotUnderstood(String argument, String reason) {
+            super(argument + " " + reason);
+            this.argument = argument;
+            this.reason = reason;
+        }
+
+        /** The argument by its name. */
+        public String argument() {
+            return argument;
+        }
+
+        /** Why its value is none. */
+        public String reason() {
+            return reason;
+        }
+    }
+
     private WrittenRequest() {}
 
     /** All arguments of a native but the status array. */
@@ -27,12 +52,29 @@ public final class WrittenRequest {
     }
 
     /**
-     * The request of what was written.
+     * What the natives take for what was written: {@code BUY} is B, 600.5 is 60050 hundredths,
+     * 2026-11-21 is 1151121. What they take already stays as it is.
      *
      * @param texts the text of an argument by its name
+     * @throws NotUnderstood when a text is none for its argument
+     */
+    public static Map<String, String> understood(Operation operation,
+            UnaryOperator<String> texts) {
+        Map<String, String> values = new LinkedHashMap<>();
+        for (Argument argument : arguments(operation)) {
+            values.put(argument.name(), WrittenValue.of(operation, argument.name(), texts));
+        }
+        return values;
+    }
+
+    /**
+     * The request of what was written.
+     *
+     * @param written the text of an argument by its name
      * @throws IllegalArgumentException with the reason, when a text is none for its argument
      */
-    public static RawRequest of(Operation operation, UnaryOperator<String> texts) {
+    public static RawRequest of(Operation operation, UnaryOperator<String> written) {
+        UnaryOperator<String> texts = understood(operation, written)::get;
         List<Argument> device = Operation.sessionArguments();
         Session session = Session.of(text(texts, device.get(3)), text(texts, device.get(4)))
                                   .withMarket(Market.of(number(texts, device.get(0))))

@@ -1,8 +1,10 @@
 package com.brindlex.kernel.quorvane.console.command;
 
+import com.brindlex.kernel.quorvane.client.Argument;
 import com.brindlex.kernel.quorvane.client.InvalidRequestException;
 import com.brindlex.kernel.quorvane.client.Operation;
 import com.brindlex.kernel.quorvane.client.Problem;
+import com.brindlex.kernel.quorvane.console.WrittenRequest;
 import java.util.LinkedHashMap;
 import java.util.List;
 import java.util.Map;
@@ -28,6 +30,11 @@ final class EncodeCommand implements Callable<Integer> {
         CommandSpec all = CommandSpec.create().name("encode");
         all.mixinStandardHelpOptions(true);
         all.usageMessage().description("Builds a request and writes it.");
+        all.usageMessage().footer("", "Values are written as people write them: --side BUY, "
+                + "--price 600.5 (without a point it counts hundredths, for futures "
+                + "ten-thousandths), --date 2026-11-21, --quantity '2 lots'.",
+                "Passwords that are not given are asked for, without showing them; where there is "
+                + "no terminal, and for '-', each is a line of the standard input.");
         all.usageMessage().customSynopsis(
                 "quorvane encode OPERATION [--json] [OPTION VALUE]...",
                 "       quorvane encode OPERATION --help");
@@ -50,7 +57,9 @@ final class EncodeCommand implements Callable<Integer> {
         map.put("operation", operation.method());
         try {
             ParseResult parsed = spec.commandLine().getParseResult();
-            String request = Options.request(operation, parsed).build().text();
+            Map<String, String> passwords = passwords(parsed);
+            String request = WrittenRequest.of(operation, name -> passwords.containsKey(name)
+                    ? passwords.get(name) : Options.written(parsed, name)).build().text();
             map.put("request", request);
             if (!terminal.isJson()) {
                 terminal.raw(request);
@@ -68,5 +77,25 @@ final class EncodeCommand implements Callable<Integer> {
             terminal.json(map);
         }
         return map.containsKey("request") ? 0 : 1;
+    }
+
+    /** The passwords that were not given, or given as {@code -}: asked for, else read by lines. */
+    private Map<String, String> passwords(ParseResult parsed) {
+        Map<String, String> passwords = new LinkedHashMap<>();
+        for (Argument argument : Options.all(operation)) {
+            String written = Options.isPassword(argument)
+                    ? Options.written(parsed, argument.name()) : "";
+            if (written == null || Options.isPassword(argument) && written.equals("-")) {
+                boolean prompt = written == null && System.console() != null;
+                String password = prompt ? Terminal.prompt(argument.purpose())
+                                         : Terminal.readLine();
+                if (password == null) {
+                    throw new IllegalArgumentException(argument.name()
+                            + " must be given: at the prompt, or as a line of the standard input");
+                }
+                passwords.put(argument.name(), password);
+            }
+        }
+        return passwords;
     }
 }

@@ -5,6 +5,7 @@ import com.brindlex.kernel.quorvane.client.Operation;
 import com.brindlex.kernel.quorvane.client.RawRequest;
 import com.brindlex.kernel.quorvane.console.WrittenRequest;
 import java.util.List;
+import java.util.Locale;
 import java.util.Map;
 import picocli.CommandLine.Model.CommandSpec;
 import picocli.CommandLine.Model.OptionSpec;
@@ -27,12 +28,17 @@ final class Options {
                     OptionSpec.builder("--" + dashed(argument.name()))
                             .type(String.class)
                             .paramLabel(argument.type().name().replaceFirst(".*_", ""))
-                            .required(given == null)
+                            .required(given == null && !isPassword(argument))
                             .description(argument.purpose() + (given == null || given.isBlank()
                                             ? "" : "; usually " + given.replace("%", "%%")));
             spec.addOption(given == null ? option.build() : option.defaultValue(given).build());
         }
         return spec;
+    }
+
+    /** Whether it stays off the command line, where everybody on the machine reads it. */
+    static boolean isPassword(Argument argument) {
+        return argument.name().toLowerCase(Locale.ROOT).endsWith("password");
     }
 
     /** {@code stockCode} is the option {@code --stock-code}. */
@@ -46,8 +52,18 @@ final class Options {
      * @throws IllegalArgumentException with the reason, when a value is none for its argument
      */
     static RawRequest request(Operation operation, ParseResult parsed) {
-        return WrittenRequest.of(operation,
-                name -> parsed.commandSpec().findOption("--" + dashed(name)).getValue());
+        return WrittenRequest.of(operation, name -> {
+            String written = written(parsed, name);
+            if (written == null) {
+                throw new IllegalArgumentException(name + " must be given");
+            }
+            return written;
+        });
+    }
+
+    /** What was written for an argument; null when nothing was. */
+    static String written(ParseResult parsed, String name) {
+        return parsed.commandSpec().findOption("--" + dashed(name)).getValue();
     }
 
     /** All arguments of a native but the status array. */

@@ -3,6 +3,7 @@ package com.brindlex.kernel.quorvane.console.command;
 import com.brindlex.kernel.quorvane.console.Json;
 import com.brindlex.kernel.quorvane.console.Screen.Style;
 import com.brindlex.kernel.quorvane.console.Screen;
+import java.io.ByteArrayOutputStream;
 import java.io.IOException;
 import java.io.PrintStream;
 import java.nio.charset.StandardCharsets;
@@ -56,6 +57,30 @@ final class Terminal {
 
     void error(String text) {
         err.println(screen.styled(Style.BAD, text));
+    }
+
+    /** Asks for a text that is not shown; null when the terminal is gone. */
+    static String prompt(String purpose) {
+        char[] typed = System.console().readPassword("%s: ", purpose);
+        return typed == null ? null : new String(typed);
+    }
+
+    /** A line of the standard input, no byte more; null at its end. */
+    static String readLine() {
+        ByteArrayOutputStream line = new ByteArrayOutputStream();
+        try {
+            int next = System.in.read();
+            if (next < 0) {
+                return null;
+            }
+            for (; next >= 0 && next != '\n'; next = System.in.read()) {
+                line.write(next);
+            }
+        } catch (IOException broken) {
+            return null;
+        }
+        String text = line.toString(StandardCharsets.UTF_8);
+        return text.endsWith("\r") ? text.substring(0, text.length() - 1) : text;
     }
 
     /** Reads a whole file, or the standard input for {@code -}. */

@@ -2,6 +2,7 @@ package com.brindlex.kernel.quorvane.console.dictionary;
 
 import java.util.List;
 import java.util.Map;
+import java.util.Set;
 
 /**
  * A table of codes.
@@ -9,6 +10,9 @@ import java.util.Map;
  * @param values its rows; the first that fits decides
  */
 public record CodeTable(String name, String title, String note, List<Code> values) {
+    private static final Set<String> CLOSED = Set.of("sides", "callPut", "orderKinds",
+            "tradeTypes", "priceKinds", "stockFunctions", "futuresFunctions");
+
     /**
      * One code.
      *
@@ -21,6 +25,11 @@ public record CodeTable(String name, String title, String note, List<Code> value
      */
     public record Code(String code, String name, String label, String wire,
             Map<String, String> from, String only, boolean listsOnly) {}
+
+    /** Whether it names every code there is; the others name some of many. */
+    public boolean isClosed() {
+        return CLOSED.contains(name);
+    }
 
     /** The row of a code; null when there is none. */
     public Code find(String code) {

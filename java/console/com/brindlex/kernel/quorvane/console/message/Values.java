@@ -7,14 +7,9 @@ import com.brindlex.kernel.quorvane.console.message.Binding.Bound;
 import java.nio.charset.StandardCharsets;
 import java.util.Base64;
 import java.util.List;
-import java.util.Set;
 
 /** Holds each value of a request against its argument, its conversion and its codes. */
 final class Values {
-    /** Tables that name every code there is; the others name some of many. */
-    private static final Set<String> CLOSED = Set.of("sides", "callPut", "orderKinds",
-            "tradeTypes", "priceKinds", "stockFunctions", "futuresFunctions");
-
     private static final String NO_PRICE = "00000000.000000";
     private static final String OF_ONE_OR_TWO_BYTES = "====";
     private static final int SERIAL = 20;
@@ -116,7 +111,7 @@ final class Values {
     }
 
     private void code(Bound value, Argument argument) {
-        if (argument.codes() == null || !CLOSED.contains(argument.codes())) {
+        if (argument.codes() == null || !dictionary.codes(argument.codes()).isClosed()) {
             return;
         }
         String wire = value.wire();

@@ -56,6 +56,8 @@ final class SessionPlace {
             value.put("result", ReplyValues.of(RawReply.of(decoder, Market.SECURITIES, reply)));
         } catch (InvalidRequestException refused) {
             value.put("problems", TryPlace.problems(refused));
+        } catch (WrittenRequest.NotUnderstood refused) {
+            value.put("problems", TryPlace.problems(refused));
         }
         return value;
     }

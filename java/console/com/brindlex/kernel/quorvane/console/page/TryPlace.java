@@ -96,14 +96,18 @@ final class TryPlace {
         Operation operation = operation(texts);
         Map<String, Object> value = new LinkedHashMap<>();
         try {
-            String request = WrittenRequest.of(operation, name -> text(texts, name)).build().text();
+            Map<String, String> understood =
+                    WrittenRequest.understood(operation, name -> text(texts, name));
+            value.put("copies", Copies.of(operation, understood));
+            String request = WrittenRequest.of(operation, understood::get).build().text();
             Message message = MessageReader.read(request);
             value.put("text", request);
             value.put("message", TakenApart.of(message, message.faults()));
         } catch (InvalidRequestException refused) {
             value.put("problems", problems(refused));
+        } catch (WrittenRequest.NotUnderstood refused) {
+            value.put("problems", problems(refused));
         }
-        value.put("copies", Copies.of(operation, texts));
         return value;
     }
 
@@ -111,6 +115,11 @@ final class TryPlace {
     static List<Map<String, String>> problems(InvalidRequestException refused) {
         return refused.problems().stream().map(each -> Map.of(
                 "argument", each.argument(), "reason", each.reason())).toList();
+    }
+
+    /** Why a value is not understood, at its argument. */
+    static List<Map<String, String>> problems(WrittenRequest.NotUnderstood refused) {
+        return List.of(Map.of("argument", refused.argument(), "reason", refused.reason()));
     }
 
     /** What was written for an argument. */

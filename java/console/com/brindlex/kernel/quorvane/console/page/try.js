@@ -86,7 +86,9 @@ function showResult(value) {
   if (value.text) {
     parts.push(bytes(value.text));
   }
-  parts.push(copyButtons(value.copies));
+  if (value.copies) {
+    parts.push(copyButtons(value.copies));
+  }
   byId('try-result').replaceChildren(...parts);
   bringIntoView(byId('try-result'));
 }

@@ -14,7 +14,10 @@ import java.io.PrintWriter;
 import java.io.StringWriter;
 import java.nio.charset.StandardCharsets;
 import java.util.ArrayList;
+import java.util.LinkedHashMap;
 import java.util.List;
+import java.util.Map;
+import java.util.stream.Stream;
 import org.junit.jupiter.api.Test;
 import picocli.CommandLine;
 
@@ -92,6 +95,88 @@ class QuorvaneTest {
         assertEquals(0, login.code, login.err);
         assertTrue(login.out.startsWith("F=7|KIND=S|BHNO=9A01|CB=1|IP=10.0.0.1|"), login.out);
         assertTrue(login.out.endsWith("|PWD=pass1234|FUNC=0|01=\n"), login.out);
+    }
+
+    private static Run order(String... more) {
+        Map<String, String> options = new LinkedHashMap<>(
+                Map.of("--stock-code", "2330", "--quantity", "2", "--side", "B"));
+        for (int i = 0; i < more.length; i += 2) {
+            options.put(more[i], more[i + 1]);
+        }
+        String[] all = options.entrySet().stream()
+                               .flatMap(each -> Stream.of(each.getKey(), each.getValue()))
+                               .toArray(String[]::new);
+        return run("", words("encode", "SubmitOrderEncode", DEVICE, USER, all));
+    }
+
+    /** A request without what its time makes of it. */
+    private static String untimed(Run run) {
+        assertEquals(0, run.code, run.err);
+        return run.out.replaceAll("(?<=\\|(?:65|22|23)=)[0-9]+", "").replaceAll("!!.*", "");
+    }
+
+    @Test
+    void valuesAreWrittenAsPeopleWriteThem() {
+        String plain = untimed(order("--price", "60050", "--order-date", "1151121"));
+        assertTrue(plain.contains("|32=B|"), plain);
+        assertEquals(plain, untimed(order("--price", "600.5", "--order-date", "2026-11-21")));
+        for (String side : new String[] {"BUY", "buy", "b", "B"}) {
+            assertEquals(plain, untimed(order("--price", "600.50", "--order-date", "2026/11/21",
+                    "--side", side, "--quantity", "2 lots")));
+        }
+        String sold = untimed(order("--price", "1005.0", "--side", "SELL", "--quantity", "1,000"));
+        assertEquals(untimed(order("--price", "100500", "--side", "S", "--quantity", "1000")),
+                sold);
+        String up = untimed(order("--price-kind", "LIMIT_UP"));
+        assertEquals(untimed(order("--price-kind", "9")), up);
+        String odd = untimed(order("--trade-type", "odd-lot", "--quantity", "500 shares"));
+        assertEquals(untimed(order("--trade-type", "2", "--quantity", "500")), odd);
+    }
+
+    @Test
+    void futuresPricesHaveFourDecimals() {
+        String[] order = {"--commodity1", "TXF", "--month1", "202612", "--order-kind", "futures",
+            "--side1", "sell", "--quantity", "2 contracts", "--price"};
+        Run plain = run("", words("encode", "FutSubmitOrderEncode", DEVICE, USER, order,
+                new String[] {"180005000"}));
+        Run written = run("", words("encode", "FutSubmitOrderEncode", DEVICE, USER, order,
+                new String[] {"18000.5"}));
+        assertEquals(untimed(plain), untimed(written));
+    }
+
+    @Test
+    void whatIsNotUnderstoodIsRefusedAtItsArgument() {
+        String[][] wrong = {
+            {"--side", "HOLD", "side must be B (BUY), S (SELL), not 'HOLD'"},
+            {"--side", "X", "side must be B (BUY), S (SELL), not 'X'"},
+            {"--price", "600.505", "price must have at most 2 decimals, not '600.505'"},
+            {"--price", "cheap", "price must be an amount such as 600.5"},
+            {"--order-date", "2026-02-30", "orderDate must be a day of the calendar"},
+            {"--order-date", "1151341", "orderDate must be a day such as 2026-11-21"},
+            {"--quantity", "500 shares", "quantity is counted in lots here, not '500 shares'"},
+            {"--quantity", "many", "quantity must be a whole number, not 'many'"},
+            {"--price-kind", "MARKET", "priceKind must be 0 (LIMIT), 1 (LIMIT_DOWN)"},
+        };
+        for (String[] each : wrong) {
+            Run refused = order(each[0], each[1]);
+            assertEquals(2, refused.code, each[2]);
+            assertTrue(refused.err.contains(each[2]), refused.err);
+        }
+    }
+
+    @Test
+    void passwordsComeFromTheStandardInput() {
+        String[] user = {"--branch", "9A01", "--identity", "A123456789&1234567"};
+        Run read = run("secret1\nsecret2\n",
+                words("encode", "ChangePasswordEncode", DEVICE, user));
+        assertEquals(0, read.code, read.err);
+        assertTrue(read.out.contains("secret1") && read.out.contains("secret2"), read.out);
+        Run one = run("secret2\r\n", words("encode", "ChangePasswordEncode", DEVICE, USER,
+                new String[] {"--new-password", "-"}));
+        assertTrue(one.out.contains("=pass1234|") && one.out.contains("=secret2|"), one.out);
+        Run none = run("", words("encode", "AuthEncode", DEVICE, user));
+        assertEquals(2, none.code);
+        assertTrue(none.err.contains("password must be given"), none.err);
     }
 
     @Test

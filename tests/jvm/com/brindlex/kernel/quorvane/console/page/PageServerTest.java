@@ -5,6 +5,7 @@ import static org.junit.jupiter.api.Assertions.assertFalse;
 import static org.junit.jupiter.api.Assertions.assertThrows;
 import static org.junit.jupiter.api.Assertions.assertTrue;
 
+import com.google.gson.JsonElement;
 import com.google.gson.JsonObject;
 import com.google.gson.JsonParser;
 import java.io.IOException;
@@ -143,6 +144,37 @@ class PageServerTest {
         assertEquals(400, ask("POST", "api/encode", most).status());
         assertEquals(413, ask("POST", "api/encode", most + "x").status());
         assertEquals(200, ask("POST", "api/log?from=paste", most + "x").status());
+    }
+
+    /** What the page answers to the form of an order as it opens, with one value changed. */
+    private JsonObject order(String argument, String value) throws IOException {
+        JsonObject asked = new JsonObject();
+        for (JsonElement each : JsonParser.parseString(ask("GET", "api/forms", "").body())
+                                        .getAsJsonArray()) {
+            JsonObject form = each.getAsJsonObject();
+            if (form.get("name").getAsString().equals("SubmitOrderEncode")) {
+                form.getAsJsonArray("inputs").forEach(input -> asked.add(
+                        input.getAsJsonObject().get("name").getAsString(),
+                        input.getAsJsonObject().get("usual")));
+            }
+        }
+        asked.addProperty("operation", "SubmitOrderEncode");
+        asked.addProperty(argument, value);
+        return ask("POST", "api/encode", asked.toString()).json();
+    }
+
+    @Test
+    void formsTakeValuesAsPeopleWriteThem() throws IOException {
+        JsonObject sent = order("price", "600.5");
+        assertTrue(sent.has("text"), sent.toString());
+        String java = sent.getAsJsonObject("copies").get("java").getAsString();
+        assertTrue(java.contains(".set(\"price\", \"60050\")"), java);
+        JsonObject refused = order("price", "600.505");
+        assertFalse(refused.has("text"), refused.toString());
+        JsonObject problem = refused.getAsJsonArray("problems").get(0).getAsJsonObject();
+        assertEquals("price", problem.get("argument").getAsString());
+        assertEquals("must have at most 2 decimals, not '600.505'",
+                problem.get("reason").getAsString());
     }
 
     @ParameterizedTest
