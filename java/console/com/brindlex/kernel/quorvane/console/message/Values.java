@@ -7,9 +7,11 @@ import com.brindlex.kernel.quorvane.console.message.Binding.Bound;
 import java.nio.charset.StandardCharsets;
 import java.util.Base64;
 import java.util.List;
+import java.util.regex.Pattern;
 
 /** Holds each value of a request against its argument, its conversion and its codes. */
 final class Values {
+    private static final Pattern BETWEEN_DIGITS = Pattern.compile("(?<=[0-9])[-/.](?=[0-9])");
     private static final String NO_PRICE = "00000000.000000";
     private static final String OF_ONE_OR_TWO_BYTES = "====";
     private static final int SERIAL = 20;
@@ -208,7 +210,7 @@ final class Values {
     }
 
     private void date(Bound value, String wire) {
-        String digits = wire.replaceAll("(?<=[0-9])[-/.](?=[0-9])", "");
+        String digits = BETWEEN_DIGITS.matcher(wire).replaceAll("");
         require(Days.date(digits) != null, value, "impossible-date", "is no date");
     }
 
