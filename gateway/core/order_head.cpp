@@ -116,7 +116,7 @@ OrderKey CGatewayPub::KeyOf(OrderHead head, char function, const OrderOrigin& or
 void OrderKey::AppendTo(CTextWriter& text) const {
   if (head == OrderHead::kPlain) {
     text.Append(WIRE("%s_%s_%s_%c"), origin.branch, identity.second, identity.first, function);
-  } else if (head == OrderHead::kSigned) {
+  } else {
     text.Append(WIRE("%s%s,%s,%04d%02d%02d,%s-%s,%s,%c"), device.serialNo, device.serialTail,
                 device.address, stamp.year, stamp.month, stamp.day, origin.branch, identity.second,
                 identity.first, function);

@@ -59,7 +59,7 @@ struct OrderKey {
   // The brief header goes without an address.
   bool HasAddress() const { return head == OrderHead::kBrief || !device.address.empty(); }
 
-  // Appends the key of its header; nothing where the header has none.
+  // Appends the key of its header. REQUIRES a header that has one: kPlain or kSigned.
   void AppendTo(CTextWriter& text) const;
 };
 

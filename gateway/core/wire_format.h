@@ -42,7 +42,7 @@ constexpr WireMark ReadMark(std::string_view format, size_t& at) {
   while (at < format.size() && format[at] != '%') ++at;
   mark.literalSize = at - mark.literalAt;
   if (at == format.size()) return mark;
-  for (++at; format[at] >= '0' && format[at] <= '9'; ++at) {
+  for (++at; format[at] <= '9'; ++at) {
     mark.width = mark.width * 10 + static_cast<size_t>(format[at] - '0');
   }
   mark.kind = format[at];
@@ -76,12 +76,15 @@ inline std::string_view AsText(std::string_view text) {
   return text;
 }
 
+// Not null even for no characters: memcpy takes none.
+inline WireValue MakeTextValue(std::string_view text) {
+  return {static_cast<int64_t>(text.size()), text.empty() ? "" : text.data()};
+}
+
 template <char kKind, class Value>
 WireValue MakeWireValue(const Value& value) {
   if constexpr (kKind == 's') {
-    const std::string_view text = AsText(value);
-    // Not null even for no characters: memcpy takes none.
-    return {static_cast<int64_t>(text.size()), text.empty() ? "" : text.data()};
+    return MakeTextValue(AsText(value));
   } else {
     static_assert(kKind != 'c' || std::is_same_v<Value, char>, "%c takes a char");
     static_assert(kKind != 'd' || std::is_same_v<Value, int> || std::is_same_v<Value, uint8_t>,

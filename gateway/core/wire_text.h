@@ -102,10 +102,10 @@ class CWireText {
   static bool WriteMark(char*& at, const WireValue& value) {
     constexpr WireMark kMark = kWireMarks<Format>[kAt];
     WriteLiteral<Format, kAt>(at);
-    if (kMark.kind == 's') {
+    if constexpr (kMark.kind == 's') {
       memcpy(at, value.text, static_cast<size_t>(value.number));
       at += value.number;
-    } else if (kMark.kind == 'c') {
+    } else if constexpr (kMark.kind == 'c') {
       if (Rarely(value.number == 0)) return false;
       *at++ = static_cast<char>(value.number);
     } else {

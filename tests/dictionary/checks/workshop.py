@@ -12,7 +12,7 @@ from generator import load
 
 TOP = load.FOLDER.parent
 PARTS = ["gateway", "jni", "host/include", "dictionary", "docs", "tests/support",
-         "tests/dictionary", "tests/vectors", "java"]
+         "tests/dictionary", "tests/fuzz", "tests/vectors", "java"]
 COMPILE = ["-std=c++17", "-O0", "-fPIC", "-fvisibility=hidden", "-I.", "-Ihost/include"]
 
 
@@ -23,7 +23,7 @@ class Workshop:
         self.top = Path(tempfile.mkdtemp(prefix="dictionary-"))
         for part in PARTS:
             shutil.copytree(TOP / part, self.top / part,
-                            ignore=shutil.ignore_patterns("__pycache__"))
+                            ignore=shutil.ignore_patterns("__pycache__", "corpus"))
         self.objects = {}
         self.java = _java_home()
         return self
