@@ -172,9 +172,11 @@ jstring Decode(JNIEnv* env, char* (Gateway::*method)(const char*, int*), jstring
   }
 #define WITHOUT_PARENTHESES(...) __VA_ARGS__
 
+// NOLINTBEGIN(bugprone-macro-parentheses): a member is pointed to by its name alone
 #define DECODER(operation, method)                                                   \
   GATEWAY_EXPORT(operation)(JNIEnv * env, jclass, jstring reply, jintArray status) { \
     return Decode(env, &method, reply, status);                                      \
   }
+// NOLINTEND(bugprone-macro-parentheses)
 
 #endif  // QUORVANE_JNI_ENTRY_FRAME_H_

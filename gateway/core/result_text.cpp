@@ -25,8 +25,8 @@ void AppendHeapText(const HeapText& owner, const char* text, int length, bool re
     owner.length = 0;
     memset(owner.data, 0, static_cast<size_t>(owner.size));
   }
-  const auto size = static_cast<size_t>(owner.size);
-  const size_t used = owner.data == nullptr ? 0 : strnlen(owner.data, size);
+  const size_t size = owner.data == nullptr ? 0 : static_cast<size_t>(owner.size);
+  const size_t used = size == 0 ? 0 : strnlen(owner.data, size);
   const size_t needed = used + added.size();
   if (needed >= size) {
     char* const block = Allocate(needed + kSlack);

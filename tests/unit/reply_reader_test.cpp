@@ -122,7 +122,8 @@ TEST(ReplyReader, FullTableFindsEachOfItsTagsAndNoOther) {
   std::string known;
   for (int row = 0; row < kFull; ++row) {
     EXPECT_EQ(kFullTable.Find(KeyOf(TagOfFullTable(row) + "=1")), row);
-    EXPECT_EQ(kFullTable.Skips() >> row & 1, row == 0 || row == 32 || row == kFull - 1 ? 1U : 0U) << row;
+    EXPECT_EQ(kFullTable.Skips() >> row & 1, row == 0 || row == 32 || row == kFull - 1 ? 1U : 0U)
+        << row;
     known += "|" + TagOfFullTable(row) + "|";
   }
   for (int first = 1; first < 256; ++first) {
