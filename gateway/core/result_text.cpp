@@ -76,8 +76,8 @@ bool CResultText::MakeRoom(size_t count) {
   if (m_bFailed) return false;
   const size_t used = Length();
   const size_t needed = kOpeningRoom + used + count + 1;
-  const size_t wanted = (needed > m_nExpected ? needed : m_nExpected) + kSlack;
-  const size_t size = wanted < INT32_MAX ? wanted : INT32_MAX;
+  const uint64_t wanted = (needed > m_nExpected ? needed : m_nExpected) + kSlack;
+  const size_t size = wanted < INT32_MAX ? static_cast<size_t>(wanted) : INT32_MAX;
   char* const block = needed <= size ? Allocate(size) : nullptr;
   if (block == nullptr) {
     m_bFailed = true;
@@ -85,9 +85,9 @@ bool CResultText::MakeRoom(size_t count) {
     return false;
   }
   char* const records = block + kOpeningRoom;
-  if (used > 0) memcpy(records, m_pRecords, used);
+  memcpy(records, m_pRecords, used);
   Adopt(m_owner, block, size);
-  m_nExpected = size < INT32_MAX / 8 ? 8 * size : INT32_MAX;
+  m_nExpected = uint64_t{8} * size;
   m_pRecords = records;
   m_pAt = records + used;
   m_pEnd = block + size - 1;

@@ -46,7 +46,7 @@ class CResultText : public CWireText {
   bool MakeRoom(size_t count) override;
 
   HeapText m_owner;
-  size_t m_nExpected;
+  uint64_t m_nExpected;
   char* m_pRecords;
   char m_cNoRoom = '\0';  // what the text points to before its first allocation; never written
   bool m_bFailed = false;

@@ -254,6 +254,17 @@ TEST_F(HeapTexts, ListThatOutgrowsALargeExpectationIsWhole) {
   EXPECT_EQ(result.substr(1 + 2 * kHalf), "bc!");
 }
 
+TEST_F(HeapTexts, ListThatOutgrowsItsExpectationTakesEightTimesAsMuchOnce) {
+  CResultText list(Owner(), 10000);
+  list.AppendText("a");
+  const int first = m_gateway.m_nDataSize;
+  EXPECT_GE(first, 10000);
+  EXPECT_LT(first, 15000);
+  list.AppendText(std::string(static_cast<size_t>(first), 'b'));
+  EXPECT_GE(m_gateway.m_nDataSize, 8 * first);
+  EXPECT_LT(m_gateway.m_nDataSize, 9 * first);
+}
+
 // The last size that an int holds is a block's, its terminator and the list's opening included.
 TEST_F(HeapTexts, SizesUpToWhatAnIntHoldsAreServedAndNoMore) {
   EXPECT_EQ(RenewHeapText(Owner(), INT32_MAX), nullptr);
