@@ -1,10 +1,12 @@
 #include "android/log.h"
 
 #include <errno.h>
-#include <pthread.h>
+#include <sched.h>
 #include <stdio.h>
 #include <stdlib.h>
 #include <string.h>
+
+#include <atomic>
 
 namespace {
 
@@ -27,7 +29,9 @@ struct Filters {
 };
 
 Filters g_filters = {nullptr, {}, 0, ANDROID_LOG_SILENT};
-pthread_once_t g_once = PTHREAD_ONCE_INIT;
+
+enum { kUnread, kBeingRead, kRead };
+std::atomic<int> g_state = {kUnread};
 
 // The priority that stands behind a filter's colon; what is no priority asks for nothing.
 int PriorityOf(char letter) {
@@ -61,6 +65,18 @@ void ReadFilters() {
   }
 }
 
+// Reads the filters at the first call. Not by pthread_once: that of glibc 2.34 is not found by the
+// C libraries before it, where the library is to be loaded too.
+void Ready() {
+  int state = g_state.load(std::memory_order_acquire);
+  if (state == kRead) return;
+  if (state == kUnread && g_state.compare_exchange_strong(state, kBeingRead)) {
+    ReadFilters();
+    g_state.store(kRead, std::memory_order_release);
+  }
+  while (g_state.load(std::memory_order_acquire) != kRead) sched_yield();
+}
+
 // The lowest priority to write under `tag`: that of its own last filter, else of the last `*`.
 int LowestFor(const char* tag) {
   const size_t length = strlen(tag);
@@ -81,7 +97,7 @@ int LowestFor(const char* tag) {
 
 __attribute__((visibility("default"))) int __android_log_write(int prio, const char* tag,
                                                                const char* text) {
-  pthread_once(&g_once, ReadFilters);
+  Ready();
   if (prio < g_filters.lowest || prio >= ANDROID_LOG_SILENT) return -EPERM;
   if (tag == nullptr) tag = "";
   if (prio < LowestFor(tag)) return -EPERM;

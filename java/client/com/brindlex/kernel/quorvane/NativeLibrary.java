@@ -1,11 +1,16 @@
 package com.brindlex.kernel.quorvane;
 
+import java.io.File;
 import org.jetbrains.annotations.NotNull;
 import org.jetbrains.annotations.Nullable;
 
 /**
  * Brings {@code libquorvane.so} in: the one place that loads it, once, at the first call of a
  * native or when {@link #load} is called. May be used by several threads at once.
+ *
+ * <p>It is found where the virtual machine looks for libraries: in the app on a device, in the
+ * folder that {@code -Djava.library.path} names on a plain machine. When it is not there, a plain
+ * machine takes the one that {@code quorvane-host.jar} brings on the class path.
  *
  * <p>An app that loads its libraries by a helper of its own gives it before the first call: {@code
  * NativeLibrary.use(name -> ReLinker.loadLibrary(context, name))}.
@@ -22,6 +27,9 @@ public final class NativeLibrary {
     }
 
     private static final String NAME = "quorvane";
+
+    /** The loader of quorvane-host.jar, which no app carries. */
+    private static final String HOST_LOADER = "com.brindlex.kernel.quorvane.host.HostLibrary";
 
     private static Loader loader;
     private static boolean loaded;
@@ -44,7 +52,7 @@ public final class NativeLibrary {
         }
         try {
             if (loader == null) {
-                System.loadLibrary(NAME);
+                find();
             } else {
                 loader.load(NAME);
             }
@@ -56,11 +64,47 @@ public final class NativeLibrary {
         loaded = true;
     }
 
+    private static void find() {
+        try {
+            System.loadLibrary(NAME);
+        } catch (UnsatisfiedLinkError refused) {
+            Loader host = isOnDevice() || isInLibraryPath() ? null : hostLoader();
+            if (host == null) {
+                throw refused;
+            }
+            host.load(NAME);
+        }
+    }
+
+    private static boolean isOnDevice() {
+        return "Dalvik".equals(System.getProperty("java.vm.name"));
+    }
+
+    /** A library that somebody put there and that cannot be loaded is not passed over. */
+    private static boolean isInLibraryPath() {
+        String folders = System.getProperty("java.library.path", "");
+        for (String folder : folders.split(File.pathSeparator)) {
+            if (new File(folder, System.mapLibraryName(NAME)).exists()) {
+                return true;
+            }
+        }
+        return false;
+    }
+
+    @Nullable
+    private static Loader hostLoader() {
+        try {
+            return (Loader) Class.forName(HOST_LOADER).getDeclaredConstructor().newInstance();
+        } catch (ReflectiveOperationException absent) {
+            return null;
+        }
+    }
+
     private static String advice(String reason) {
         return System.mapLibraryName(NAME) + " cannot be loaded (" + reason + "). On Android the"
                 + " app must carry it for the ABI of the device; on a plain machine"
-                + " -Djava.library.path must name its folder. NativeLibrary.use(...) takes another"
-                + " loader.";
+                + " quorvane-host.jar brings it on the class path, or -Djava.library.path names its"
+                + " folder. NativeLibrary.use(...) takes another loader.";
     }
 
     /** Whether the library is loaded or can be. */

@@ -1,0 +1,73 @@
+package com.brindlex.kernel.quorvane.host;
+
+import java.io.File;
+import java.io.IOException;
+import java.io.InputStream;
+import java.net.URL;
+import java.net.URLConnection;
+import java.nio.file.Files;
+import java.nio.file.Path;
+import java.nio.file.Paths;
+import java.util.concurrent.TimeUnit;
+
+/** A file of a jar, unpacked into a new folder of its own that only this user may enter. */
+final class Unpacked {
+    private static final String PREFIX = "quorvane-host-";
+
+    /** What is older was left by a process that ended while it loaded, or by Windows. */
+    private static final long LEFT_BEHIND = TimeUnit.DAYS.toMillis(1);
+
+    private Unpacked() {}
+
+    /**
+     * Unpacks a file into the temporary folder.
+     *
+     * @throws UnsatisfiedLinkError when it cannot be written, with what to do
+     */
+    static Path of(URL packed, String name) {
+        String temporary = System.getProperty("java.io.tmpdir");
+        Path folder = null;
+        try {
+            removeLeftBehind(new File(temporary), name);
+            folder = Files.createTempDirectory(Paths.get(temporary), PREFIX);
+            Path file = folder.resolve(name);
+            copy(packed, file);
+            return file;
+        } catch (IOException refused) {
+            if (folder != null) {
+                remove(folder.resolve(name));
+            }
+            throw new UnsatisfiedLinkError("quorvane-host cannot unpack its library into the folder "
+                    + temporary + " (" + refused + "); -Djava.io.tmpdir names another");
+        }
+    }
+
+    /** Another class loader may close the jar under a cached connection. */
+    private static void copy(URL packed, Path file) throws IOException {
+        URLConnection connection = packed.openConnection();
+        connection.setUseCaches(false);
+        try (InputStream in = connection.getInputStream()) {
+            Files.copy(in, file);
+        }
+    }
+
+    /** Removes the file and its folder; what a system does not give back yet is removed later. */
+    static void remove(Path file) {
+        // not File.deleteOnExit: Windows holds a loaded library until the process is gone
+        if (file.toFile().delete() || !Files.exists(file)) {
+            file.getParent().toFile().delete();
+        }
+    }
+
+    private static void removeLeftBehind(File temporary, String name) {
+        File[] folders = temporary.listFiles((in, folder) -> folder.startsWith(PREFIX));
+        if (folders == null) {
+            return;
+        }
+        for (File folder : folders) {
+            if (folder.lastModified() < System.currentTimeMillis() - LEFT_BEHIND) {
+                remove(folder.toPath().resolve(name));
+            }
+        }
+    }
+}
