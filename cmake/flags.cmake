@@ -39,6 +39,17 @@ if(QUORVANE_SANITIZE)
   target_compile_options(quorvane_library_flags INTERFACE -O1)
 endif()
 
+# Landing pads and signed return addresses, each where the machine has them; no frame that skips the
+# page behind the stack. scripts/check-binary looks what became of it.
+include(CheckCXXCompilerFlag)
+foreach(flag -fcf-protection=full -mbranch-protection=standard -fstack-clash-protection)
+  string(MAKE_C_IDENTIFIER "takes${flag}" takes)
+  check_cxx_compiler_flag("-Werror ${flag}" ${takes})
+  if(${takes})
+    target_compile_options(quorvane_library_flags INTERFACE ${flag})
+  endif()
+endforeach()
+
 # Test programs take far longer to optimize than they run; fuzz targets run for hours.
 add_library(quorvane_test_flags INTERFACE)
 target_link_libraries(quorvane_test_flags INTERFACE quorvane_flags)

@@ -1,11 +1,26 @@
 // A library with one sound export; each macro adds one fault that scripts/check-binary must see.
 #include <stdlib.h>
+#include <string.h>
 
 #define EXPORT extern "C" __attribute__((visibility("default")))
+#ifndef FAULT_PAD
+#define NO_PAD
+#elif defined __aarch64__
+#define NO_PAD __attribute__((target("branch-protection=none")))
+#else
+#define NO_PAD __attribute__((nocf_check))
+#endif
 
-EXPORT void* Java_com_brindlex_kernel_quorvane_gatewayjni_AuthDecode() {
+EXPORT NO_PAD void* Java_com_brindlex_kernel_quorvane_gatewayjni_AuthDecode() {
   static void* (*volatile allocate)(size_t) = malloc;  // one relocated word
   return allocate(1);
+}
+
+// A buffer that may overflow, as far as the compiler sees: a stack protector, a fortified call.
+EXPORT int Java_com_brindlex_kernel_quorvane_gatewayjni_AuthEncode(const char* text, size_t size) {
+  char copy[16];
+  memcpy(copy, text, size);
+  return copy[0];
 }
 
 #ifdef FAULT_EXPORT
@@ -15,7 +30,7 @@ EXPORT void helper() {}
 EXPORT void Java_com_brindlex_kernel_quorvane_gatewayjni_Unknown() {}
 #endif
 #ifdef FAULT_CALL
-EXPORT int Java_com_brindlex_kernel_quorvane_gatewayjni_AuthEncode() {
+EXPORT int Java_com_brindlex_kernel_quorvane_gatewayjni_PaymentDecode() {
   return system("");
 }
 #endif
