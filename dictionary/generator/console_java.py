@@ -15,30 +15,30 @@ package com.brindlex.kernel.quorvane.console;
 final class Dictionary {{
     /** By scene: tags with what each is called. */
     static final String[][] TAGS = {{
-{_rows(_tags(whole))}    }};
+{rows(_tags(whole))}    }};
 
     /** By scene: its operations. */
     static final String[][] SCENES = {{
-{_rows(_scenes(whole))}    }};
+{rows(_scenes(whole))}    }};
 
     /** By scene: the functions of its queries. */
     static final String[][] QUERIES = {{
-{_rows(_queries(whole))}    }};
+{rows(_queries(whole))}    }};
 
     /** By operation: what it refuses with. */
     static final String[][] REFUSALS = {{
-{_rows(_refusals(whole))}    }};
+{rows(_refusals(whole))}    }};
 
     /** The messages that the library makes itself, without their source, in English. */
     static final String[][] MESSAGES = {{
-{_rows(_messages(whole))}    }};
+{rows(_messages(whole))}    }};
 
     private Dictionary() {{}}
 }}
 """}
 
 
-def _rows(rows):
+def rows(rows):
     out = []
     for row in rows:
         text = "{" + ", ".join(map(words.java_string, row)) + "},"

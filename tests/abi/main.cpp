@@ -1,8 +1,8 @@
 // abi_digest [--without-log] DIRECTORY [CALLS]: plays the golden cases of a directory and a drawn
-// load of CALLS calls for each export, and prints one digest for each export and one over all: every
-// byte of each result, status and log line counts. It prints the same on every machine, whatever its
-// word size, sign of `char` or compiler. --without-log is for a library with a log of its own, whose
-// lines do not come by here.
+// load of CALLS calls for each export, and prints one digest for each export and one over all:
+// every byte of each result, status and log line counts. It prints the same on every machine,
+// whatever its word size, sign of `char` or compiler. --without-log is for a library with a log of
+// its own, whose lines do not come by here.
 
 #include <cstdint>
 #include <cstdio>

@@ -34,7 +34,7 @@ class GatewayAcceptsTest {
             "", "DEV1", "12345678901234567890", "123456789012345678901"};
     private static final String[] ADDRESSES = {"10.0.0.1", "fe80::1%wlan0"};
 
-    private final Gateway gateway = new Gateway(CLOCK);
+    private final Gateway gateway = Gateway.readyMade().clock(CLOCK).build();
     private final int[] status = new int[1];
     private int asked;
 

@@ -66,8 +66,8 @@ final class DemoFutures {
         submit("Buy the calendar spread of two futures", 4,
                 order -> order.buy(near).sell(far).quantity(2).price(Price.of("25")));
         stage.exchange("The exchange fills one of F0001, two of F0002 and all of F0003.", () -> {
-            stage.gateway().fillFutures("F0001", 1, "22948", "");
-            stage.gateway().fillFutures("F0002", 2, "120.5", "");
+            stage.gateway().fillFutures("F0001", 1, "22948");
+            stage.gateway().fillFutures("F0002", 2, "120.5");
             stage.gateway().fillFutures("F0003", 1, "310", "130");
         });
     }

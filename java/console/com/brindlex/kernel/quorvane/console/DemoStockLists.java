@@ -98,14 +98,13 @@ final class DemoStockLists {
     /** The same lists in the reply layouts of brokerage JZG. */
     private static void otherBrokerage(Stage stage) {
         Gateway standard = stage.gateway();
-        stage.use(new Gateway(stage.clock, com.brindlex.kernel.quorvane.simulator.Brokerage.JZG),
-                Brokerage.JZG);
+        stage.use(stage.gateway(Brokerage.JZG), Brokerage.JZG);
         stage.screen.title("The same lists at brokerage JZG");
         stage.ask("Buy one lot of 2317, order kind 1",
                 () -> stage.as(USER).stockOrder().buy("2317").quantity(Quantity.lots(1))
                         .price(Price.of("200")).orderKind(OrderKind.of(1)).live().build());
         stage.exchange("The exchange fills it.",
-                () -> stage.gateway().fillStock("A0001", 1000, 20000));
+                () -> stage.gateway().fillStock("A0001", 1000, "200"));
         positions(stage, 2, 1, 1, 0);
         SettledTrades settled = settlement(stage);
         stage.table(settled, 1, SETTLED_JZG);

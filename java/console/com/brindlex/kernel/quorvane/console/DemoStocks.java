@@ -59,8 +59,8 @@ final class DemoStocks {
                 .quantity(Quantity.lots(1)).price(Price.of("185")));
         stage.exchange("The exchange fills a lot of A0001 and all of A0007, and refuses A0006.",
                 () -> {
-                    stage.gateway().fillStock("A0001", LOT, 99450);
-                    stage.gateway().fillStock("A0007", LOT, 18505);
+                    stage.gateway().fillStock("A0001", LOT, "994.50");
+                    stage.gateway().fillStock("A0007", LOT, "185.05");
                     stage.gateway().failStock("A0006", "交易所退單!");
                 });
     }

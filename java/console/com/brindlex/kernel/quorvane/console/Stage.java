@@ -18,6 +18,7 @@ import com.brindlex.kernel.quorvane.client.TradeDate;
 import com.brindlex.kernel.quorvane.simulator.Gateway;
 import java.math.BigDecimal;
 import java.time.Clock;
+import java.time.Duration;
 import java.time.LocalDate;
 import java.util.ArrayList;
 import java.util.List;
@@ -33,6 +34,8 @@ final class Stage {
             Set.of("F", "KIND", "BHNO", "CB", "IP", "11", "VER", "65", "SN", "15", "IDNO", "ACNO",
                     "PWD", "21", "22", "23", "24", "V4", "44", "FUNC", "FUNC1", "01");
 
+    private static final Duration TOLERANCE = Duration.ofMinutes(10);
+
     final Screen screen;
     final Clock clock;
     private Gateway gateway;
@@ -45,11 +48,16 @@ final class Stage {
     Stage(Screen screen, Clock clock) {
         this.screen = screen;
         this.clock = clock;
-        this.gateway = new Gateway(clock);
+        this.gateway = gateway(Brokerage.STANDARD);
     }
 
     Gateway gateway() {
         return gateway;
+    }
+
+    /** A gateway that looks at the clock of a device, as real ones do. */
+    Gateway gateway(Brokerage brokerage) {
+        return Gateway.readyMade().clock(clock).tolerance(TOLERANCE).brokerage(brokerage).build();
     }
 
     /** Moves the session to another gateway and its brokerage. */

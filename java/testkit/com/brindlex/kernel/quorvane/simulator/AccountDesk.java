@@ -6,10 +6,11 @@ final class AccountDesk {
     private static final int MAX_CODE = 255;
 
     private final CustomerBook customers;
-    private String notice = "台股交易時間 09:00-13:30，請注意風險";
+    private String notice;
 
-    AccountDesk(CustomerBook customers) {
+    AccountDesk(CustomerBook customers, World world) {
         this.customers = customers;
+        this.notice = world.notice;
     }
 
     /** Sets the notice that a login brings; the empty text for none. */
@@ -28,7 +29,7 @@ final class AccountDesk {
     private String accounts(Request request, String message) throws Refusal {
         Customer customer = customers.customer(request);
         Reply reply = Reply.query(request).field("M3", message);
-        for (Account account : customer.accounts) {
+        for (TradingAccount account : customer.accounts) {
             // the number travels in two parts; leading zeros are the reader's business
             String digits = account.number.replaceFirst("^0+", "");
             int half = digits.length() - Math.min(2, digits.length());
@@ -62,14 +63,14 @@ final class AccountDesk {
 
     String changePassword(Request request) throws Refusal {
         Customer customer = customers.customer(request);
-        if (!request.get("54").equals(customer.password)) {
+        if (!request.get("54").equals(customers.password(customer))) {
             throw new Refusal(Refusal.Reason.WRONG_PASSWORD);
         }
         String wanted = request.text("55");
-        if (wanted.length() < MIN_PASSWORD || wanted.equals(customer.password)) {
+        if (wanted.length() < MIN_PASSWORD || wanted.equals(customers.password(customer))) {
             throw Refusal.rejected("新密碼不符規定");
         }
-        customer.password = wanted;
+        customers.setPassword(customer, wanted);
         return Reply.query(request).text();
     }
 

@@ -4,7 +4,7 @@ import java.time.LocalDateTime;
 
 /** What every order in the broker's book has: its numbers, its account and what became of it. */
 abstract class BookedOrder {
-    final Account account;
+    final TradingAccount account;
     final String number;
     final String gatewayNumber;
     final long ordered;
@@ -21,7 +21,7 @@ abstract class BookedOrder {
      * @param sequence its place in the book, from 1
      * @param gatewayNumber its number at the gateway
      */
-    BookedOrder(Account account, char letter, int sequence, long gatewayNumber, long ordered,
+    BookedOrder(TradingAccount account, char letter, int sequence, long gatewayNumber, long ordered,
             LocalDateTime entered) {
         this.account = account;
         this.number = String.format("%c%04d", letter, sequence);
@@ -33,6 +33,14 @@ abstract class BookedOrder {
     /** What can still be filled, reduced or cancelled. */
     final long open() {
         return failed() ? 0 : ordered - filled - reduced - cancelled;
+    }
+
+    /** Refuses a fill of more than is open, in a sentence. */
+    final void checkFill(long quantity, String unit) {
+        if (quantity <= 0 || quantity > open()) {
+            throw new IllegalArgumentException("The order " + number + " has " + open() + " " + unit
+                    + " open: 1 to " + open() + " can be filled, not " + quantity + ".");
+        }
     }
 
     final boolean failed() {

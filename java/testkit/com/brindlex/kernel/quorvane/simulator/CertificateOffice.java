@@ -119,7 +119,7 @@ final class CertificateOffice {
         if (!customer.idNumber.equals(holder)) {
             throw new Refusal(Refusal.Reason.UNKNOWN_ACCOUNT);
         }
-        if (!customer.birthDate.equals(request.get("BIRTH"))) {
+        if (!Texts.date(customer.birthDate).equals(request.get("BIRTH"))) {
             throw Refusal.rejected("出生日期錯誤");
         }
     }

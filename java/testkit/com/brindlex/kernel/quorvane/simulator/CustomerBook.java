@@ -1,33 +1,36 @@
 package com.brindlex.kernel.quorvane.simulator;
 
-import java.util.ArrayList;
+import java.util.HashMap;
 import java.util.List;
+import java.util.Map;
 
 /** The broker's customers, and who a request speaks for. */
-public final class CustomerBook {
-    private final List<Customer> customers = new ArrayList<>();
+final class CustomerBook {
+    private final List<Customer> customers;
+    private final Map<Customer, String> passwords = new HashMap<>();
 
     /** Who was recognised: the customer and, for orders and lists, the account. */
     static final class Party {
         final Customer customer;
-        final Account account;
+        final TradingAccount account;
 
-        Party(Customer customer, Account account) {
+        Party(Customer customer, TradingAccount account) {
             this.customer = customer;
             this.account = account;
         }
     }
 
-    /** Two customers: one with three accounts and one with an account that is blocked. */
-    static CustomerBook sample() {
-        CustomerBook book = new CustomerBook();
-        book.customers.add(new Customer("A123456789", "王小明", "19800101", "pass1234", 1250000)
-                .with('S', "9A01", "1234567", "台北證券", true)
-                .with('S', "9A01", "0009876", "台北複委託", true)
-                .with('F', "F001", "7654321", "期貨", true));
-        book.customers.add(new Customer("B298765432", "陳美玲", "19751231", "secret99", 80000)
-                .with('S', "9A02", "2222222", "台中證券", false));
-        return book;
+    CustomerBook(World world) {
+        customers = world.customers;
+    }
+
+    /** The password that counts now. */
+    String password(Customer customer) {
+        return passwords.getOrDefault(customer, customer.password);
+    }
+
+    void setPassword(Customer customer, String password) {
+        passwords.put(customer, password);
     }
 
     /** The customer behind an ID number, or null. */
@@ -55,7 +58,7 @@ public final class CustomerBook {
         if (customer == null) {
             throw new Refusal(Refusal.Reason.UNKNOWN_ACCOUNT);
         }
-        if (!customer.password.equals(request.get("PWD"))) {
+        if (!password(customer).equals(request.get("PWD"))) {
             throw new Refusal(Refusal.Reason.WRONG_PASSWORD);
         }
         return new Party(customer, needsAccount ? account(customer, request) : null);
@@ -67,7 +70,7 @@ public final class CustomerBook {
             boolean idFits = namesId(request) ? customer.idNumber.equals(request.get("IDNO"))
                                               : !account.isEmpty();
             boolean accountFits = account.isEmpty();
-            for (Account own : customer.accounts) {
+            for (TradingAccount own : customer.accounts) {
                 accountFits |= own.hasNumber(account);
             }
             if (idFits && accountFits) {
@@ -84,9 +87,9 @@ public final class CustomerBook {
         return request.has("IDNO") && !request.get("IDNO").equals(request.get("ACNO"));
     }
 
-    private static Account account(Customer customer, Request request) throws Refusal {
-        Account found = null;
-        for (Account own : customer.accounts) {
+    private static TradingAccount account(Customer customer, Request request) throws Refusal {
+        TradingAccount found = null;
+        for (TradingAccount own : customer.accounts) {
             boolean named = request.get("ACNO").isEmpty() || own.hasNumber(request.get("ACNO"));
             if (named && own.market == request.market() && found == null) {
                 found = own;

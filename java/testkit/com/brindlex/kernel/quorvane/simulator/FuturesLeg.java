@@ -2,22 +2,19 @@ package com.brindlex.kernel.quorvane.simulator;
 
 /** One leg of a futures order: product, contract month, strike, call or put, side. */
 final class FuturesLeg {
-    final FuturesProduct product;
+    final ListedProduct product;
     final String month;
     final String strike;
     final String callPut;
     final char side;
 
     /** Reads leg 1 or 2 of a request and judges its texts. */
-    FuturesLeg(Request request, boolean first) throws Refusal {
-        product = FuturesProduct.byId(request.get(first ? "33" : "V9"));
+    FuturesLeg(Request request, boolean first, World world) throws Refusal {
+        product = world.product(request.get(first ? "33" : "V9"));
         month = request.get(first ? "29" : "W0");
         strike = request.get(first ? "34" : "W2");
         callPut = request.get(first ? "V8" : "W1");
         side = request.letter(first ? "32" : "EL", "BS");
-        if (product == null) {
-            throw Refusal.rejected("無此商品代號");
-        }
         if (!month.matches("[0-9]{4}(0[1-9]|1[0-2])(W[1-5])?")) {
             throw Refusal.rejected("契約年月錯誤");
         }

@@ -16,7 +16,7 @@ final class FuturesLists {
         this.session = new Period(today, LocalDate.MAX);
     }
 
-    String answer(Request request, Account account) throws Refusal {
+    String answer(Request request, TradingAccount account) throws Refusal {
         switch (request.kind()) {
             case FUTURES_ORDER_BOOK:
                 request.number("28");
@@ -33,12 +33,12 @@ final class FuturesLists {
         }
     }
 
-    FuturesMargin margin(Account account) {
+    FuturesMargin margin(TradingAccount account) {
         return new FuturesMargin(
-                openPositions(account), fillsOf(account, session));
+                account.balance, openPositions(account), fillsOf(account, session));
     }
 
-    private String fillList(Request request, Account account) throws Refusal {
+    private String fillList(Request request, TradingAccount account) throws Refusal {
         Reply reply = Reply.query(request);
         for (FuturesFill fill : fillsOf(account, Period.ofWestern(request))) {
             fill.write(reply);
@@ -46,7 +46,7 @@ final class FuturesLists {
         return reply.list();
     }
 
-    private String positions(Request request, Account account) throws Refusal {
+    private String positions(Request request, TradingAccount account) throws Refusal {
         Reply reply = Reply.query(request);
         for (FuturesPosition position : openPositions(account)) {
             position.write(reply);
@@ -54,7 +54,7 @@ final class FuturesLists {
         return reply.list();
     }
 
-    private List<FuturesFill> fillsOf(Account account, Period period) {
+    private List<FuturesFill> fillsOf(TradingAccount account, Period period) {
         List<FuturesFill> own = new ArrayList<>();
         for (FuturesFill fill : fills) {
             if (fill.order.account == account && period.contains(fill.at)) {
@@ -65,7 +65,7 @@ final class FuturesLists {
     }
 
     /** Plays the session's fills: the other side closes first, what is left opens or adds. */
-    private List<FuturesPosition> openPositions(Account account) {
+    private List<FuturesPosition> openPositions(TradingAccount account) {
         List<FuturesPosition> open = new ArrayList<>();
         for (FuturesFill fill : fillsOf(account, session)) {
             long left = fill.contracts;

@@ -4,13 +4,14 @@ import java.util.List;
 
 /** The margin account behind a futures account, in whole units of the currency. */
 final class FuturesMargin {
-    private static final long BALANCE = 1500000;
     private static final long FEE = 50;
 
+    private final long balance;
     private final long bound;
     private final long fees;
 
-    FuturesMargin(List<FuturesPosition> positions, List<FuturesFill> fills) {
+    FuturesMargin(long balance, List<FuturesPosition> positions, List<FuturesFill> fills) {
+        this.balance = balance;
         long margin = 0;
         for (FuturesPosition position : positions) {
             margin += position.margin().longValue();
@@ -24,7 +25,7 @@ final class FuturesMargin {
     }
 
     long available() {
-        return BALANCE - fees - bound;
+        return balance - fees - bound;
     }
 
     /** Margin that an order would bind if it were filled whole. */
@@ -33,12 +34,12 @@ final class FuturesMargin {
     }
 
     String reply(Request request) {
-        long equity = BALANCE - fees;
+        long equity = balance - fees;
         long maintenance = bound * 3 / 4;
         String ratio = bound == 0 ? "0" : String.valueOf(equity * 100 / bound);
         return Reply.query(request)
                 .record()
-                .field("LO", BALANCE + ".00")
+                .field("LO", balance + ".00")
                 .field("PN", equity)
                 .field("RA", available())
                 .field("QY", bound)

@@ -12,23 +12,30 @@ final class FuturesOrder extends BookedOrder {
     /** The second leg, or null. */
     final FuturesLeg leg2;
 
-    final String n6;
+    private final String n6;
     final String fillOrKill;
     String price;
     private final int priceType;
     private final String w3;
     private final String immediate;
 
-    FuturesOrder(Request request, Account account, int sequence, LocalDateTime now) throws Refusal {
-        super(account, 'F', sequence, FIRST_GATEWAY_NUMBER + sequence, request.number("30"), now);
-        this.leg1 = new FuturesLeg(request, true);
-        this.leg2 = request.has("EL") ? new FuturesLeg(request, false) : null;
+    FuturesOrder(Request request, TradingAccount account, int sequence, World world)
+            throws Refusal {
+        super(account, 'F', sequence, FIRST_GATEWAY_NUMBER + sequence, request.number("30"),
+                world.now());
+        this.leg1 = new FuturesLeg(request, true, world);
+        this.leg2 = request.has("EL") ? new FuturesLeg(request, false, world) : null;
         this.priceType = (int) request.number("27");
         this.w3 = request.get("W3");
         this.fillOrKill = request.get("O4");
         this.immediate = request.get("V5");
         this.n6 = request.get("N6");
         this.price = priceType == 1 || priceType == 3 ? NO_PRICE : request.get("31");
+    }
+
+    /** Whether it waits at the broker for the next session. */
+    boolean isReservation() {
+        return n6.equals("0");
     }
 
     /** Whether what is not filled at once is cancelled (immediate or cancel, fill or kill). */

@@ -3,12 +3,11 @@ package com.brindlex.kernel.quorvane.simulator;
 /** What the broker asks of a futures order, and what its signature must say. */
 final class FuturesRules {
     private static final String MARKET_PRICE = "00000000.000000";
-    private static final int MAX_CONTRACTS = 100;
 
     private FuturesRules() {}
 
     /** Judges fields and signature of a new order or a change. */
-    static void check(Request request) throws Refusal {
+    static void check(Request request, World world) throws Refusal {
         boolean fresh = request.function() == 'I';
         boolean twoLegs = request.has("EL");
         require(request.get("28").equals("0"), "28");
@@ -23,7 +22,7 @@ final class FuturesRules {
         if (fresh) {
             newSignature(request).check(request);
             long contracts = request.number("30");
-            if (contracts == 0 || contracts > MAX_CONTRACTS) {
+            if (contracts == 0 || contracts > world.maxContracts) {
                 throw Refusal.rejected("委託口數錯誤");
             }
         } else {

@@ -23,7 +23,7 @@ final class OrderBook<T extends BookedOrder> implements Iterable<T> {
     }
 
     /** The order that a change or cancellation names; it must be the account's own. */
-    T named(Request request, Account account) throws Refusal {
+    T named(Request request, TradingAccount account) throws Refusal {
         T order = find(request.get("36"));
         if (order == null || order.account != account
                 || !order.gatewayNumber.equals(request.get("46"))) {
@@ -36,7 +36,10 @@ final class OrderBook<T extends BookedOrder> implements Iterable<T> {
     T existing(String number) {
         T order = find(number);
         if (order == null) {
-            throw new IllegalArgumentException("no such order: " + number);
+            List<String> numbers = new ArrayList<>();
+            orders.forEach(each -> numbers.add(each.number));
+            throw new IllegalArgumentException("There is no order " + number + " in the book, which"
+                    + " has " + (numbers.isEmpty() ? "none yet" : String.join(", ", numbers)) + ".");
         }
         return order;
     }
@@ -51,7 +54,7 @@ final class OrderBook<T extends BookedOrder> implements Iterable<T> {
     }
 
     /** The reply to an order book query: the account's orders of a period. */
-    String list(Request request, Account account, Period period) throws Refusal {
+    String list(Request request, TradingAccount account, Period period) throws Refusal {
         Reply reply = Reply.query(request);
         for (T order : orders) {
             if (order.account == account && period.contains(order.entered)) {

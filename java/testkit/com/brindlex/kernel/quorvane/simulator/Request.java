@@ -1,10 +1,12 @@
 package com.brindlex.kernel.quorvane.simulator;
 
+import com.brindlex.kernel.quorvane.client.Operation;
+import java.util.Collections;
 import java.util.LinkedHashMap;
 import java.util.Map;
 
 /** A request that has passed the grammar: its kind, its fields and its signature payload. */
-public final class Request {
+final class Request {
     private final RequestKind kind;
     private final Map<String, String> fields;
     private final String payload;
@@ -15,23 +17,33 @@ public final class Request {
         this.payload = payload;
     }
 
+    /** The encoder that builds such a request. */
+    Operation operation() {
+        return kind.operation;
+    }
+
+    /** Tags and values in their order. */
+    Map<String, String> fields() {
+        return Collections.unmodifiableMap(fields);
+    }
+
     /** What is asked for. */
-    public RequestKind kind() {
+    RequestKind kind() {
         return kind;
     }
 
     /** The value of a tag, empty when the request does not carry it. */
-    public String get(String tag) {
+    String get(String tag) {
         return fields.getOrDefault(tag, "");
     }
 
     /** Whether the request carries the tag, be it with an empty value. */
-    public boolean has(String tag) {
+    boolean has(String tag) {
         return fields.containsKey(tag);
     }
 
     /** The signature payload, without its leading "!!"; empty when there is none. */
-    public String payload() {
+    String payload() {
         return payload;
     }
 

@@ -1,6 +1,6 @@
 package com.brindlex.kernel.quorvane.simulator;
 
-import java.time.LocalDate;
+import java.math.BigDecimal;
 import java.time.LocalDateTime;
 import java.util.ArrayList;
 import java.util.List;
@@ -8,13 +8,15 @@ import java.util.List;
 /** Takes stock orders, changes and cancels them, and lets the exchange fill them. */
 final class StockDesk {
     private final CustomerBook customers;
+    private final World world;
     private final StockLists lists;
     private final OrderBook<StockOrder> orders = new OrderBook<>();
     private final List<StockFill> fills = new ArrayList<>();
 
-    StockDesk(CustomerBook customers, Brokerage brokerage, LocalDate today) {
+    StockDesk(CustomerBook customers, World world) {
         this.customers = customers;
-        this.lists = new StockLists(orders, fills, new StockHoldings(today), brokerage);
+        this.world = world;
+        this.lists = new StockLists(orders, fills, world);
     }
 
     String answer(Request request, LocalDateTime now) throws Refusal {
@@ -38,20 +40,27 @@ final class StockDesk {
         }
     }
 
-    private String enter(Request request, Account account, LocalDateTime now) throws Refusal {
-        Stock stock = StockRules.checkNew(request);
+    private String enter(Request request, TradingAccount account, LocalDateTime now) throws Refusal {
+        ListedStock stock = StockRules.checkNew(request, world);
         StockOrder order = new StockOrder(request, account, stock, orders.next(), now);
         boolean covered = order.kind != 0 || order.side == 'B'
                 || order.ordered <= lists.sellable(account, stock.code);
         if (!covered) {
             throw Refusal.rejected("庫存不足");
         }
+        world.stockHours.check(order.isReservation(), now.toLocalTime());
+        // the difference, since the limit may be as large as a number can be
+        long left = account.buyingLimit - lists.spent(account, now.toLocalDate());
+        if (order.cost() > left) {
+            throw Refusal.rejected("超過買進額度");
+        }
         orders.add(order);
-        return accepted(request, order.gatewayNumber, order.n6 == 0 ? 'X' : 'S', now);
+        return accepted(request, order.gatewayNumber, order.isReservation() ? 'X' : 'S', now);
     }
 
     private String cancel(Request request, StockOrder order, LocalDateTime now) throws Refusal {
         StockRules.checkChange(request, order);
+        world.stockHours.check(order.isReservation(), now.toLocalTime());
         if (order.open() == 0) {
             throw Refusal.rejected("委託已無剩餘數量");
         }
@@ -62,6 +71,7 @@ final class StockDesk {
     /** The quantity of a change is what is taken off the order. */
     private String reduce(Request request, StockOrder order, LocalDateTime now) throws Refusal {
         StockRules.checkChange(request, order);
+        world.stockHours.check(order.isReservation(), now.toLocalTime());
         long less = request.number("37");
         if (less == 0 || less > order.open()) {
             throw Refusal.rejected("改量數量錯誤");
@@ -79,8 +89,10 @@ final class StockDesk {
         StockOrder order = orders.existing(number);
         boolean worse = order.limit() != 0
                 && (order.side == 'B' ? price > order.limit() : price < order.limit());
-        if (shares <= 0 || shares > order.open() || worse) {
-            throw new IllegalArgumentException("the order cannot be filled so: " + number);
+        order.checkFill(shares, "shares");
+        if (worse) {
+            throw new IllegalArgumentException("The order " + number + " cannot be filled at a price"
+                    + " worse than its limit, " + BigDecimal.valueOf(order.limit(), 2) + ".");
         }
         order.filled += shares;
         fills.add(new StockFill(order, shares, price, at));

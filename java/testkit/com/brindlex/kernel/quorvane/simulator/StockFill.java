@@ -1,5 +1,6 @@
 package com.brindlex.kernel.quorvane.simulator;
 
+import com.brindlex.kernel.quorvane.client.Brokerage;
 import java.time.LocalDateTime;
 
 /** One fill of a stock order, with the money that it moves. */

@@ -1,5 +1,6 @@
 package com.brindlex.kernel.quorvane.simulator;
 
+import com.brindlex.kernel.quorvane.client.Brokerage;
 import java.time.LocalDate;
 import java.util.Map;
 import java.util.TreeMap;
@@ -13,17 +14,17 @@ final class StockHoldings {
     private static final int KINDS = 3;
 
     /** One stock: for each way of holding it the opening quantity, what came and what went. */
-    static final class Holding {
+    static final class Held {
         private final long[] opening = new long[KINDS];
         private final long[] came = new long[KINDS];
         private final long[] went = new long[KINDS];
         private long other;
 
-        private Holding opening(long cash, long margin, long sold, long pledged) {
-            opening[CASH] = cash;
-            opening[MARGIN] = margin;
-            opening[SHORT] = sold;
-            other = pledged;
+        private Held opening(Holding holding) {
+            opening[CASH] = holding.cash;
+            opening[MARGIN] = holding.margin;
+            opening[SHORT] = holding.shortSold;
+            other = holding.pledged;
             return this;
         }
 
@@ -62,23 +63,21 @@ final class StockHoldings {
         this.session = new Period(today, LocalDate.MAX);
     }
 
-    /** The account's holdings now; the sample account opens with three stocks. */
-    Map<String, Holding> of(Account account, Iterable<StockFill> fills) {
-        Map<String, Holding> holdings = new TreeMap<>();
-        if (account.number.equals("1234567")) {
-            holdings.put("2317", new Holding().opening(5000, 2000, 0, 0));
-            holdings.put("0050", new Holding().opening(10350, 0, 0, 1000));
-            holdings.put("2330", new Holding().opening(0, 0, 1000, 0));
+    /** The account's holdings now. */
+    Map<String, Held> of(TradingAccount account, Iterable<StockFill> fills) {
+        Map<String, Held> holdings = new TreeMap<>();
+        for (Holding holding : account.holdings) {
+            holdings.put(holding.stockCode, new Held().opening(holding));
         }
         for (StockFill fill : fills) {
             if (fill.order.account == account && session.contains(fill.at)) {
-                holdings.computeIfAbsent(fill.order.stock.code, code -> new Holding()).apply(fill);
+                holdings.computeIfAbsent(fill.order.stock.code, code -> new Held()).apply(fill);
             }
         }
         return holdings;
     }
 
-    void write(Map<String, Holding> holdings, Reply reply, Brokerage brokerage) {
+    void write(Map<String, Held> holdings, Reply reply, Brokerage brokerage) {
         holdings.forEach((code, holding) -> holding.write(reply, code, brokerage));
     }
 }

@@ -6,22 +6,19 @@ import java.util.Map;
 
 /** Answers order book, fills, positions, credit and settlement of a securities account. */
 final class StockLists {
-    private static final long MARGIN_QUOTA = 500;
-
     private final OrderBook<StockOrder> orders;
     private final List<StockFill> fills;
     private final StockHoldings holdings;
-    private final Brokerage brokerage;
+    private final World world;
 
-    StockLists(OrderBook<StockOrder> orders, List<StockFill> fills, StockHoldings holdings,
-            Brokerage brokerage) {
+    StockLists(OrderBook<StockOrder> orders, List<StockFill> fills, World world) {
         this.orders = orders;
         this.fills = fills;
-        this.holdings = holdings;
-        this.brokerage = brokerage;
+        this.holdings = new StockHoldings(world.today());
+        this.world = world;
     }
 
-    String answer(Request request, Account account, LocalDate today) throws Refusal {
+    String answer(Request request, TradingAccount account, LocalDate today) throws Refusal {
         switch (request.kind()) {
             case STOCK_ORDER_BOOK:
                 request.number("28");
@@ -38,8 +35,8 @@ final class StockLists {
     }
 
     /** Shares that can be sold: held for cash, less what open orders already sell. */
-    long sellable(Account account, String code) {
-        StockHoldings.Holding holding = holdings.of(account, fills).get(code);
+    long sellable(TradingAccount account, String code) {
+        StockHoldings.Held holding = holdings.of(account, fills).get(code);
         long shares = holding == null ? 0 : holding.cash();
         for (StockOrder order : orders) {
             boolean sells = order.side == 'S' && order.kind == 0;
@@ -50,7 +47,18 @@ final class StockLists {
         return shares;
     }
 
-    private String fillList(Request request, Account account) throws Refusal {
+    /** What the account's purchases of the day may cost, those that wait for their fill included. */
+    long spent(TradingAccount account, LocalDate today) {
+        long spent = 0;
+        for (StockOrder order : orders) {
+            if (order.account == account && order.entered.toLocalDate().equals(today)) {
+                spent += order.cost();
+            }
+        }
+        return spent;
+    }
+
+    private String fillList(Request request, TradingAccount account) throws Refusal {
         if (!request.get("57").equals("2")) {
             throw Refusal.malformed("57");
         }
@@ -64,23 +72,23 @@ final class StockLists {
         return reply.list();
     }
 
-    private String positions(Request request, Account account) throws Refusal {
-        Map<String, StockHoldings.Holding> held = holdings.of(account, fills);
+    private String positions(Request request, TradingAccount account) throws Refusal {
+        Map<String, StockHoldings.Held> held = holdings.of(account, fills);
         Reply reply = Reply.query(request);
-        holdings.write(held, reply, brokerage);
+        holdings.write(held, reply, world.brokerage);
         return reply.list();
     }
 
-    private static String credit(Request request) throws Refusal {
-        Stock stock = Stock.byCode(request.get("29"));
-        if (stock == null || !stock.credit) {
+    private String credit(Request request) throws Refusal {
+        ListedStock stock = world.stocks.get(request.get("29"));
+        if (stock == null || !stock.hasCredit()) {
             throw new Refusal(Refusal.Reason.NO_DATA);
         }
         return Reply.query(request)
                 .record()
                 .field("29", stock.code)
-                .field("76", MARGIN_QUOTA)
-                .field("77", MARGIN_QUOTA / 2)
+                .field("76", stock.marginQuota)
+                .field("77", stock.shortQuota)
                 .field("B8", "60")
                 .field("B9", "90")
                 .field("A0", "Y")
@@ -91,7 +99,7 @@ final class StockLists {
                 .text();
     }
 
-    private String settlement(Request request, Account account, LocalDate today) throws Refusal {
+    private String settlement(Request request, TradingAccount account, LocalDate today) throws Refusal {
         if (!request.get("H4").equals("1")) {
             throw Refusal.malformed("H4");
         }
@@ -101,7 +109,7 @@ final class StockLists {
         Reply reply = Reply.query(request);
         for (StockFill fill : fills) {
             if (fill.order.account == account && period.contains(fill.at)) {
-                fill.writeSettlement(reply, brokerage);
+                fill.writeSettlement(reply, world.brokerage);
             }
         }
         return reply.list();

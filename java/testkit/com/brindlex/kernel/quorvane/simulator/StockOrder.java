@@ -7,18 +7,18 @@ import java.time.LocalDateTime;
 final class StockOrder extends BookedOrder {
     private static final String TAKEN = "委託成功";
 
-    final Stock stock;
+    final ListedStock stock;
     final int kind;
     final int tradeType;
     final char side;
-    final int n6;
+    private final int n6;
     private final int priceKind;
 
     /** Limit price text; empty when the price kind or the trade type names the price. */
     private final String price;
 
-    StockOrder(Request request, Account account, Stock stock, int sequence, LocalDateTime now)
-            throws Refusal {
+    StockOrder(Request request, TradingAccount account, ListedStock stock, int sequence,
+            LocalDateTime now) throws Refusal {
         super(account, 'A', sequence, sequence, request.number("30"), now);
         this.stock = stock;
         this.kind = (int) request.number("27");
@@ -29,9 +29,20 @@ final class StockOrder extends BookedOrder {
         this.n6 = (int) request.number("N6");
     }
 
+    /** Whether it waits at the broker for the next session. */
+    boolean isReservation() {
+        return n6 == 0;
+    }
+
     /** The price that a fill must not be worse than, in hundredths; 0 when there is no limit. */
     long limit() {
         return price.isEmpty() ? 0 : new BigDecimal(price).movePointRight(2).longValueExact();
+    }
+
+    /** What a purchase may cost at most, in whole units; nothing is owed for what was taken off. */
+    long cost() {
+        long shares = side == 'B' ? filled + open() : 0;
+        return shares * (limit() == 0 ? stock.limitUp : limit()) / 100;
     }
 
     @Override

@@ -11,16 +11,13 @@ final class StockRules {
     private StockRules() {}
 
     /** Judges the fields of a new order and its signature; returns the stock. */
-    static Stock checkNew(Request request) throws Refusal {
+    static ListedStock checkNew(Request request, World world) throws Refusal {
         int tradeType = checkTradeType(request);
         request.letter("32", "BS");
         checkSignature(request, tradeType);
-        Stock stock = Stock.byCode(request.get("29"));
-        if (stock == null) {
-            throw Refusal.rejected("無此股票代號");
-        }
+        ListedStock stock = world.stock(request.get("29"));
         checkKind(request, stock);
-        checkQuantity(request, tradeType);
+        checkQuantity(request, tradeType, world.maxLots);
         checkPrice(request, tradeType, stock);
         return stock;
     }
@@ -29,17 +26,18 @@ final class StockRules {
         return request.letter("28", "023") - '0';
     }
 
-    private static void checkKind(Request request, Stock stock) throws Refusal {
+    private static void checkKind(Request request, ListedStock stock) throws Refusal {
         long kind = request.number("27");
         if (kind > MAX_KIND || kind == 6 || kind == 7) {
             throw Refusal.malformed("27");
         }
-        if (!stock.credit && kind >= 1 && kind <= 4) {
+        if (!stock.hasCredit() && kind >= 1 && kind <= 4) {
             throw Refusal.rejected("此股票不可信用交易");
         }
     }
 
-    private static void checkQuantity(Request request, int tradeType) throws Refusal {
+    private static void checkQuantity(Request request, int tradeType, long maxLots)
+            throws Refusal {
         long shares = request.number("30");
         long unit = request.number("UT");
         if (unit == 0 || shares == 0) {
@@ -48,9 +46,13 @@ final class StockRules {
         if (tradeType == ODD_LOT ? shares >= unit : shares % unit != 0) {
             throw Refusal.rejected(tradeType == ODD_LOT ? "零股數量須小於一張" : "委託數量須為整張");
         }
+        if (shares / unit > maxLots) {
+            throw Refusal.rejected("委託數量超過上限");
+        }
     }
 
-    private static void checkPrice(Request request, int tradeType, Stock stock) throws Refusal {
+    private static void checkPrice(Request request, int tradeType, ListedStock stock)
+            throws Refusal {
         if (tradeType == FIXED_PRICE) {
             requireEmpty(request, "31");
             requireEmpty(request, "M8");
@@ -65,10 +67,10 @@ final class StockRules {
         }
         BigDecimal price = Texts.price(request.get("31"), 2, "31");
         long hundredths = price.movePointRight(2).longValueExact();
-        if (hundredths > stock.limitUp()) {
+        if (hundredths > stock.limitUp) {
             throw Refusal.rejected("委託價格超過漲停價");
         }
-        if (hundredths < stock.limitDown()) {
+        if (hundredths < stock.limitDown) {
             throw Refusal.rejected("委託價格低於跌停價");
         }
     }

@@ -1,7 +1,6 @@
 package com.brindlex.kernel.quorvane.client;
 
 import com.brindlex.kernel.quorvane.simulator.Gateway;
-import java.time.Clock;
 import java.util.ArrayList;
 import java.util.List;
 import java.util.function.Supplier;
@@ -37,7 +36,7 @@ final class Fixtures {
     }
 
     static Gateway gateway() {
-        return new Gateway(Clock.systemDefaultZone());
+        return Gateway.open();
     }
 
     /** Sends a request to the simulated gateway and reads the reply. */

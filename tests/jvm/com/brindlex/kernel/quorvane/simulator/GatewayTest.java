@@ -4,6 +4,7 @@ import static org.junit.jupiter.api.Assertions.assertEquals;
 import static org.junit.jupiter.api.Assertions.assertThrows;
 import static org.junit.jupiter.api.Assertions.assertTrue;
 
+import com.brindlex.kernel.quorvane.client.Brokerage;
 import java.nio.charset.StandardCharsets;
 import java.util.Base64;
 import java.util.regex.Pattern;
@@ -13,7 +14,7 @@ import org.junit.jupiter.params.provider.CsvSource;
 
 /** What the gateway answers. */
 class GatewayTest {
-    private final Gateway gateway = new Gateway(Wire.CLOCK);
+    private final Gateway gateway = Wire.gateway().build();
 
     private void assertAnswer(String request, String part) {
         String reply = gateway.answer(request);
@@ -162,9 +163,9 @@ class GatewayTest {
     @Test
     void fillsStockOrders() {
         gateway.answer(Wire.buyTwoLots());
-        assertThrows(IllegalArgumentException.class, () -> gateway.fillStock("A0001", 3000, 99500));
-        assertThrows(IllegalArgumentException.class, () -> gateway.fillStock("A0001", 1000, 99501));
-        gateway.fillStock("A0001", 1000, 99450);
+        assertThrows(IllegalArgumentException.class, () -> gateway.fillStock("A0001", 3000, "995"));
+        assertThrows(IllegalArgumentException.class, () -> gateway.fillStock("A0001", 1000, "995.01"));
+        gateway.fillStock("A0001", 1000, "994.50");
         assertAnswer(Wire.ESCAPED + "|FUNC=3|57=2|SDATE=20240101|EDATE=20240115|01=\n",
                 "|29=2330|47=1000|48=994.50|49=994500|50=20240115|51=134521|01=");
         assertAnswer(
@@ -177,9 +178,9 @@ class GatewayTest {
 
     @Test
     void speaksTheLayoutOfTheOtherBrokerage() {
-        Gateway other = new Gateway(Wire.CLOCK, Brokerage.JZG);
+        Gateway other = Wire.gateway().brokerage(Brokerage.JZG).build();
         other.answer(Wire.buyTwoLots());
-        other.fillStock("A0001", 1000, 99500);
+        other.fillStock("A0001", 1000, "995");
         String positions = other.answer(Wire.ESCAPED + "|FUNC=5|01=");
         assertTrue(positions.contains("|75=0|751=1000|752=0|"), positions);
         String settlement =
@@ -223,20 +224,20 @@ class GatewayTest {
     @Test
     void holdsFuturesPositionsAndMargin() {
         gateway.answer(Wire.buyFutures());
-        gateway.fillFutures("F0001", 2, "18000", "");
+        gateway.fillFutures("F0001", 2, "18000");
         assertAnswer(Wire.FUTURES.replace("%20", " ") + "FUNC=O|01=",
                 "|33=TXF|29=202402|V8=|34=|32=B|R8=2|48=18000|");
         assertAnswer(Wire.FUTURES + "FUNC=P|28=3|01=",
                 "|LO=1500000.00|PN=1499900|RA=855900|QY=644000|QX=483000|U5=0|U9=100|RF=232|");
         gateway.answer(Wire.buyFutures().replace("32=B", "32=S").replace("_R_B_", "_R_S_"));
-        gateway.fillFutures("F0002", 1, "18100", "");
+        gateway.fillFutures("F0002", 1, "18100");
         assertAnswer(Wire.FUTURES.replace("%20", " ") + "FUNC=O|01=", "|32=B|R8=1|");
         assertAnswer(Wire.buyFutures().replace("30=2|", "30=9|").replace("__2_", "__9_"), "保證金不足");
     }
 
     @Test
     void answersTheSameRequestsTheSameWay() {
-        Gateway again = new Gateway(Wire.CLOCK);
+        Gateway again = Wire.gateway().build();
         for (String request :
                 new String[] {Wire.buyTwoLots(), Wire.change(), Wire.ESCAPED + "|FUNC=5|01="}) {
             assertEquals(gateway.answer(request), again.answer(request));

@@ -1,6 +1,7 @@
 package com.brindlex.kernel.quorvane.simulator;
 
 import static org.junit.jupiter.api.Assertions.assertEquals;
+import static org.junit.jupiter.api.Assertions.assertFalse;
 import static org.junit.jupiter.api.Assertions.assertNotEquals;
 import static org.junit.jupiter.api.Assertions.assertThrows;
 import static org.junit.jupiter.api.Assertions.assertTrue;
@@ -70,6 +71,14 @@ class RequestGrammarTest {
     }
 
     @Test
+    void namesEveryFieldOfEveryKind() throws Refusal {
+        for (Object[] row : REQUESTS) {
+            Request request = RequestParser.parse((String) row[1]);
+            assertFalse(FieldNames.named(request).containsKey(null), request.fields()::toString);
+        }
+    }
+
+    @Test
     void refusesEveryRequestThatLacksABarOrAnEqualsSign() {
         for (Object[] row : REQUESTS) {
             String text = (String) row[1];
@@ -106,7 +115,7 @@ class RequestGrammarTest {
                 String damaged = text.substring(0, i);
                 assertThrows(Refusal.class, () -> {
                     Request request = RequestParser.parse(damaged);
-                    StockRules.checkNew(request);
+                    StockRules.checkNew(request, Wire.gateway().world);
                 }, damaged);
             }
         }
@@ -172,7 +181,7 @@ class RequestGrammarTest {
         for (int i = 0; i < text.length(); i++) {
             char other = text.charAt(i) == '7' ? '8' : '7';
             String damaged = text.substring(0, i) + other + text.substring(i + 1);
-            if (new Gateway(Wire.CLOCK).answer(damaged).contains("|39= |")) {
+            if (Wire.gateway().build().answer(damaged).contains("|39= |")) {
                 int bar = text.lastIndexOf('|', i);
                 unseen.add(text.substring(bar + 1, text.indexOf('=', bar)));
             }

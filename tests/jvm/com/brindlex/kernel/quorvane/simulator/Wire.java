@@ -1,6 +1,7 @@
 package com.brindlex.kernel.quorvane.simulator;
 
 import java.time.Clock;
+import java.time.Duration;
 import java.time.LocalDateTime;
 import java.time.ZoneId;
 
@@ -31,6 +32,11 @@ final class Wire {
     static final String KEY_1 = "DEV1,10.0.0.1,20240115,";
 
     private Wire() {}
+
+    /** The ready-made world at that moment, by a gateway that looks at the clock of the device. */
+    static GatewayBuilder gateway() {
+        return Gateway.readyMade().clock(CLOCK).tolerance(Duration.ofMinutes(10));
+    }
 
     /** Plain order header of the securities account. */
     static String order(char function) {

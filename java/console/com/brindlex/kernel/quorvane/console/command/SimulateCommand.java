@@ -1,6 +1,7 @@
 package com.brindlex.kernel.quorvane.console.command;
 
 import com.brindlex.kernel.quorvane.client.Argument;
+import com.brindlex.kernel.quorvane.client.Brokerage;
 import com.brindlex.kernel.quorvane.client.InvalidRequestException;
 import com.brindlex.kernel.quorvane.client.Market;
 import com.brindlex.kernel.quorvane.client.Operation;
@@ -11,14 +12,14 @@ import com.brindlex.kernel.quorvane.console.Screen.Style;
 import com.brindlex.kernel.quorvane.console.message.Kind;
 import com.brindlex.kernel.quorvane.console.message.Message;
 import com.brindlex.kernel.quorvane.console.message.MessageReader;
-import com.brindlex.kernel.quorvane.simulator.Brokerage;
 import com.brindlex.kernel.quorvane.simulator.Gateway;
 import com.brindlex.kernel.quorvane.simulator.Line;
 import java.io.BufferedReader;
 import java.io.IOException;
 import java.io.InputStreamReader;
+import java.math.BigDecimal;
 import java.nio.charset.StandardCharsets;
-import java.time.Clock;
+import java.time.Duration;
 import java.util.ArrayList;
 import java.util.HashMap;
 import java.util.LinkedHashMap;
@@ -39,6 +40,7 @@ import picocli.CommandLine;
         description = "Opens a session with the gateway simulator: each line is an operation with "
                 + "its options, a request as it stands, or something that happens at the exchange.")
 final class SimulateCommand implements Callable<Integer> {
+    private static final Duration TOLERANCE = Duration.ofMinutes(10);
     private static final Pattern WORD = Pattern.compile("'([^']*)'|\"([^\"]*)\"|(\\S+)");
     private static final String[][] HELP = {
         {"AuthEncode", "send a request; options as of 'quorvane encode', user and device are set"},
@@ -69,7 +71,7 @@ final class SimulateCommand implements Callable<Integer> {
     @Override
     public Integer call() throws IOException {
         terminal = parent.terminal();
-        gateway = new Gateway(Clock.systemDefaultZone(), brokerage);
+        gateway = Gateway.readyMade().tolerance(TOLERANCE).brokerage(brokerage).build();
         usual.putAll(WrittenRequest.sample());
         boolean interactive = System.console() != null && !terminal.isJson();
         if (interactive) {
@@ -146,7 +148,7 @@ final class SimulateCommand implements Callable<Integer> {
                 return true;
             case "fill":
                 gateway.fillStock(words.get(1), Long.parseLong(words.get(2)),
-                        Long.parseLong(words.get(3)));
+                        BigDecimal.valueOf(Long.parseLong(words.get(3)), 2).toPlainString());
                 return true;
             case "fill-futures":
                 gateway.fillFutures(words.get(1), Long.parseLong(words.get(2)), words.get(3),

@@ -11,7 +11,7 @@ import com.brindlex.kernel.quorvane.console.message.Message;
 import com.brindlex.kernel.quorvane.console.message.MessageReader;
 import com.brindlex.kernel.quorvane.simulator.Gateway;
 import com.brindlex.kernel.quorvane.simulator.Line;
-import java.time.Clock;
+import java.math.BigDecimal;
 import java.util.HashMap;
 import java.util.LinkedHashMap;
 import java.util.List;
@@ -23,7 +23,7 @@ final class SessionPlace {
     /** The lists that show what became of the orders. */
     private static final Map<String, Operation> LISTS = lists();
 
-    private Gateway gateway = new Gateway(Clock.systemDefaultZone());
+    private Gateway gateway = Gateway.open();
     private Line line = Line.UP;
 
     private static Map<String, Operation> lists() {
@@ -90,7 +90,7 @@ final class SessionPlace {
         String order = texts.getOrDefault("order", "");
         switch (TryPlace.text(texts, "act")) {
             case "fill" -> gateway.fillStock(order, number(texts, "quantity"),
-                    number(texts, "price"));
+                    BigDecimal.valueOf(number(texts, "price"), 2).toPlainString());
             case "fill-futures" -> gateway.fillFutures(order, number(texts, "quantity"),
                     TryPlace.text(texts, "price"), texts.getOrDefault("price2", ""));
             case "fail" -> gateway.failStock(order, TryPlace.text(texts, "text"));
@@ -100,7 +100,7 @@ final class SessionPlace {
                 gateway.setLine(line);
             }
             case "anew" -> {
-                gateway = new Gateway(Clock.systemDefaultZone());
+                gateway = Gateway.open();
                 line = Line.UP;
             }
             default -> throw new IllegalArgumentException("nothing of that kind happens");
