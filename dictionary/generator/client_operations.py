@@ -223,7 +223,8 @@ def natives(whole):
             decoders.append(f"{case}                return gatewayjni.{operation['name']}"
                             f"({market}reply, status);")
     return java_source(NATIVES % ("\n".join(encoders), "\n".join(decoders)),
-                   ["com.brindlex.kernel.quorvane.gatewayjni"])
+                   ["com.brindlex.kernel.quorvane.NativeLibrary",
+                    "com.brindlex.kernel.quorvane.gatewayjni"])
 
 
 def _value(place, argument):
@@ -237,12 +238,16 @@ def _value(place, argument):
 
 
 NATIVES = """
-/** Calls the natives. */
+/**
+ * Calls the natives. Loads the library at every call, which says each time what is missing; the host
+ * class alone would say it once, and then be a class that is not there.
+ */
 final class Natives {
     private Natives() {}
 
     static String encode(
             Operation operation, int market, Session session, Object[] v, int[] status) {
+        NativeLibrary.load();
         switch (operation) {
 %s
             default:
@@ -251,6 +256,7 @@ final class Natives {
     }
 
     static String decode(Operation operation, int market, String reply, int[] status) {
+        NativeLibrary.load();
         switch (operation) {
 %s
             default:

@@ -32,7 +32,7 @@ public final class NativeLibrary {
     private static final String HOST_LOADER = "com.brindlex.kernel.quorvane.host.HostLibrary";
 
     private static Loader loader;
-    private static boolean loaded;
+    private static volatile boolean loaded;
 
     private NativeLibrary() {}
 
@@ -46,34 +46,31 @@ public final class NativeLibrary {
      *
      * @throws UnsatisfiedLinkError when it cannot be loaded, with what to do
      */
-    public static synchronized void load() {
+    public static void load() {
+        if (!loaded) {
+            find();
+        }
+    }
+
+    private static synchronized void find() {
         if (loaded) {
             return;
         }
         try {
             if (loader == null) {
-                find();
+                System.loadLibrary(NAME);
             } else {
                 loader.load(NAME);
             }
         } catch (UnsatisfiedLinkError refused) {
-            UnsatisfiedLinkError told = new UnsatisfiedLinkError(advice(refused.getMessage()));
-            told.initCause(refused);
-            throw told;
-        }
-        loaded = true;
-    }
-
-    private static void find() {
-        try {
-            System.loadLibrary(NAME);
-        } catch (UnsatisfiedLinkError refused) {
-            Loader host = isOnDevice() || isInLibraryPath() ? null : hostLoader();
+            boolean look = loader == null && !isOnDevice() && !isInLibraryPath();
+            Loader host = look ? hostLoader() : null;
             if (host == null) {
-                throw refused;
+                throw advised(refused);
             }
             host.load(NAME);
         }
+        loaded = true;
     }
 
     private static boolean isOnDevice() {
@@ -100,11 +97,14 @@ public final class NativeLibrary {
         }
     }
 
-    private static String advice(String reason) {
-        return System.mapLibraryName(NAME) + " cannot be loaded (" + reason + "). On Android the"
-                + " app must carry it for the ABI of the device; on a plain machine"
-                + " quorvane-host.jar brings it on the class path, or -Djava.library.path names its"
-                + " folder. NativeLibrary.use(...) takes another loader.";
+    private static UnsatisfiedLinkError advised(UnsatisfiedLinkError refused) {
+        UnsatisfiedLinkError told = new UnsatisfiedLinkError(System.mapLibraryName(NAME)
+                + " cannot be loaded (" + refused.getMessage() + "). On Android the app must carry it"
+                + " for the ABI of the device; on a plain machine quorvane-host.jar brings it on the"
+                + " class path, or -Djava.library.path names its folder. NativeLibrary.use(...) takes"
+                + " another loader.");
+        told.initCause(refused);
+        return told;
     }
 
     /** Whether the library is loaded or can be. */
