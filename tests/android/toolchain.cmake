@@ -28,5 +28,6 @@ set(CMAKE_TRY_COMPILE_TARGET_TYPE STATIC_LIBRARY)
 # As the NDK: tables to unwind by, the compiler's routines from an archive.
 set(CMAKE_CXX_FLAGS_INIT "-funwind-tables -isystem \"${ANDROID_NDK}/sysroot/include\" \
 -isystem /usr/include/android/nativehelper")
+# Start files that ask for nothing, such as the NDK's, are no other than none.
 set(CMAKE_SHARED_LINKER_FLAGS_INIT
-    "-fuse-ld=lld -static-libgcc -L\"${ANDROID_NDK}/sysroot/lib/${ANDROID_ABI}\"")
+    "-fuse-ld=lld -nostartfiles -static-libgcc -L\"${ANDROID_NDK}/sysroot/lib/${ANDROID_ABI}\"")

@@ -1,6 +1,7 @@
 #include "tests/heap/counting_heap.h"
 
 #include <link.h>
+#include <sys/mman.h>
 
 #include <cstddef>
 #include <cstdint>
@@ -24,6 +25,7 @@ uintptr_t s_nLibrary = 0;
 uintptr_t s_nLibraryEnd = 0;
 
 thread_local bool t_bFailing = false;
+thread_local bool t_bGuarding = false;
 thread_local size_t t_nRequests = 0;
 thread_local size_t t_nFirst = 0;
 thread_local size_t t_nLast = 0;
@@ -43,17 +45,57 @@ int FindLibrary(dl_phdr_info* object, size_t, void* symbol) {
   return 0;
 }
 
+void LearnWhereTheLibraryLies() {
+  if (s_nLibrary == 0) dl_iterate_phdr(&FindLibrary, AllExports()[0].EntryPoint());
+  if (s_nLibrary == 0) std::abort();
+}
+
 bool IsOfLibrary(const void* caller) {
   const auto address = reinterpret_cast<uintptr_t>(caller);
-  return t_bFailing && address >= s_nLibrary && address < s_nLibraryEnd;
+  return address >= s_nLibrary && address < s_nLibraryEnd;
 }
 
 // Whether a request must be refused.
 bool Refuses(const void* caller) {
-  if (!IsOfLibrary(caller)) return false;
+  if (!t_bFailing || !IsOfLibrary(caller)) return false;
   ++t_nRequests;
   if (t_nRequests >= t_nFirst && t_nRequests <= t_nLast) return true;
   ++t_nUnreleased;
+  return false;
+}
+
+// The blocks before a page that nobody may touch; a call takes few, and one thread plays.
+struct GuardedBlock {
+  char* data;
+  char* mapping;
+  size_t size;
+};
+GuardedBlock s_guarded[16];
+
+char* TakeGuarded(size_t size) {
+  constexpr size_t kPage = 65536;  // of the largest page that a kernel has
+  const size_t usable = (size + kPage - 1) / kPage * kPage;
+  void* const mapping =
+      mmap(nullptr, usable + kPage, PROT_READ | PROT_WRITE, MAP_PRIVATE | MAP_ANONYMOUS, -1, 0);
+  if (mapping == MAP_FAILED) std::abort();
+  char* const begin = static_cast<char*>(mapping);
+  if (mprotect(begin + usable, kPage, PROT_NONE) != 0) std::abort();
+  for (GuardedBlock& block : s_guarded) {
+    if (block.data != nullptr) continue;
+    block = {begin + usable - size, begin, usable + kPage};
+    return block.data;
+  }
+  std::abort();
+}
+
+// False when it is no guarded block.
+bool GiveGuardedBack(const void* data) {
+  for (GuardedBlock& block : s_guarded) {
+    if (block.data != data) continue;
+    munmap(block.mapping, block.size);
+    block = {};
+    return true;
+  }
   return false;
 }
 
@@ -78,8 +120,7 @@ int CHeapCount::Releases() const {
 }
 
 CFailingHeap::CFailingHeap(size_t first, size_t last) {
-  if (s_nLibrary == 0) dl_iterate_phdr(&FindLibrary, AllExports()[0].EntryPoint());
-  if (s_nLibrary == 0) std::abort();
+  LearnWhereTheLibraryLies();
   t_nRequests = 0;
   t_nUnreleased = 0;
   t_nFirst = first;
@@ -99,6 +140,15 @@ long CFailingHeap::Unreleased() const {
   return t_nUnreleased;
 }
 
+CGuardedHeap::CGuardedHeap() {
+  LearnWhereTheLibraryLies();
+  t_bGuarding = true;
+}
+
+CGuardedHeap::~CGuardedHeap() {
+  t_bGuarding = false;
+}
+
 }  // namespace gateway_tests
 
 extern "C" {
@@ -111,7 +161,11 @@ void __libc_free(void* block);
 
 void* malloc(size_t size) noexcept {
   gateway_tests::Count();
-  if (gateway_tests::Refuses(__builtin_return_address(0))) return nullptr;
+  const void* const caller = __builtin_return_address(0);
+  if (gateway_tests::Refuses(caller)) return nullptr;
+  if (gateway_tests::t_bGuarding && gateway_tests::IsOfLibrary(caller)) {
+    return gateway_tests::TakeGuarded(size);
+  }
   return __libc_malloc(size);
 }
 
@@ -128,8 +182,10 @@ void* realloc(void* block, size_t size) noexcept {
 
 void free(void* block) noexcept {
   if (gateway_tests::t_bCounting && block != nullptr) ++gateway_tests::t_nReleases;
-  if (block != nullptr && gateway_tests::IsOfLibrary(__builtin_return_address(0))) {
-    --gateway_tests::t_nUnreleased;
+  if (block == nullptr) return;
+  if (gateway_tests::IsOfLibrary(__builtin_return_address(0))) {
+    if (gateway_tests::t_bFailing) --gateway_tests::t_nUnreleased;
+    if (gateway_tests::t_bGuarding && gateway_tests::GiveGuardedBack(block)) return;
   }
   __libc_free(block);
 }

@@ -34,6 +34,17 @@ class CFailingHeap {
   long Unreleased() const;
 };
 
+// Gives the library blocks of the very size that it asks for, each before a page that nobody may
+// touch, so that a byte behind a block ends the program; on the calling thread, while the object
+// lives.
+class CGuardedHeap {
+ public:
+  CGuardedHeap();
+  CGuardedHeap(const CGuardedHeap&) = delete;
+  CGuardedHeap& operator=(const CGuardedHeap&) = delete;
+  ~CGuardedHeap();
+};
+
 }  // namespace gateway_tests
 
 #endif  // TESTS_HEAP_COUNTING_HEAP_H_

@@ -3,6 +3,8 @@
 
 #include <gtest/gtest.h>
 
+#include <algorithm>
+#include <iterator>
 #include <set>
 #include <string>
 #include <string_view>
@@ -31,6 +33,18 @@ Answer Play(const GoldenCase& golden, size_t first, size_t last) {
   return answer;
 }
 
+// What a call did last before it gave anything back: most log their result.
+std::string LastBeforeRelease(const Outcome& outcome) {
+  const auto release =
+      std::find_if(outcome.events.begin(), outcome.events.end(),
+                   [](const std::string& event) { return event.rfind("Release", 0) == 0; });
+  return release == outcome.events.begin() ? "" : *std::prev(release);
+}
+
+bool LogsItsResult(const Outcome& outcome) {
+  return LastBeforeRelease(outcome) == "log " + *outcome.result;
+}
+
 // Nothing, with status -1; a reply that is refused for a reason of its own may still say so.
 void ExpectFailure(const Answer& answer, const Outcome& whole, const std::string& where) {
   const Outcome& outcome = answer.outcome;
@@ -38,6 +52,9 @@ void ExpectFailure(const Answer& answer, const Outcome& whole, const std::string
   EXPECT_TRUE(outcome.IsSound()) << where << testing::PrintToString(outcome.violations);
   EXPECT_TRUE(outcome.result == "" || refused) << where << ": " << *outcome.result;
   EXPECT_EQ(outcome.status, -1) << where;
+  if (LogsItsResult(whole)) {
+    EXPECT_TRUE(LogsItsResult(outcome)) << where << ": " << LastBeforeRelease(outcome);
+  }
   EXPECT_EQ(answer.unreleased, 0) << where;
 }
 

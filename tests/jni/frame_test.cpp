@@ -2,6 +2,8 @@
 
 #include <gtest/gtest.h>
 
+#include <algorithm>
+#include <iterator>
 #include <string>
 #include <vector>
 
@@ -127,6 +129,31 @@ TEST_P(Frame, ReplyHoldsAllThenReadsThenReleasesThenAnswers) {
   };
   EXPECT_EQ(outcome.events, expected);
   EXPECT_EQ(outcome.status, -1);
+}
+
+// Lengths that end at the sizes of numbers, and longer ones.
+TEST(Log, TellsTheLengthOfRepliesOfAnySize) {
+  size_t decoders = 0;
+  for (const Export& row : AllExports()) {
+    if (!row.IsDecoder()) continue;
+    size_t told = 0;
+    const size_t lengths[] = {127, 128, 255, 256, 9999, 32768, 65535, 65536, 99999, 1 << 20};
+    for (const size_t length : lengths) {
+      Arguments arguments = {Argument::Text(std::string(length, '|'))};
+      if (row.shape.front() == 'i') arguments.insert(arguments.begin(), Argument::Int(0));
+      CRecordingHost host;
+      const Events lines = host.Call(row, arguments).logLines;
+      const auto line = std::find_if(lines.begin(), lines.end(), [](const std::string& text) {
+        return text.find("Len:") != std::string::npos;
+      });
+      if (line == lines.end()) continue;
+      ++told;
+      EXPECT_EQ(line->substr(line->find("Len:")), "Len:" + std::to_string(length)) << row.name;
+    }
+    EXPECT_TRUE(told == 0 || told == std::size(lengths)) << row.name;
+    if (told != 0) ++decoders;
+  }
+  EXPECT_EQ(decoders, 17U);
 }
 
 TEST_P(Frame, NullReplyIsHandedOnWithoutAskingTheMachine) {

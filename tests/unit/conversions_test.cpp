@@ -387,6 +387,18 @@ TEST_F(Conversions, GetPriceString2ReadsAnAmountOf64Bits) {
   EXPECT_EQ(m_gateway.GetPriceString2(nullptr, 2), 0);
 }
 
+// What is cut is divided by a power of ten that stays at the largest number from 10 digits on (19
+// for an amount): this fraction leaves 1 however many are cut, and 0 where there is none to spare.
+TEST_F(Conversions, PricesAreCutByAnyNumberOfDecimals) {
+  for (size_t excess = 10; excess <= 700; ++excess) {
+    const std::string zeros(excess - 10 + 2, '0');
+    EXPECT_EQ(ScalePrice("3." + zeros + "2147483647", 2), 301) << excess;
+    EXPECT_EQ(ScalePrice("3." + zeros + "2147483646", 2), 300) << excess;
+    EXPECT_EQ(ScaleAmount("3." + zeros + "9223372036854775807", 2), 301) << excess;
+    EXPECT_EQ(ScaleAmount("3." + zeros + "9223372036854775806", 2), 300) << excess;
+  }
+}
+
 TEST_F(Conversions, PricesTakeAnyNumberOfDecimals) {
   const std::string digits(300, '9');
   for (int decimals : {INT_MIN, -300, -1, 0, 1, 300, INT_MAX}) {

@@ -159,6 +159,18 @@ TEST(TextWriter, PieceThatFitsExactlyIsWhole) {
   }
 }
 
+// Texts and characters have no room to spare, as numbers have.
+TEST(TextWriter, CharactersAndTextsFitExactly) {
+  const std::string expected = "xab|yz|cd";
+  for (size_t size = 1; size <= expected.size() + 3; ++size) {
+    Line line(size);
+    line.writer.Append(WIRE("%c%s|%c%c|%s"), 'x', "ab", 'y', 'z', "cd");
+    const bool fits = expected.size() < size;
+    EXPECT_EQ(line.writer.Overflowed(), !fits) << size;
+    EXPECT_STREQ(line.writer.Text(), fits ? expected.c_str() : "") << size;
+  }
+}
+
 // The same with every kind of value at once.
 TEST(TextWriter, ValuesOfEveryKindFitExactly) {
   for (const int number : {0, 7, 12, 345, 6789, 10000, 12345678, 123456789, INT_MAX, -1, INT_MIN}) {
