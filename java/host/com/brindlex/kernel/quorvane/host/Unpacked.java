@@ -6,6 +6,7 @@ import java.io.InputStream;
 import java.net.URL;
 import java.net.URLConnection;
 import java.nio.file.Files;
+import java.nio.file.LinkOption;
 import java.nio.file.Path;
 import java.nio.file.Paths;
 import java.util.concurrent.TimeUnit;
@@ -28,10 +29,10 @@ final class Unpacked {
         String temporary = System.getProperty("java.io.tmpdir");
         Path folder = null;
         try {
-            removeLeftBehind(new File(temporary), name);
             folder = Files.createTempDirectory(Paths.get(temporary), PREFIX);
             Path file = folder.resolve(name);
             copy(packed, file);
+            removeLeftBehind(folder, name);
             return file;
         } catch (IOException refused) {
             if (folder != null) {
@@ -59,15 +60,26 @@ final class Unpacked {
         }
     }
 
-    private static void removeLeftBehind(File temporary, String name) {
-        File[] folders = temporary.listFiles((in, folder) -> folder.startsWith(PREFIX));
+    /** Others may write into the temporary folder, too: nothing of theirs is followed or removed. */
+    private static void removeLeftBehind(Path own, String name) {
+        File[] folders = own.getParent().toFile().listFiles((in, other) -> other.startsWith(PREFIX));
         if (folders == null) {
             return;
         }
-        for (File folder : folders) {
-            if (folder.lastModified() < System.currentTimeMillis() - LEFT_BEHIND) {
-                remove(folder.toPath().resolve(name));
+        for (File each : folders) {
+            Path folder = each.toPath();
+            boolean old = each.lastModified() < System.currentTimeMillis() - LEFT_BEHIND;
+            if (old && Files.isDirectory(folder, LinkOption.NOFOLLOW_LINKS) && isOf(folder, own)) {
+                remove(folder.resolve(name));
             }
+        }
+    }
+
+    private static boolean isOf(Path folder, Path own) {
+        try {
+            return Files.getOwner(folder, LinkOption.NOFOLLOW_LINKS).equals(Files.getOwner(own));
+        } catch (IOException | UnsupportedOperationException unknown) {
+            return false;
         }
     }
 }
