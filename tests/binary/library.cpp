@@ -34,6 +34,12 @@ EXPORT int Java_com_brindlex_kernel_quorvane_gatewayjni_PaymentDecode() {
   return system("");
 }
 #endif
+#ifdef FAULT_LOG
+extern "C" int __android_log_write(int priority, const char* tag, const char* text);
+EXPORT int Java_com_brindlex_kernel_quorvane_gatewayjni_PaymentDecode() {
+  return __android_log_write(3, "", "");
+}
+#endif
 #ifdef FAULT_TEXTREL
 asm(".text\n.dc.a Java_com_brindlex_kernel_quorvane_gatewayjni_AuthDecode\n");
 #endif
