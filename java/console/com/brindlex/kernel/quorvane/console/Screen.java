@@ -170,7 +170,11 @@ public final class Screen {
 
     /** Columns that a text takes: characters of the East Asian scripts take two. */
     public static int width(String text) {
-        return text.codePoints().map(c -> isWide(c) ? 2 : 1).sum();
+        int width = 0;
+        for (int at = 0; at < text.length(); at = text.offsetByCodePoints(at, 1)) {
+            width += isWide(text.codePointAt(at)) ? 2 : 1;
+        }
+        return width;
     }
 
     private static boolean isWide(int c) {

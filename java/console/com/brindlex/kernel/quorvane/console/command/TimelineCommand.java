@@ -11,7 +11,6 @@ import com.brindlex.kernel.quorvane.console.timeline.Timeline;
 import java.io.IOException;
 import java.util.List;
 import java.util.concurrent.Callable;
-import java.util.regex.Pattern;
 import java.util.stream.Collectors;
 import picocli.CommandLine.Command;
 import picocli.CommandLine.Mixin;
@@ -31,8 +30,6 @@ import picocli.CommandLine.Spec;
 final class TimelineCommand implements Callable<Integer> {
     private static final String CSV_HEAD = "line,time,direction,operation,title,account,instrument,"
             + "words,status,request_id,request_line,millis,faults\r\n";
-
-    private static final Pattern CODE = Pattern.compile("(?:En|De)code");
 
     @ParentCommand
     private Quorvane parent;
@@ -114,7 +111,7 @@ final class TimelineCommand implements Callable<Integer> {
 
     /** SubmitOrder1 for SubmitOrderEncode1. */
     private static String shortName(String operation) {
-        return CODE.matcher(operation).replaceFirst("");
+        return operation.replace("Encode", "").replace("Decode", "");
     }
 
     private static String csv(Row row) {

@@ -11,6 +11,7 @@ public final class EntryReader implements Closeable {
 
     private final LineReader lines;
     private LogFormat last = LogFormat.THREADTIME;
+    private LastHeader before;
     private LogHeader above;
     private boolean isFirstBelow;
 
@@ -34,28 +35,33 @@ public final class EntryReader implements Closeable {
             above = null;
             return LogEntry.without(line);
         }
+        LogHeader again = before == null ? null : before.again(text, begin, end);
+        if (again != null) {
+            return found(line, again, begin + before.length(), end);
+        }
         for (int i = -1; i < FORMATS.length; i++) {
             LogFormat format = i < 0 ? last : FORMATS[i];
             Matcher found = format.match(shown, begin);
             if (found != null) {
                 last = format;
-                return found(line, format, found, end);
+                LogHeader header = format.header(found);
+                before = LastHeader.of(text, begin, end, header, found);
+                return found(line, header, found.end(), end);
             }
         }
         return below(line, begin, end);
     }
 
-    private LogEntry found(LogLine line, LogFormat format, Matcher found, int end) {
-        LogHeader header = format.header(found);
-        if (format.isAbove()) {
+    private LogEntry found(LogLine line, LogHeader header, int begin, int end) {
+        if (header.format().isAbove()) {
             above = header;
             isFirstBelow = true;
             return LogEntry.without(line);
         }
         above = null;
-        int last = format == LogFormat.PROCESS ? line.text().lastIndexOf("  (" + header.tag())
-                                               : end;
-        return new LogEntry(line, header, Math.min(found.end(), last), last);
+        int textEnd = header.format() == LogFormat.PROCESS
+                ? line.text().lastIndexOf("  (" + header.tag()) : end;
+        return new LogEntry(line, header, Math.min(begin, textEnd), textEnd);
     }
 
     /** A line without a header: below one, or the rest of a message that the log wrote in lines. */

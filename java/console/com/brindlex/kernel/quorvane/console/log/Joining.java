@@ -12,7 +12,8 @@ import java.util.regex.Pattern;
 final class Joining {
     private static final Pattern LENGTH = Pattern.compile("(?:\\w+: |regMsg )Len:([0-9]{1,9})");
     private static final Pattern BASE64 = Pattern.compile("[A-Za-z0-9+/=]*\r?(?:\\|.*)?");
-    private static final Pattern OPEN_BASE64 = Pattern.compile("(?s).*\\|MSG=[A-Za-z0-9+/=\r\n]*");
+    private static final Pattern OPEN_BASE64 =
+            Pattern.compile("(?s).*\\|MSG=[A-Za-z0-9+/=\r\n]*");
 
     /** What Android keeps of an entry: 4,068 bytes with its priority, its tag and two ends. */
     private static final int LONGEST_ENTRY = 4068;
@@ -21,25 +22,40 @@ final class Joining {
     private static final int LIKELY_CUT = 900;
     private static final int ROUND_PIECES = 3000;
 
+    private static final String RECORD_BEGIN = "|00=";
+    private static final String RECORD_END = "|01=";
+
     private final List<LogEntry> entries = new ArrayList<>(1);
     private final List<Integer> splits = new ArrayList<>(0);
-    private final StringBuilder text = new StringBuilder();
-    private final int expected;
+    private final String first;
     private final Kind kind;
+    private final int expected;
+    private StringBuilder joined;
     private int bytes;
+    private boolean isOpenBase64;
+
+    /** What the text says of its end, up to the character {@link #seen}. */
+    private boolean isSigned;
+    private int lastBegin = -1;
+    private int lastEnd = -1;
+    private int seen;
 
     /**
      * Begins with an entry.
      *
+     * @param kind what its text is
      * @param expected the bytes that a length line told of it; -1 when none did
      */
-    Joining(LogEntry first, int expected) {
-        entries.add(first);
-        text.append(first.text());
-        this.kind = MessageReader.kind(first.text());
-        this.bytes = bytes(first.text());
-        boolean told = expected > bytes && (kind == Kind.REPLY || kind == Kind.TEXT);
+    Joining(LogEntry entry, Kind kind, int expected) {
+        entries.add(entry);
+        this.first = entry.text();
+        this.kind = kind;
+        boolean counts = kind == Kind.REPLY || kind == Kind.TEXT;
+        this.bytes = counts || kind == Kind.REQUEST ? bytes(first) : 0;
+        boolean told = counts && expected > bytes;
         this.expected = told ? expected : -1;
+        this.isOpenBase64 = kind == Kind.REQUEST && first.contains("|MSG=")
+                && OPEN_BASE64.matcher(first).matches();
     }
 
     /** How long the next text is, when this one says so; -1 otherwise. */
@@ -57,27 +73,37 @@ final class Joining {
         if (expected >= 0) {
             return bytes >= expected;
         }
-        return !isOpenBase64() && !isCutRequest() && !isCutReply();
-    }
-
-    private boolean isOpenBase64() {
-        return kind == Kind.REQUEST && text.indexOf("|MSG=") > 0
-                && OPEN_BASE64.matcher(text).matches() && !text.toString().endsWith("|01=");
+        return !isOpenBase64 && !isCutRequest() && !isCutReply();
     }
 
     /** Requests end with 01, a payload or a trade type: a long one without them was cut. */
     private boolean isCutRequest() {
-        return kind == Kind.REQUEST && bytes >= LIKELY_CUT && text.indexOf("!!") < 0
-                && text.lastIndexOf("|01=") < 0;
+        if (kind != Kind.REQUEST || bytes < LIKELY_CUT) {
+            return false;
+        }
+        look();
+        return !isSigned && lastEnd < 0;
     }
 
     private boolean isCutReply() {
         if (kind != Kind.REPLY || bytes < LIKELY_CUT) {
             return false;
         }
-        int end = text.lastIndexOf("|01=");
-        boolean ends = end == text.length() - "|01=".length();
-        return text.lastIndexOf("|00=") > end || isPiece() && !ends;
+        look();
+        boolean ends = lastEnd == seen - RECORD_END.length();
+        return lastBegin > lastEnd || isPiece() && !ends;
+    }
+
+    /** Looks at what was not seen yet: a message of many lines is read once. */
+    private void look() {
+        int from = Math.max(0, seen - RECORD_END.length() + 1);
+        String fresh = joined == null ? first : joined.substring(from);
+        isSigned |= fresh.contains("!!");
+        int begin = fresh.lastIndexOf(RECORD_BEGIN);
+        int end = fresh.lastIndexOf(RECORD_END);
+        lastBegin = begin < 0 ? lastBegin : from + begin;
+        lastEnd = end < 0 ? lastEnd : from + end;
+        seen = from + fresh.length();
     }
 
     /** Takes a line that goes on with the message; whether it did. */
@@ -85,35 +111,43 @@ final class Joining {
         if (!entry.hasText() || !continues(entry)) {
             return false;
         }
+        if (joined == null) {
+            joined = new StringBuilder(first);
+        }
         String more = entry.text();
         boolean feed = isFeed(more);
-        if (feed && isOpenBase64() && text.charAt(text.length() - 1) != '\r') {
-            text.append('\r');  // lost on the way: the wire has both
+        if (feed && isOpenBase64 && joined.charAt(joined.length() - 1) != '\r') {
+            joined.append('\r');  // lost on the way: the wire has both
         }
-        text.append(feed ? "\n" : "");
-        splits.add(text.length());
-        text.append(more);
+        joined.append(feed ? "\n" : "");
+        splits.add(joined.length());
+        joined.append(more);
         entries.add(entry);
         bytes += bytes(more) + (feed ? 1 : 0);
+        isOpenBase64 &= more.indexOf('|') < 0;
         return true;
     }
 
+    private int length() {
+        return joined == null ? first.length() : joined.length();
+    }
+
     private boolean continues(LogEntry entry) {
-        LogHeader first = entries.get(0).header();
+        LogHeader begun = entries.get(0).header();
         LogHeader next = entry.header();
-        if (next != null && (first == null || !next.isOfSameSource(first))) {
+        if (next != null && (begun == null || !next.isOfSameSource(begun))) {
             return false;
         }
         String more = entry.text();
-        if (isOpenBase64()) {
+        if (isOpenBase64) {
             return BASE64.matcher(more).matches() && !begins(more)
-                    && text.length() < LineReader.LONGEST;
+                    && length() < LineReader.LONGEST;
         }
         Kind its = MessageReader.kind(more);
         boolean another = its == Kind.END || its == Kind.LENGTH || its == Kind.REQUEST
                 || its == Kind.HEADER || its == Kind.MARK || its == Kind.RESULT
                 || begins(more);
-        return !another && text.length() < LineReader.LONGEST
+        return !another && length() < LineReader.LONGEST
                 && (expected < 0 || bytes + bytes(more) <= expected);
     }
 
@@ -124,7 +158,7 @@ final class Joining {
     /** Whether a line feed stood before a line; where a text is logged in pieces none did. */
     private boolean isFeed(String more) {
         boolean room = expected < 0 || bytes + bytes(more) < expected;
-        return isOpenBase64() || room && !isPiece();
+        return isOpenBase64 || room && !isPiece();
     }
 
     /** Whether the last line is as long as pieces are: a round number, or what an entry holds. */
@@ -136,11 +170,11 @@ final class Joining {
 
     LogMessage message() {
         List<LogMessage.Flaw> flaws = new ArrayList<>(0);
-        String whole = text.toString();
+        String whole = joined == null ? first : joined.toString();
         if (expected > bytes) {
             flaws.add(new LogMessage.Flaw("cut-by-log", whole.length(), "the log holds "
                             + bytes + " of " + expected + " bytes"));
-        } else if (isCutByAndroid() && (isOpenBase64() || isCutRequest() || isCutReply())) {
+        } else if ((isOpenBase64 || isCutRequest() || isCutReply()) && isCutByAndroid()) {
             flaws.add(new LogMessage.Flaw("cut-by-log", whole.length(),
                     "the log ends here: Android keeps 4,068 bytes of an entry"));
         }
@@ -155,7 +189,8 @@ final class Joining {
             flaws.add(new LogMessage.Flaw("broken-bytes", broken, "bytes that are no character of "
                             + "the charset: is it another one (--charset)?"));
         }
-        return new LogMessage(List.copyOf(entries), whole, List.copyOf(splits), flaws);
+        Kind its = joined == null ? kind : MessageReader.kind(whole);
+        return new LogMessage(its, List.copyOf(entries), whole, List.copyOf(splits), flaws);
     }
 
     private boolean isCutByAndroid() {

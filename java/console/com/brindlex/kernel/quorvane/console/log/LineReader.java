@@ -93,12 +93,16 @@ public final class LineReader implements Closeable {
         boolean cut = false;
         while (true) {
             if (at == filled && !fill()) {
-                return number == 0 && line.length() == 0 || line.length() == 0
-                        ? null : ended("", cut);
+                return line.length() == 0 ? null : ended(line.toString(), "", cut);
             }
             int end = at;
             while (end < filled && buffer[end] != '\n') {
                 end++;
+            }
+            if (line.length() == 0 && end < filled && end - at <= LONGEST) {
+                String whole = new String(buffer, at, end - at);
+                at = end + 1;
+                return ended(whole, "\n", false);
             }
             int room = LONGEST - line.length();
             cut |= end - at > room;
@@ -106,7 +110,7 @@ public final class LineReader implements Closeable {
             at = end;
             if (end < filled) {
                 at++;
-                return ended("\n", cut);
+                return ended(line.toString(), "\n", cut);
             }
         }
     }
@@ -118,15 +122,14 @@ public final class LineReader implements Closeable {
     }
 
     /** The first line tells whether the log ends its lines with carriage returns. */
-    private LogLine ended(String end, boolean cut) {
+    private LogLine ended(String text, String end, boolean cut) {
         number++;
-        int length = line.length();
-        boolean feed = length > 0 && line.charAt(length - 1) == '\r';
+        boolean feed = text.endsWith("\r");
         if (number == 1) {
             carriageReturns = feed;
         }
         boolean drop = carriageReturns && feed;
-        return new LogLine(number, line.substring(0, drop ? length - 1 : length),
+        return new LogLine(number, drop ? text.substring(0, text.length() - 1) : text,
                 drop ? "\r" + end : end, cut);
     }
 

@@ -9,6 +9,8 @@ package com.brindlex.kernel.quorvane.console.log;
  * @param end characters of the line up to the end of the text
  */
 public record LogEntry(LogLine line, LogHeader header, int begin, int end) {
+    private static final String PRINTABLE_RETURN = "\\r";
+
     /** A line that carries no text: a heading, a gap. */
     static LogEntry without(LogLine line) {
         return new LogEntry(line, null, -1, -1);
@@ -19,8 +21,11 @@ public record LogEntry(LogLine line, LogHeader header, int begin, int end) {
         return begin >= 0;
     }
 
-    /** The text alone. */
+    /** The text alone. A carriage return ends it where {@code logcat -v printable} wrote one. */
     public String text() {
-        return line.text().substring(begin, end);
+        boolean printable = end - begin >= PRINTABLE_RETURN.length()
+                && line.text().startsWith(PRINTABLE_RETURN, end - PRINTABLE_RETURN.length());
+        return printable ? line.text().substring(begin, end - PRINTABLE_RETURN.length()) + "\r"
+                         : line.text().substring(begin, end);
     }
 }

@@ -23,7 +23,7 @@ public enum LogFormat {
     /** {@code D/gatewayjni: text}. */
     TAG("[VDIWEFAS]/(?<tag>[^ (:|=][^(:|=]*?) *: ?"),
     /** {@code [ 01-15 13:45:21.123  1234: 5678 D/gatewayjni ]}, the text below it. */
-    LONG("\\[ " + Part.TIME + " +" + Part.USER + "(?<process>\\d+): *(?<thread>\\d+) "
+    LONG("\\[ +" + Part.TIME + " +" + Part.USER + "(?<process>\\d+): *(?<thread>\\d+) "
             + "[VDIWEFAS]/(?<tag>.*?) *\\]\\s*$"),
     /** {@code 13:45:21.123  D  text}, the compact view of Android Studio. */
     COMPACT("(?<time>\\d\\d:\\d\\d:\\d\\d\\.\\d{3}) +[VDIWEFA](?:  ?|$)");

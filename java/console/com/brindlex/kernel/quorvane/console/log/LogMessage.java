@@ -1,16 +1,18 @@
 package com.brindlex.kernel.quorvane.console.log;
 
+import com.brindlex.kernel.quorvane.console.message.Kind;
 import java.util.List;
 
 /**
  * A message of a log, joined from the lines that the log made of it.
  *
+ * @param kind what it is
  * @param entries its lines; never empty
  * @param text the message
  * @param splits characters of the text before each line but the first
  * @param flaws what the log did to it
  */
-public record LogMessage(List<LogEntry> entries, String text, List<Integer> splits,
+public record LogMessage(Kind kind, List<LogEntry> entries, String text, List<Integer> splits,
         List<Flaw> flaws) {
     /**
      * What a log did to a message.

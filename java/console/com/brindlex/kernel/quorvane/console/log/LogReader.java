@@ -58,13 +58,10 @@ public final class LogReader implements Closeable {
                 ahead = entry;
                 return finished();
             }
-            LogEntry message = within(entry);
-            if (message == null) {
+            open = begin(entry);
+            if (open == null) {
                 others.accept(entry.line());
-                continue;
-            }
-            open = new Joining(message, expected);
-            if (open.isComplete()) {
+            } else if (open.isComplete()) {
                 return finished();
             }
         }
@@ -76,33 +73,35 @@ public final class LogReader implements Closeable {
             return null;
         }
         LogMessage message = open.message();
-        expected = Joining.length(message.text());
+        expected = message.kind() == Kind.LENGTH ? Joining.length(message.text()) : -1;
         open = null;
         return message;
     }
 
-    /** The message within an entry; null when it has none. */
-    private LogEntry within(LogEntry entry) {
+    /** The message that begins within an entry; null when none does. */
+    private Joining begin(LogEntry entry) {
         LogHeader header = entry.header();
         last = header == null ? last : header;
         boolean own = header != null && tag.equals(header.tag());
         boolean tagless = header == null ? last == null : header.tag() == null;
         String text = entry.text();
-        int[] found = (own || tagless) && begins(text) ? null : Unwrap.find(text);
-        if (found != null) {
-            return new LogEntry(entry.line(), header, entry.begin() + found[0],
-                    entry.begin() + found[1]);
+        Kind kind = own || tagless ? MessageReader.kind(text) : Kind.TEXT;
+        int[] found = isBegin(kind, text) ? null : Unwrap.find(text);
+        if (found == null) {
+            return own || tagless ? new Joining(entry, kind, expected) : null;
         }
-        return own || tagless ? entry : null;
+        LogEntry message = new LogEntry(entry.line(), header, entry.begin() + found[0],
+                entry.begin() + found[1]);
+        return new Joining(message, MessageReader.kind(message.text()), expected);
     }
 
-    /** Whether a text is a message from its begin on. */
-    private static boolean begins(String text) {
-        if (!text.startsWith("[")) {
-            return text.startsWith("|");
-        }
-        Kind kind = MessageReader.kind(text);
-        return kind == Kind.MESSAGE || kind == Kind.MARK;
+    /** Whether a text is a message from its begin on: nothing stands around it. */
+    private static boolean isBegin(Kind kind, String text) {
+        return switch (kind) {
+            case REQUEST, REPLY -> text.startsWith("F=") || text.startsWith("|");
+            case TEXT -> false;
+            default -> true;
+        };
     }
 
     @Override

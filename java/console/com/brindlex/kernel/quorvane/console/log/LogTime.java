@@ -1,44 +1,58 @@
 package com.brindlex.kernel.quorvane.console.log;
 
 import java.time.DateTimeException;
-import java.time.LocalDateTime;
-import java.time.ZoneOffset;
-import java.util.regex.Matcher;
-import java.util.regex.Pattern;
+import java.time.LocalDate;
+import java.time.LocalTime;
 
 /** Times as logs write them, to take one from the other. */
 public final class LogTime {
     /** No time. */
     public static final long NONE = Long.MIN_VALUE;
 
-    private static final Pattern CLOCK = Pattern.compile(
-            "(?:(?:(\\d{4})-)?(\\d\\d)-(\\d\\d) )?(\\d\\d):(\\d\\d):(\\d\\d)\\.(\\d{3})\\d*(?: [+-]\\d{4})?");
-    private static final Pattern SECONDS = Pattern.compile("(\\d{1,15})\\.(\\d{3})\\d*");
+    private static final long MILLIS_OF_DAY = 86_400_000;
+    private static final int CLOCK_LENGTH = "13:45:21".length();
+    private static final int DATE_LENGTH = "01-15 ".length();
     private static final int LEAP_YEAR = 2000;
 
     private LogTime() {}
 
-    /** Milliseconds since a moment that is the same for all times of a log; {@link #NONE}. */
+    /**
+     * Milliseconds since a moment that is the same for all times of a log; {@link #NONE}.
+     *
+     * @param time as a log writes it: with a date and a year or without them, or seconds; a zone
+     *         and what is less than a millisecond are not read
+     */
     public static long millis(String time) {
-        Matcher seconds = SECONDS.matcher(time);
-        if (seconds.matches()) {
-            return Long.parseLong(seconds.group(1)) * 1000 + Long.parseLong(seconds.group(2));
-        }
-        Matcher clock = CLOCK.matcher(time);
-        if (!clock.matches()) {
+        int point = time.indexOf('.');
+        if (point < 0) {
             return NONE;
         }
         try {
-            return LocalDateTime.of(number(clock, 1, LEAP_YEAR), number(clock, 2, 1),
-                            number(clock, 3, 1), number(clock, 4, 0), number(clock, 5, 0),
-                            number(clock, 6, 0)).toEpochSecond(ZoneOffset.UTC) * 1000
-                    + number(clock, 7, 0);
-        } catch (DateTimeException never) {
+            long millis = number(time, point + 1, point + 4);
+            int clock = point - CLOCK_LENGTH;
+            if (clock < 0 || time.charAt(clock + 2) != ':') {
+                return Long.parseLong(time, 0, point, 10) * 1000 + millis;
+            }
+            int seconds = LocalTime.of(number(time, clock, clock + 2),
+                    number(time, clock + 3, clock + 5), number(time, clock + 6, point))
+                    .toSecondOfDay();
+            return day(time, clock - DATE_LENGTH) * MILLIS_OF_DAY + seconds * 1000L + millis;
+        } catch (DateTimeException | NumberFormatException | IndexOutOfBoundsException never) {
             return NONE;
         }
     }
 
-    private static int number(Matcher found, int group, int otherwise) {
-        return found.group(group) == null ? otherwise : Integer.parseInt(found.group(group));
+    /** The day that the month and the day of month at a place make, if there are any. */
+    private static long day(String time, int at) {
+        if (at < 0) {
+            return 0;
+        }
+        int year = at == 0 ? LEAP_YEAR : number(time, 0, at - 1);
+        return LocalDate.of(year, number(time, at, at + 2), number(time, at + 3, at + 5))
+                .toEpochDay();
+    }
+
+    private static int number(String text, int begin, int end) {
+        return Integer.parseInt(text, begin, end, 10);
     }
 }

@@ -24,13 +24,14 @@ final class Binding {
     private static final int CONDITION = 3;
 
     final Template template;
-    final Map<String, Bound> bound = new LinkedHashMap<>();
+    final Map<String, Bound> bound;
     final List<Fault> faults = new ArrayList<>();
     private final String text;
     private int conditions;
 
     private Binding(Template template, String text) {
         this.template = template;
+        this.bound = new LinkedHashMap<>(2 * template.slots.size());
         this.text = text;
     }
 

@@ -20,7 +20,8 @@ public record Message(Kind kind, List<String> operations, String words, String t
         List<Group> groups, List<Fault> faults, Map<String, String> facts) {
     /** Puts the faults into the order of the text. */
     public Message {
-        faults = faults.stream().sorted(Comparator.comparingInt(Fault::offset)).toList();
+        faults = faults.isEmpty() ? List.of()
+                : faults.stream().sorted(Comparator.comparingInt(Fault::offset)).toList();
     }
 
     /** The first operation that it can belong to; null when none is known. */

@@ -16,8 +16,14 @@ public final class MessageReader {
             "[0-9]{1,9}!|<[0-9]>!|[^|=]*@[^|]*!\\z");
     private static final Pattern FIELDS =
             Pattern.compile("[A-Z0-9]{1,7}=[^|]*\\||[^|]{0,40}\\|[A-Z0-9]{1,7}=");
-    private static final String[] OF_REQUESTS = {"|BHNO=", "|CB=", "|IP=", "|VER=", "|SN=", "|11="};
+    private static final String[] OF_REQUESTS = {"BHNO=", "CB=", "IP=", "VER=", "SN=", "11="};
     private static final String[] SOURCES = {"[CLIENT]", "[GATEWAY]", "[BROKER]", "[CERT]"};
+
+    /** A header has nine of them before the identity; damage may add some. */
+    private static final int FIELDS_IN_FRONT = 16;
+
+    /** No name of a call makes a length line longer. */
+    private static final int LONGEST_LENGTH = 100;
 
     private MessageReader() {}
 
@@ -32,7 +38,7 @@ public final class MessageReader {
         if (text.startsWith("[GATEWAY]error") || text.startsWith("[BROKER]timeout")) {
             return Kind.REPLY;
         }
-        if (text.contains("Len:") && LENGTH.matcher(text).matches()) {
+        if (isLength(text)) {
             return Kind.LENGTH;
         }
         if (isMark(text)) {
@@ -52,6 +58,11 @@ public final class MessageReader {
         return isKnownMessage(text) ? Kind.MESSAGE : Kind.TEXT;
     }
 
+    private static boolean isLength(String text) {
+        return text.length() < LONGEST_LENGTH && text.contains("Len:")
+                && LENGTH.matcher(text).matches();
+    }
+
     private static boolean isMark(String text) {
         char first = text.isEmpty() ? ' ' : text.charAt(0);
         boolean like = first == '[' || first == 't' || first == 'g' || first == 'G' || first == 'J';
@@ -63,16 +74,17 @@ public final class MessageReader {
         return text.contains("|28=") ? text.replaceFirst("\\|28=[0-9]+$", "") : text;
     }
 
-    /** Two fields that requests alone carry; replies begin alike. */
+    /** Two fields in front that requests alone carry; replies begin alike. */
     private static boolean isRequest(String text) {
         int found = 0;
-        for (String tag : OF_REQUESTS) {
-            found += text.contains(tag) ? 1 : 0;
-            if (found == 2) {
-                return true;
+        int bar = text.indexOf('|');
+        for (int field = 0; field < FIELDS_IN_FRONT && bar >= 0 && found < 2; field++) {
+            for (String tag : OF_REQUESTS) {
+                found += text.startsWith(tag, bar + 1) ? 1 : 0;
             }
+            bar = text.indexOf('|', bar + 1);
         }
-        return false;
+        return found == 2;
     }
 
     private static boolean isKnownMessage(String text) {
@@ -91,16 +103,15 @@ public final class MessageReader {
      *         nobody knows
      */
     public static Message read(String text, List<String> decoders) {
-        return read(text, decoders, true);
+        return read(kind(text), text, decoders, true);
     }
 
-    /** Says what a text is, and what is wrong with it; its fields are left out. */
-    public static Message glance(String text, List<String> decoders) {
-        return read(text, decoders, false);
+    /** Says of a text of a known kind what is wrong with it; its fields are left out. */
+    public static Message glance(Kind kind, String text, List<String> decoders) {
+        return read(kind, text, decoders, false);
     }
 
-    private static Message read(String text, List<String> decoders, boolean full) {
-        Kind kind = kind(text);
+    private static Message read(Kind kind, String text, List<String> decoders, boolean full) {
         return switch (kind) {
             case REQUEST -> RequestReader.read(text, full);
             case REPLY -> isFailure(text) ? failure(text, decoders)

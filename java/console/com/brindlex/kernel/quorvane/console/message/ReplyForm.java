@@ -1,18 +1,22 @@
 package com.brindlex.kernel.quorvane.console.message;
 
+import com.brindlex.kernel.quorvane.console.Newest;
 import com.brindlex.kernel.quorvane.console.dictionary.CodeTable;
 import com.brindlex.kernel.quorvane.console.dictionary.Dictionary;
 import com.brindlex.kernel.quorvane.console.dictionary.Operation;
 import com.brindlex.kernel.quorvane.console.dictionary.Reply;
 import java.util.ArrayList;
-import java.util.Collection;
 import java.util.HashMap;
 import java.util.List;
 import java.util.Map;
+import java.util.Set;
 
 /** A reply's layout, indexed by tag: bounds, forms of values, names. */
 final class ReplyForm {
     private static final Map<String, ReplyForm> ALL = new HashMap<>();
+
+    /** So many kinds of replies are remembered with the decoders that fit. */
+    private static final Map<Set<String>, List<String>> FITTING = new Newest<>(256);
 
     static {
         Dictionary dictionary = Dictionary.get();
@@ -73,7 +77,13 @@ final class ReplyForm {
     }
 
     /** The decoders whose layouts a reply fits best. */
-    static List<String> fitting(Collection<String> tags) {
+    static List<String> fitting(Set<String> tags) {
+        synchronized (FITTING) {
+            return FITTING.computeIfAbsent(tags, ReplyForm::search);
+        }
+    }
+
+    private static List<String> search(Set<String> tags) {
         List<String> best = new ArrayList<>();
         int most = Integer.MIN_VALUE;
         for (Operation operation : Dictionary.get().operations()) {
@@ -90,7 +100,7 @@ final class ReplyForm {
         return best;
     }
 
-    private int score(Collection<String> tags) {
+    private int score(Set<String> tags) {
         int score = 0;
         for (String tag : tags) {
             score += reads(tag) ? 3 : names.containsKey(tag) ? 0 : -1;

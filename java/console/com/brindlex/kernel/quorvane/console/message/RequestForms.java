@@ -1,12 +1,12 @@
 package com.brindlex.kernel.quorvane.console.message;
 
+import com.brindlex.kernel.quorvane.console.Newest;
 import com.brindlex.kernel.quorvane.console.dictionary.Dictionary;
 import com.brindlex.kernel.quorvane.console.dictionary.Header;
 import com.brindlex.kernel.quorvane.console.dictionary.Operation;
 import java.util.ArrayList;
 import java.util.HashMap;
 import java.util.HashSet;
-import java.util.LinkedHashMap;
 import java.util.List;
 import java.util.Map;
 import java.util.Set;
@@ -25,15 +25,7 @@ final class RequestForms {
     private final List<Template> all = new ArrayList<>();
     private final Map<String, List<Template>> byTags = new HashMap<>();
     private final Set<String> headers = new HashSet<>();
-    private final Map<List<String>, List<Template>> closest =
-            new LinkedHashMap<>(16, 0.75f, true) {
-                private static final long serialVersionUID = 1;
-
-                @Override
-                protected boolean removeEldestEntry(Map.Entry<List<String>, List<Template>> last) {
-                    return size() > MOST_REMEMBERED;
-                }
-            };
+    private final Map<List<String>, List<Template>> closest = new Newest<>(MOST_REMEMBERED);
 
     private static final class Holder {
         static final RequestForms INSTANCE = new RequestForms(Dictionary.get());

@@ -20,19 +20,21 @@ final class RequestReader {
         List<Cut.Piece> pieces = Cut.request(body);
         String tags = Cut.tags(pieces);
         RequestForms forms = RequestForms.get();
-        boolean whole = !forms.withTags(tags).isEmpty();
-        if (!whole && (refused > 0 || forms.isHeader(tags))) {
-            return header(text, request, pieces, refused);
+        List<Template> alike = forms.withTags(tags);
+        if (alike.isEmpty() && (refused > 0 || forms.isHeader(tags))) {
+            return header(text, request, pieces, refused, full);
         }
-        List<Binding> best = whole ? Binding.best(forms.withTags(tags), pieces, request) : List.of();
+        List<Template> same = new ArrayList<>(alike);
+        same.removeIf(each -> !each.hasConstants(pieces));
+        List<Binding> best = Binding.best(same, pieces, request);
         if (best.isEmpty() || !best.get(0).fits()) {
-            List<Template> all = new ArrayList<>(forms.withTags(tags));
+            List<Template> all = new ArrayList<>(alike);
             all.addAll(forms.closest(pieces));
             best = Binding.best(all, pieces, request);
         }
         Binding binding = best.get(0);
-        List<String> operations = best.stream().map(each -> each.template.operation.name())
-                .distinct().toList();
+        List<String> operations = best.size() == 1 ? List.of(binding.template.operation.name())
+                : best.stream().map(each -> each.template.operation.name()).distinct().toList();
         return new Message(Kind.REQUEST, operations, RequestWords.of(binding), text,
                 full ? groups(binding, pieces) : List.of(), binding.faults, facts(binding, pieces));
     }
@@ -47,18 +49,20 @@ final class RequestReader {
     }
 
     private static Message header(String text, String request, List<Cut.Piece> pieces,
-            int refused) {
+            int refused, boolean full) {
         Map<String, String> facts = headerFacts(pieces);
+        List<Group> fields = full ? List.of(new Group("fields", named(pieces, "account")))
+                                  : List.of();
         if (refused <= 0) {
-            return new Message(Kind.HEADER, List.of(), "header of a request", text,
-                    List.of(new Group("fields", named(pieces, "account"))), List.of(), facts);
+            return new Message(Kind.HEADER, List.of(), "header of a request", text, fields,
+                    List.of(), facts);
         }
         String said = request.substring(refused);
         String english = Dictionary.get().english(said);
         facts.put("outcome", "refused");
-        List<Group> groups = List.of(new Group("fields", named(pieces, "account")),
-                new Group("message", List.of(new Field(refused, "", said,
-                        "message of the library", english))));
+        List<Group> groups = new ArrayList<>(fields);
+        groups.add(new Group("message", List.of(new Field(refused, "", said,
+                "message of the library", english))));
         return new Message(Kind.MESSAGE, List.of(), "refused by the library: "
                         + (english.isEmpty() ? said : english), text, groups, List.of(), facts);
     }

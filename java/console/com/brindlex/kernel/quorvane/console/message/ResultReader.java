@@ -6,6 +6,7 @@ import com.brindlex.kernel.quorvane.console.dictionary.Reply;
 import java.math.BigDecimal;
 import java.util.ArrayList;
 import java.util.HashMap;
+import java.util.IdentityHashMap;
 import java.util.List;
 import java.util.Map;
 import java.util.regex.Matcher;
@@ -16,6 +17,7 @@ final class ResultReader {
     private static final Pattern LIST = Pattern.compile("(?s)([0-9]{1,9})!(.*)");
     private static final Pattern SECTION = Pattern.compile("<([0-9])>!([0-9]{1,9})!");
     private static final String NOTICE = "<M>@";
+    private static final Map<Reply.Table, Integer> PLACES = countPlaces();
 
     private final String text;
     private final List<Fault> faults = new ArrayList<>();
@@ -25,6 +27,26 @@ final class ResultReader {
     private final boolean isList;
     private final int places;
     private int records;
+
+    private static Map<Reply.Table, Integer> countPlaces() {
+        Map<Reply.Table, Integer> places = new IdentityHashMap<>();
+        for (Operation operation : Dictionary.get().operations()) {
+            Reply reply = Dictionary.get().reply(operation.name());
+            if (reply != null) {
+                reply.tables().forEach(each -> places.put(each, countPlaces(each)));
+            }
+        }
+        return places;
+    }
+
+    private static int countPlaces(Reply.Table table) {
+        int places = 0;
+        for (Reply.Column column : table.columns()) {
+            int empty = column.empty() == null ? 1 : column.empty();
+            places = Math.max(places, column.at() + empty);
+        }
+        return places;
+    }
 
     private ResultReader(String text, boolean full) {
         this.full = full;
@@ -94,12 +116,7 @@ final class ResultReader {
     }
 
     private static int places(Reply.Table table) {
-        int places = 0;
-        for (Reply.Column column : table.columns()) {
-            int empty = column.empty() == null ? 1 : column.empty();
-            places = Math.max(places, column.at() + empty);
-        }
-        return places;
+        return PLACES.get(table);
     }
 
     private String take(Reply reply) {

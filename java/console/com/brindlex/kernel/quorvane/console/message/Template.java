@@ -110,6 +110,18 @@ final class Template {
         return null;
     }
 
+    /** Whether fields with these tags have the fixed values of this form, too. */
+    boolean hasConstants(List<Cut.Piece> pieces) {
+        for (int i = 0; i < slots.size(); i++) {
+            List<Part> parts = slots.get(i).parts();
+            boolean fixed = parts.size() == 1 && !parts.get(0).isPlace();
+            if (fixed && !pieces.get(i).value().equals(parts.get(0).literal())) {
+                return false;
+            }
+        }
+        return true;
+    }
+
     boolean has(String tag) {
         return slots.stream().anyMatch(slot -> slot.tag().equals(tag));
     }

@@ -1,5 +1,6 @@
 package com.brindlex.kernel.quorvane.console.timeline;
 
+import com.brindlex.kernel.quorvane.console.Newest;
 import com.brindlex.kernel.quorvane.console.dictionary.Dictionary;
 import com.brindlex.kernel.quorvane.console.dictionary.Operation;
 import com.brindlex.kernel.quorvane.console.log.LogHeader;
@@ -10,7 +11,6 @@ import com.brindlex.kernel.quorvane.console.message.Kind;
 import com.brindlex.kernel.quorvane.console.message.Message;
 import com.brindlex.kernel.quorvane.console.message.MessageReader;
 import java.util.ArrayList;
-import java.util.LinkedHashMap;
 import java.util.List;
 import java.util.Map;
 
@@ -26,22 +26,17 @@ public final class Timeline {
     private static final String UNLOGGED = "FutQueryOrderDecode";
 
     private final Pending pending = new Pending();
-    private final Map<String, Call> calls = new LinkedHashMap<>(16, 0.75f, true) {
-        private static final long serialVersionUID = 1;
-
-        @Override
-        protected boolean removeEldestEntry(Map.Entry<String, Call> eldest) {
-            return size() > MOST_THREADS;
-        }
-    };
+    private final Map<String, Call> calls = new Newest<>(MOST_THREADS);
     private String lastReply = "";
     private String lastResult = "";
+    private Message lastRead;
+    private List<String> lastDecoders = List.of();
 
     /** The row of the next message of the log; null when the message makes none. */
     public Event accept(LogMessage source) {
         String thread = thread(source.header());
         Call call = calls.computeIfAbsent(thread, each -> new Call());
-        Kind kind = MessageReader.kind(source.text());
+        Kind kind = source.kind();
         return switch (kind) {
             case REQUEST -> request(source, call);
             case REPLY -> reply(source, call);
@@ -68,12 +63,23 @@ public final class Timeline {
         return pending.waiting();
     }
 
+    /** What a message says; one that comes twice in a row is read once. */
+    private Message glance(LogMessage source, List<String> decoders) {
+        boolean again = lastRead != null && lastRead.text().equals(source.text())
+                && lastDecoders.equals(decoders);
+        if (!again) {
+            lastRead = MessageReader.glance(source.kind(), source.text(), decoders);
+            lastDecoders = decoders;
+        }
+        return lastRead;
+    }
+
     private static String thread(LogHeader header) {
         return header == null ? "" : header.process() + ":" + header.thread();
     }
 
     private Event request(LogMessage source, Call call) {
-        Message message = MessageReader.glance(source.text(), List.of());
+        Message message = glance(source, List.of());
         if (message.kind() == Kind.HEADER) {
             call.header = message;
             return null;
@@ -98,19 +104,21 @@ public final class Timeline {
         List<String> named = named(call);
         Pending.Request request = id.isEmpty() ? null : pending.take(id);
         lastReply = source.text();
+        if (repeated && request == null && !id.isEmpty()) {
+            return null;  // an app may decode a reply twice, or log it, too
+        }
         List<String> decoders = request != null && !request.decoders().isEmpty()
                 ? readers(request.decoders(), named) : named;
-        Message message = MessageReader.glance(source.text(), decoders);
+        Message message = glance(source, decoders);
         if (request == null && id.isEmpty()) {
             request = message.operations().isEmpty()
                     ? null : pending.takeOldest(message.operations());
             request = request != null || !decoders.isEmpty()
                     ? request : pending.takeOldest(family(message));
             if (request != null && decoders.isEmpty()) {
-                message = MessageReader.glance(source.text(), request.decoders());
+                message = glance(source, request.decoders());
             }
         }
-        // an app may decode a reply twice, or log it, too
         return request == null && repeated ? null
                                            : row(source, message, request, status(message));
     }
@@ -164,7 +172,7 @@ public final class Timeline {
             call.isAsked = true;
             return row(source, refused(source, call), null, "refused");
         }
-        Message guessed = MessageReader.glance(source.text(), List.of());
+        Message guessed = glance(source, List.of());
         List<String> decoders = kind == Kind.RESULT ? guessed.operations() : ofClass(call);
         Pending.Request request = pending.takeOldest(decoders);
         boolean repeated = source.text().equals(lastResult);
@@ -173,13 +181,13 @@ public final class Timeline {
             return null;  // an app may decode a reply twice
         }
         Message message = request == null || kind == Kind.MESSAGE ? guessed
-                : MessageReader.glance(source.text(), request.decoders());
+                : glance(source, request.decoders());
         return row(source, message, request, status(message));
     }
 
     /** A message of the library, with what the header tells of the request that was not built. */
-    private static Message refused(LogMessage source, Call call) {
-        Message said = MessageReader.glance(source.text(), List.of());
+    private Message refused(LogMessage source, Call call) {
+        Message said = glance(source, List.of());
         return call.header == null ? said : new Message(said.kind(), List.of(), said.words(),
                 said.text(), said.groups(), said.faults(), call.header.facts());
     }

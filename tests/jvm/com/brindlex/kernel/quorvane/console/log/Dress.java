@@ -13,8 +13,12 @@ public enum Dress {
     PROCESS_UID("D(u0_a1: 1234) ", "  (gatewayjni)", false),
     TAG("D/gatewayjni: ", "", false),
     THREAD("D( 1234: 5678) ", "", false),
+    THREAD_UID("D(10123: 1234: 5678) ", "", false),
     RAW("", "", false),
     TIME("{MM-dd HH:mm:ss.SSS} D/gatewayjni( 1234): ", "", false),
+    TIME_UID("{MM-dd HH:mm:ss.SSS} D/gatewayjni(10123: 1234): ", "", false),
+    TIME_YEAR_ZONE("{yyyy-MM-dd HH:mm:ss.SSS} +0800 D/gatewayjni( 1234): ", "", false),
+    TIME_EPOCH("         {epoch}000 D/gatewayjni( 1234): ", "", false),
     TIME_OLD_STUDIO("{MM-dd HH:mm:ss.SSS}: D/gatewayjni(1234): ", "", false),
     THREADTIME("{MM-dd HH:mm:ss.SSS}  1234  5678 D gatewayjni: ", "", false),
     THREADTIME_PADDED("{MM-dd HH:mm:ss.SSS}  1234  5678 D gatewayjni  : ", "", false),
@@ -28,7 +32,14 @@ public enum Dress {
     MONOTONIC("  {monotonic}  1234  5678 D gatewayjni: ", "", false),
     COLOUR("\u001B[38;5;231m{MM-dd HH:mm:ss.SSS}  1234  5678 D gatewayjni: ", "\u001B[0m", false),
     COLOUR_OLD("\u001B[34mD/gatewayjni( 1234): ", "\u001B[0m", false),
+    COLOUR_THREAD("\u001B[38;5;40mD( 1234: 5678) ", "\u001B[0m", false),
+    PRINTABLE("{MM-dd HH:mm:ss.SSS}  1234  5678 D gatewayjni: ", "", false),
+    PRINTABLE_RAW("", "", false),
+    PRINTABLE_PROCESS("D( 1234) ", "  (gatewayjni)", false),
     LONG("[ {MM-dd HH:mm:ss.SSS}  1234: 5678 D/gatewayjni ]\n", "\n", true),
+    LONG_UID("[ {MM-dd HH:mm:ss.SSS} u0_a1: 1234: 5678 D/gatewayjni ]\n", "\n", true),
+    LONG_YEAR("[ {yyyy-MM-dd HH:mm:ss.SSS} +0800  1234: 5678 D/gatewayjni ]\n", "\n", true),
+    LONG_EPOCH("[          {epoch}000  1234: 5678 D/gatewayjni ]\n", "\n", true),
     STUDIO("{yyyy-MM-dd HH:mm:ss.SSS}  1234-5678  gatewayjni              "
             + "com.example.app                      D  ", "", true),
     STUDIO_OLD("{yyyy-MM-dd HH:mm:ss.SSS} 1234-5678/com.example.app D/gatewayjni: ", "", true),
@@ -62,11 +73,17 @@ public enum Dress {
             // the line feed at the end of a message makes no line of its own, but on the host
             boolean feed = this != HOST && text.endsWith("\n");
             text = feed ? text.substring(0, text.length() - 1) : text;
+            text = name().startsWith("PRINTABLE") ? printable(text) : text;
             String more = whole ? this == STUDIO ? " ".repeat(head.length()) : "" : foot + head;
             String gap = whole ? "\n" + more : foot + "\n" + head;
             out.append(head).append(text.replace("\n", gap)).append(foot).append('\n');
         }
         return out.toString();
+    }
+
+    /** A text as {@code -v printable} writes it: tabs and line feeds alone stay as they are. */
+    private static String printable(String text) {
+        return text.replace("\\", "\\\\").replace("\r", "\\r");
     }
 
     private String head(int number) {

@@ -109,6 +109,26 @@ class LogReaderTest {
         assertEquals(List.of("cut-by-log"), flaws(HEAD + request + "\n"));
     }
 
+    /** The header of the line before helps to read the next one, and never decides it. */
+    @Test
+    void blanksBehindAHeaderAreRead() throws IOException {
+        String bare = HEAD.stripTrailing();
+        for (String first : new String[] {bare, HEAD, HEAD + "x", HEAD + " x"}) {
+            String text = first.substring(Math.min(first.length(), HEAD.length()));
+            assertEquals(List.of(text, " y", "~CGatewayPub", "", "z"),
+                    texts(first + "\n" + HEAD + " y\n" + HEAD + "~CGatewayPub\n" + bare + "\n"
+                            + HEAD + "z\n"));
+        }
+        String studio = "2024-01-15 13:45:21.123  1234-5678  gatewayjni  com.example  D";
+        assertEquals(List.of("", " y", "x", "z"), texts(studio + "\n" + studio + "   y\n" + studio
+                + "  x\n" + studio + " z\n"));
+        String other = HEAD.replace("5678", "5679").replace("21.123", "21.1234");
+        List<LogMessage> read = RecordedLog.read(HEAD + "x\n" + other + "y\n" + HEAD + "z\n");
+        assertEquals(List.of("5678", "5679", "5678"),
+                read.stream().map(each -> each.header().thread()).toList());
+        assertEquals("01-15 13:45:21.1234", read.get(1).header().time());
+    }
+
     @Test
     void oneMessageDoesNotSwallowTheNext() throws IOException {
         String open = REGISTER + "QUJD";
@@ -166,41 +186,5 @@ class LogReaderTest {
             logging.close();
             assertNull(reader.next(line -> { }));
         }
-    }
-
-    /** A log of any length goes through a heap that could not hold it. */
-    @Test
-    void memoryDoesNotGrowWithTheLog() throws IOException {
-        byte[] part = (HEAD + LOGIN + "\n" + HEAD + "F=7|65=0013452107|68=0000|01=\n")
-                .getBytes(StandardCharsets.UTF_8);
-        int parts = 20_000;
-        InputStream log = new InputStream() {
-            private long at;
-
-            @Override
-            public int read() {
-                return at < (long) parts * part.length ? part[(int) (at++ % part.length)] : -1;
-            }
-        };
-        Runtime machine = Runtime.getRuntime();
-        long read = 0;
-        long most = 0;
-        try (LogReader reader = new LogReader(new LineReader(log, StandardCharsets.UTF_8),
-                LogReader.TAG)) {
-            var timeline = new com.brindlex.kernel.quorvane.console.timeline.Timeline();
-            System.gc();
-            long before = machine.totalMemory() - machine.freeMemory();
-            for (LogMessage each = reader.next(line -> { }); each != null && read < 30_000;
-                    each = reader.next(line -> { })) {
-                timeline.accept(each);
-                if (++read % 10_000 == 0) {
-                    System.gc();
-                    most = Math.max(most, machine.totalMemory() - machine.freeMemory() - before);
-                }
-            }
-        }
-        long kept = most;
-        assertEquals(30_000, read);
-        assertTrue(kept < 4_000_000, () -> kept + " bytes kept of " + 15_000L * part.length);
     }
 }

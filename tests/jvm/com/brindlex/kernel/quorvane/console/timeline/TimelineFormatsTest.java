@@ -88,6 +88,8 @@ class TimelineFormatsTest {
         List<String> wanted = said(rows(log));
         assertEquals(wanted, said(rows(log.replace("\n", "\r\n"))));
         String others = "01-15 13:45:22.000   900   901 I ActivityManager: F=x|start|proc\n"
+                + "01-15 13:45:22.000  1000  1200 I am_proc_start: [User=0,PID=77,UID=10123,"
+                + "Process Name=com.example.app,Type=activity,Component=12!34@5!]\n"
                 + "--------- switch to system\n"
                 + "01-15 13:45:22.000  1234  9999 W OtherTag: 12!34@5!\n\n";
         assertEquals(wanted, said(rows(log.replace("D gatewayjni: ~CGatewayPub\n",

@@ -4,7 +4,15 @@ import static org.junit.jupiter.api.Assertions.assertEquals;
 import static org.junit.jupiter.api.Assertions.assertFalse;
 import static org.junit.jupiter.api.Assertions.assertTrue;
 
+import com.brindlex.kernel.quorvane.console.log.LineReader;
+import com.brindlex.kernel.quorvane.console.log.LogReader;
+import java.io.ByteArrayInputStream;
 import java.io.IOException;
+import java.io.InputStream;
+import java.io.SequenceInputStream;
+import java.nio.charset.StandardCharsets;
+import java.util.ArrayList;
+import java.util.Enumeration;
 import java.util.List;
 import org.junit.jupiter.api.Test;
 
@@ -123,6 +131,48 @@ class TimelineTest {
         assertTrue(rows.get(0).isFailure());
         assertEquals("signature-mismatch", rows.get(0).faults().get(0).kind());
         assertEquals(0, rows.get(1).requestLine());
+    }
+
+    /** A log of any length goes through the same memory, though most of its requests wait. */
+    @Test
+    void memoryDoesNotGrowWithTheLog() throws IOException {
+        int unit = 10_000;
+        List<Long> used = new ArrayList<>();
+        try (LogReader reader = new LogReader(new LineReader(new SequenceInputStream(
+                new LongLog()), StandardCharsets.UTF_8), LogReader.TAG)) {
+            Timeline timeline = new Timeline();
+            for (int read = 1; read <= 8 * unit; read++) {
+                timeline.accept(reader.next(line -> { }));
+                if (read % (2 * unit) == 0) {
+                    System.gc();
+                    used.add(Runtime.getRuntime().totalMemory()
+                            - Runtime.getRuntime().freeMemory());
+                }
+            }
+        }
+        long grown = used.get(3) - used.get(0);
+        assertTrue(grown < 2_000_000, () -> grown + " bytes more for 60,000 messages: " + used);
+    }
+
+    /** Two requests, of which one is answered, over and over: with ids and threads of their own. */
+    private static final class LongLog implements Enumeration<InputStream> {
+        private int count;
+
+        @Override
+        public boolean hasMoreElements() {
+            return count < 20_000;
+        }
+
+        @Override
+        public InputStream nextElement() {
+            count++;
+            String id = String.format("1345%04d", count % 10_000);
+            String text = at(count % 50_000, count, login(id))
+                    + at(count % 50_000, count, credit("14" + id.substring(2), "2330"))
+                    + at(count % 50_000, count, "F=7|65=00" + id + "|68=E002|M2=" + count + "|")
+                    + at(count % 50_000, count, "~CGatewayPub");
+            return new ByteArrayInputStream(text.getBytes(StandardCharsets.UTF_8));
+        }
     }
 
     @Test
