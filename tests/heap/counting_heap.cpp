@@ -15,9 +15,12 @@ namespace {
 thread_local bool t_bCounting = false;
 thread_local int t_nAllocations = 0;
 thread_local int t_nReleases = 0;
+thread_local size_t t_nBytes = 0;
 
-void Count() {
-  if (t_bCounting) ++t_nAllocations;
+void Count(size_t bytes) {
+  if (!t_bCounting) return;
+  ++t_nAllocations;
+  t_nBytes += bytes;
 }
 
 // Where the library's code lies.
@@ -104,6 +107,7 @@ bool GiveGuardedBack(const void* data) {
 CHeapCount::CHeapCount() {
   t_nAllocations = 0;
   t_nReleases = 0;
+  t_nBytes = 0;
   t_bCounting = true;
 }
 
@@ -113,6 +117,10 @@ CHeapCount::~CHeapCount() {
 
 int CHeapCount::Allocations() const {
   return t_nAllocations;
+}
+
+size_t CHeapCount::Bytes() const {
+  return t_nBytes;
 }
 
 int CHeapCount::Releases() const {
@@ -160,7 +168,7 @@ void* __libc_realloc(void* block, size_t size);
 void __libc_free(void* block);
 
 void* malloc(size_t size) noexcept {
-  gateway_tests::Count();
+  gateway_tests::Count(size);
   const void* const caller = __builtin_return_address(0);
   if (gateway_tests::Refuses(caller)) return nullptr;
   if (gateway_tests::t_bGuarding && gateway_tests::IsOfLibrary(caller)) {
@@ -170,13 +178,13 @@ void* malloc(size_t size) noexcept {
 }
 
 void* calloc(size_t count, size_t size) noexcept {
-  gateway_tests::Count();
+  gateway_tests::Count(count * size);
   if (gateway_tests::Refuses(__builtin_return_address(0))) return nullptr;
   return __libc_calloc(count, size);
 }
 
 void* realloc(void* block, size_t size) noexcept {
-  gateway_tests::Count();
+  gateway_tests::Count(size);
   return __libc_realloc(block, size);
 }
 

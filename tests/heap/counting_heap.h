@@ -13,6 +13,8 @@ class CHeapCount {
   ~CHeapCount();
 
   int Allocations() const;
+  // Bytes asked for, all blocks together.
+  size_t Bytes() const;
   int Releases() const;
 };
 
