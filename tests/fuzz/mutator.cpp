@@ -259,7 +259,7 @@ class CMutator {
     const size_t at = Below(m_fields.Size());
     const size_t other = Below(m_fields.Size());
     std::string_view& field = m_fields[at];
-    switch (Below(12)) {
+    switch (Below(13)) {
       case 0:
       case 1:
         m_fields.Insert(other + 1, Field());
@@ -290,10 +290,26 @@ class CMutator {
       case 10:
         m_fields.Cut(at + 1);
         break;
+      case 11:
+        field = AtBound(field);
+        break;
       default:
         CopyRecord(at, other);
     }
     return m_fields.Join(m_scratch, m_nMax);
+  }
+
+  // A field whose value just fits the buffer of its tag, or just does not.
+  std::string_view AtBound(std::string_view field) {
+    const size_t end = field.find('=');
+    if (end == std::string_view::npos) return field;
+    size_t bound = 0;
+    for (const TagBound& row : kTagBounds) {
+      if (field.substr(0, end) == row.tag && (bound == 0 || Below(2) == 0)) bound = row.bound;
+    }
+    if (bound == 0) return field;
+    const size_t size = bound - Below(2);
+    return m_scratch.Concatenate({field.substr(0, end + 1), FillOf<'0', '9', 'x'>(Below(3), size)});
   }
 
   // Repeats, or takes out, the record that begins next behind `at`.

@@ -1,8 +1,10 @@
 // What a fuzzing run needs of the golden cases:
 //
-//   PREPARE seeds VECTORS CALLS READERS   one seed for each golden case in the two folders
-//   PREPARE dictionary                    prints the wire's tags and texts, as libFuzzer reads them
+//   PREPARE seeds VECTORS CALLS READERS RECORDS   one seed for each golden case in each folder that
+//                                                 is for such cases
+//   PREPARE dictionary   prints the wire's tags and texts, as libFuzzer reads them
 
+#include <algorithm>
 #include <cstdio>
 #include <cstring>
 #include <filesystem>
@@ -37,9 +39,14 @@ FuzzArgument AsFuzzArgument(const Argument& golden) {
           golden.text.has_value() ? std::string_view(*golden.text) : std::string_view()};
 }
 
-void WriteSeeds(const char* vectors, const char* calls, const char* readers) {
-  std::filesystem::create_directories(calls);
-  std::filesystem::create_directories(readers);
+// The number of a decoder among decoders.
+size_t DecoderNumber(const gateway_tests::Export* row) {
+  return static_cast<size_t>(std::count_if(
+      AllExports(), row, [](const gateway_tests::Export& each) { return each.IsDecoder(); }));
+}
+
+void WriteSeeds(const char* vectors, const char* calls, const char* readers, const char* records) {
+  for (const char* folder : {calls, readers, records}) std::filesystem::create_directories(folder);
   for (const GoldenCase& golden : gateway_tests::ReadGoldenCases(vectors).cases) {
     const gateway_tests::Export* const row = FindExport(golden.operation);
     const std::string name = golden.file + "-" + std::to_string(golden.line);
@@ -49,6 +56,8 @@ void WriteSeeds(const char* vectors, const char* calls, const char* readers) {
     for (const Argument& argument : golden.arguments) call.Add(AsFuzzArgument(argument));
     Write(std::filesystem::path(calls) / name, call);
     if (!row->IsDecoder()) continue;
+    call.row = DecoderNumber(row);
+    Write(std::filesystem::path(records) / name, call);
     FuzzCall reading;
     reading.Add({'b', false, -1, {}});
     reading.Add({'b', false, 1, {}});
@@ -74,12 +83,12 @@ void PrintDictionary() {
 }  // namespace gateway_fuzz
 
 int main(int argc, char** argv) {
-  if (argc == 5 && std::strcmp(argv[1], "seeds") == 0) {
-    gateway_fuzz::WriteSeeds(argv[2], argv[3], argv[4]);
+  if (argc == 6 && std::strcmp(argv[1], "seeds") == 0) {
+    gateway_fuzz::WriteSeeds(argv[2], argv[3], argv[4], argv[5]);
   } else if (argc == 2 && std::strcmp(argv[1], "dictionary") == 0) {
     gateway_fuzz::PrintDictionary();
   } else {
-    std::fputs("usage: seeds VECTORS CALLS READERS | dictionary\n", stderr);
+    std::fputs("usage: seeds VECTORS CALLS READERS RECORDS | dictionary\n", stderr);
     return 1;
   }
   return 0;

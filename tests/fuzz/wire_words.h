@@ -13,6 +13,15 @@ inline constexpr const char* kTags[] = {
     // What stands around records, what requests carry, and near misses.
     "00", "01", "M22", "10", "11", "13", "14", "15", "0", "6", "M", "7511", ""};
 
+// The size of the buffer that a tag's value must fit; decoders differ.
+struct TagBound {
+  const char* tag;
+  size_t bound;
+};
+inline constexpr TagBound kTagBounds[] = {
+#include "tests/fuzz/wire_bounds.inc"
+};
+
 // Values of fields, and texts that a host passes.
 inline constexpr const char* kValues[] = {"",
                                           " ",
