@@ -7,7 +7,7 @@ GROUP = "com.brindlex.kernel.quorvane"
 
 @dataclass(frozen=True)
 class Library:
-    """A library of others that an artifact carries inside: its coordinates, its jar, its licence."""
+    """A library of others that an artifact carries: its coordinates, its jar, its licence."""
 
     group: str
     name: str

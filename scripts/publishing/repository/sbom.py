@@ -1,4 +1,4 @@
-"""The list of contents, in the form of CycloneDX 1.4: every artifact and what each carries inside."""
+"""The list of contents, in the form of CycloneDX 1.4: every artifact and what each carries."""
 
 import json
 import uuid
@@ -18,7 +18,8 @@ def of(artifacts, group, version):
     components += sorted(map(_library, carried), key=lambda component: component["bom-ref"])
     root = {"type": "library", "bom-ref": f"quorvane@{version}", "group": GROUP, "name": "quorvane",
             "version": version}
-    edges = [_edge(_purl(artifact, version), [_purl_of(GROUP, name, version) for name in artifact.uses]
+    edges = [_edge(_purl(artifact, version),
+                   [_purl_of(GROUP, name, version) for name in artifact.uses]
                    + [_library(library)["bom-ref"] for library in artifact.carries])
              for artifact in artifacts]
     edges.append(_edge(root["bom-ref"], [_purl(artifact, version) for artifact in artifacts]))

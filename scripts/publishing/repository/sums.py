@@ -14,12 +14,13 @@ def write(folder):
     """Writes the sums of every file of the repository, in place of those that were there."""
     for old in [path for kind in _KINDS for path in folder.rglob(f"*.{kind}")]:
         old.unlink()
-    files = sorted((path for path in folder.rglob("*") if path.is_file() and path.name != _ALL), key=str)
+    files = [path for path in folder.rglob("*") if path.is_file() and path.name != _ALL]
     lines = []
-    for path in files:
+    for path in sorted(files, key=str):
         data = path.read_bytes()
         lines.append(f"{sha256(data)}  {path.relative_to(folder)}\n")
         if path.parent != folder:
             for kind in _KINDS:
-                path.with_name(f"{path.name}.{kind}").write_text(hashlib.new(kind, data).hexdigest())
+                beside = path.with_name(f"{path.name}.{kind}")
+                beside.write_text(hashlib.new(kind, data).hexdigest())
     (folder / _ALL).write_text("".join(lines))
