@@ -7,6 +7,7 @@ import com.brindlex.kernel.quorvane.client.Platform;
 import com.brindlex.kernel.quorvane.client.RawRequest;
 import com.brindlex.kernel.quorvane.client.Session;
 import com.brindlex.kernel.quorvane.client.TradeDate;
+import java.math.BigDecimal;
 import java.util.ArrayList;
 import java.util.LinkedHashMap;
 import java.util.List;
@@ -53,7 +54,7 @@ public final class WrittenRequest {
 
     /**
      * What the natives take for what was written: {@code BUY} is B, 600.5 is 60050 hundredths,
-     * 2026-11-21 is 1151121. What they take already stays as it is.
+     * 600 is 60000, 2026-11-21 is 1151121. Codes, dates and counts as they take them stay.
      *
      * @param texts the text of an argument by its name
      * @throws NotUnderstood when a text is none for its argument
@@ -85,6 +86,25 @@ public final class WrittenRequest {
             request.set(argument.name(), text(texts, argument));
         }
         return request;
+    }
+
+    /** What an argument is for, without how the natives write it: here amounts are written. */
+    public static String purpose(Argument argument) {
+        return argument.purpose().replaceFirst(" \\(`[0-9]+` is [0-9.]+\\)", "");
+    }
+
+    /**
+     * A stock price, as the exchange writes it: 995.00.
+     *
+     * @throws IllegalArgumentException when that is no amount of whole cents
+     */
+    public static String stockPrice(String written) {
+        try {
+            return new BigDecimal(written.strip()).setScale(2).toPlainString();
+        } catch (NumberFormatException | ArithmeticException none) {
+            throw new IllegalArgumentException(
+                    "the price must be an amount such as 995.50, not '" + written + "'");
+        }
     }
 
     /** What to send as the simulated gateway's customer, from a device, today. */

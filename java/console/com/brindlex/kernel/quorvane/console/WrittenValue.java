@@ -1,7 +1,6 @@
 package com.brindlex.kernel.quorvane.console;
 
 import com.brindlex.kernel.quorvane.client.Operation;
-import com.brindlex.kernel.quorvane.client.Price;
 import com.brindlex.kernel.quorvane.client.TradeDate;
 import com.brindlex.kernel.quorvane.console.dictionary.Argument;
 import com.brindlex.kernel.quorvane.console.dictionary.CodeTable;
@@ -19,7 +18,9 @@ import java.util.stream.Collectors;
 final class WrittenValue {
     private static final Pattern DAY =
             Pattern.compile("([0-9]{4})([-/])([0-9]{1,2})\\2([0-9]{1,2})");
-    private static final Pattern AMOUNT = Pattern.compile("[0-9]{1,10}\\.[0-9]{1,10}");
+    private static final Pattern AMOUNT =
+            Pattern.compile("(-?(?:[0-9]{1,3}(?:,[0-9]{3})+|[0-9]{1,10})(?:\\.[0-9]{1,10})?)"
+                    + "(?: +(hundredths|ten-thousandths))?");
     private static final Pattern COUNT =
             Pattern.compile("([0-9]{1,3}(?:,[0-9]{3})+|[0-9]+)(?: +([a-z]+))?");
     private static final Map<String, Integer> DECIMALS =
@@ -89,18 +90,20 @@ final class WrittenValue {
         return fits && !row.listsOnly() && !row.code().contains(" ");
     }
 
-    /** With a point an amount; without one the whole number that the native takes. */
+    /** An amount of money; the whole number that the native takes is told by its unit. */
     private String price(int decimals) {
-        if (!AMOUNT.matcher(text.strip()).matches()) {
-            if (text.strip().matches("-?[0-9]+")) {
-                return text.strip();
-            }
-            throw refused("must be an amount such as 600.5, or a whole number of "
-                    + argument.unit());
+        Matcher amount = AMOUNT.matcher(text.strip());
+        boolean understood = amount.matches()
+                && (amount.group(2) == null || amount.group(2).equals(argument.unit()));
+        if (!understood) {
+            throw refused("must be an amount such as 600 or 600.5, or as in '60050 "
+                    + argument.unit() + "'");
         }
-        BigDecimal shifted = Price.of(text.strip()).amount().movePointRight(decimals);
+        BigDecimal written = new BigDecimal(amount.group(1).replace(",", ""));
+        BigDecimal shifted = amount.group(2) == null ? written.movePointRight(decimals) : written;
         if (shifted.stripTrailingZeros().scale() > 0) {
-            throw refused("must have at most " + decimals + " decimals");
+            throw refused(amount.group(2) == null ? "must have at most " + decimals + " decimals"
+                                                  : "must be whole " + argument.unit());
         }
         return shifted.toBigInteger().toString();
     }

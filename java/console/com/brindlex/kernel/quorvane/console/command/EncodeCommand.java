@@ -31,8 +31,9 @@ final class EncodeCommand implements Callable<Integer> {
         all.mixinStandardHelpOptions(true);
         all.usageMessage().description("Builds a request and writes it.");
         all.usageMessage().footer("", "Values are written as people write them: --side BUY, "
-                + "--price 600.5 (without a point it counts hundredths, for futures "
-                + "ten-thousandths), --date 2026-11-21, --quantity '2 lots'.",
+                + "--price 600 or 600.5, --date 2026-11-21, --quantity '2 lots'. A price as the "
+                + "library takes it is written with its unit: --price '60050 hundredths', for "
+                + "futures '180005000 ten-thousandths'.",
                 "Passwords that are not given are asked for, without showing them; where there is "
                 + "no terminal, and for '-', each is a line of the standard input.");
         all.usageMessage().customSynopsis(

@@ -29,7 +29,7 @@ final class Options {
                             .type(String.class)
                             .paramLabel(argument.type().name().replaceFirst(".*_", ""))
                             .required(given == null && !isPassword(argument))
-                            .description(argument.purpose() + (given == null || given.isBlank()
+                            .description(WrittenRequest.purpose(argument) + (given == null || given.isBlank()
                                             ? "" : "; usually " + given.replace("%", "%%")));
             spec.addOption(given == null ? option.build() : option.defaultValue(given).build());
         }

@@ -7,8 +7,8 @@ import com.brindlex.kernel.quorvane.client.Market;
 import com.brindlex.kernel.quorvane.client.Operation;
 import com.brindlex.kernel.quorvane.client.RawReply;
 import com.brindlex.kernel.quorvane.console.ReplyValues;
-import com.brindlex.kernel.quorvane.console.WrittenRequest;
 import com.brindlex.kernel.quorvane.console.Screen.Style;
+import com.brindlex.kernel.quorvane.console.WrittenRequest;
 import com.brindlex.kernel.quorvane.console.message.Kind;
 import com.brindlex.kernel.quorvane.console.message.Message;
 import com.brindlex.kernel.quorvane.console.message.MessageReader;
@@ -17,7 +17,6 @@ import com.brindlex.kernel.quorvane.simulator.Line;
 import java.io.BufferedReader;
 import java.io.IOException;
 import java.io.InputStreamReader;
-import java.math.BigDecimal;
 import java.nio.charset.StandardCharsets;
 import java.time.Duration;
 import java.util.ArrayList;
@@ -46,7 +45,7 @@ final class SimulateCommand implements Callable<Integer> {
         {"AuthEncode", "send a request; options as of 'quorvane encode', user and device are set"},
         {"F=7|KIND=...", "send a request as it stands"},
         {"set NAME VALUE", "set an option for all requests: set password secret99"},
-        {"fill ORDER SHARES HUNDREDTHS", "the exchange fills a stock order"},
+        {"fill ORDER SHARES PRICE", "the exchange fills a stock order"},
         {"fill-futures ORDER CONTRACTS PRICE [PRICE2]", "the exchange fills a futures order"},
         {"fail ORDER TEXT", "the exchange refuses a stock order"},
         {"fail-futures ORDER TEXT", "the exchange refuses a futures order"},
@@ -148,7 +147,7 @@ final class SimulateCommand implements Callable<Integer> {
                 return true;
             case "fill":
                 gateway.fillStock(words.get(1), Long.parseLong(words.get(2)),
-                        BigDecimal.valueOf(Long.parseLong(words.get(3)), 2).toPlainString());
+                        WrittenRequest.stockPrice(words.get(3)));
                 return true;
             case "fill-futures":
                 gateway.fillFutures(words.get(1), Long.parseLong(words.get(2)), words.get(3),

@@ -11,7 +11,6 @@ import com.brindlex.kernel.quorvane.console.message.Message;
 import com.brindlex.kernel.quorvane.console.message.MessageReader;
 import com.brindlex.kernel.quorvane.simulator.Gateway;
 import com.brindlex.kernel.quorvane.simulator.Line;
-import java.math.BigDecimal;
 import java.util.HashMap;
 import java.util.LinkedHashMap;
 import java.util.List;
@@ -90,7 +89,7 @@ final class SessionPlace {
         String order = texts.getOrDefault("order", "");
         switch (TryPlace.text(texts, "act")) {
             case "fill" -> gateway.fillStock(order, number(texts, "quantity"),
-                    BigDecimal.valueOf(number(texts, "price"), 2).toPlainString());
+                    WrittenRequest.stockPrice(TryPlace.text(texts, "price")));
             case "fill-futures" -> gateway.fillFutures(order, number(texts, "quantity"),
                     TryPlace.text(texts, "price"), texts.getOrDefault("price2", ""));
             case "fail" -> gateway.failStock(order, TryPlace.text(texts, "text"));

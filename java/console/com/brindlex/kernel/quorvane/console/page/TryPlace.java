@@ -52,7 +52,7 @@ final class TryPlace {
         var known = Dictionary.get().operation(operation.method()).argument(argument.name());
         Map<String, Object> input = new LinkedHashMap<>();
         input.put("name", argument.name());
-        input.put("purpose", argument.purpose().replace("`", ""));
+        input.put("purpose", WrittenRequest.purpose(argument).replace("`", ""));
         input.put("required", argument.usual() == null);
         String example = known == null || known.example() == null ? "" : known.example();
         String usual = sample(operation, argument.name());

@@ -4,7 +4,7 @@ import { allForms, choice, inputs, problems, written } from './try.js';
 
 const ACTS = {
   fill: ['Fill a stock order', ['order', 'A0001'], ['quantity', '1000', 'shares'],
-    ['price', '99500', 'hundredths']],
+    ['price', '995.00']],
   'fill-futures': ['Fill a futures order', ['order', 'F0001'], ['quantity', '1', 'contracts'],
     ['price', '17500'], ['price2', '', 'of leg 2']],
   fail: ['Refuse a stock order', ['order', 'A0001'], ['text', '交易所退單!']],

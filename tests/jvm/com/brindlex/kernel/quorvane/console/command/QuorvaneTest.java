@@ -117,7 +117,8 @@ class QuorvaneTest {
 
     @Test
     void valuesAreWrittenAsPeopleWriteThem() {
-        String plain = untimed(order("--price", "60050", "--order-date", "1151121"));
+        String plain = untimed(order("--price", "60050 hundredths", "--order-date", "1151121"));
+        assertTrue(plain.contains("|31=600.50|"), plain);
         assertTrue(plain.contains("|32=B|"), plain);
         assertEquals(plain, untimed(order("--price", "600.5", "--order-date", "2026-11-21")));
         for (String side : new String[] {"BUY", "buy", "b", "B"}) {
@@ -125,8 +126,10 @@ class QuorvaneTest {
                     "--side", side, "--quantity", "2 lots")));
         }
         String sold = untimed(order("--price", "1005.0", "--side", "SELL", "--quantity", "1,000"));
-        assertEquals(untimed(order("--price", "100500", "--side", "S", "--quantity", "1000")),
-                sold);
+        for (String price : new String[] {"1005", "1,005", "1005.00", "100500 hundredths"}) {
+            assertEquals(sold, untimed(order("--price", price, "--side", "S", "--quantity",
+                    "1000")), price);
+        }
         String up = untimed(order("--price-kind", "LIMIT_UP"));
         assertEquals(untimed(order("--price-kind", "9")), up);
         String odd = untimed(order("--trade-type", "odd-lot", "--quantity", "500 shares"));
@@ -138,7 +141,7 @@ class QuorvaneTest {
         String[] order = {"--commodity1", "TXF", "--month1", "202612", "--order-kind", "futures",
             "--side1", "sell", "--quantity", "2 contracts", "--price"};
         Run plain = run("", words("encode", "FutSubmitOrderEncode", DEVICE, USER, order,
-                new String[] {"180005000"}));
+                new String[] {"180005000 ten-thousandths"}));
         Run written = run("", words("encode", "FutSubmitOrderEncode", DEVICE, USER, order,
                 new String[] {"18000.5"}));
         assertEquals(untimed(plain), untimed(written));
@@ -150,7 +153,10 @@ class QuorvaneTest {
             {"--side", "HOLD", "side must be B (BUY), S (SELL), not 'HOLD'"},
             {"--side", "X", "side must be B (BUY), S (SELL), not 'X'"},
             {"--price", "600.505", "price must have at most 2 decimals, not '600.505'"},
-            {"--price", "cheap", "price must be an amount such as 600.5"},
+            {"--price", "cheap", "price must be an amount such as 600 or 600.5"},
+            {"--price", "60050 ten-thousandths", "price must be an amount such as 600 or 600.5"},
+            {"--price", "60050 lots", "price must be an amount such as 600 or 600.5"},
+            {"--price", "6,00", "price must be an amount such as 600 or 600.5"},
             {"--order-date", "2026-02-30", "orderDate must be a day of the calendar"},
             {"--order-date", "1151341", "orderDate must be a day such as 2026-11-21"},
             {"--quantity", "500 shares", "quantity is counted in lots here, not '500 shares'"},
@@ -257,12 +263,13 @@ class QuorvaneTest {
 
     @Test
     void playsASession() {
-        Run session = run("AuthEncode\nSubmitOrder --stock-code 2330 --quantity 2 --price 99500 "
-                        + "--side B --handling-flag 1\nfill A0001 1000 99500\nQueryReply\nquit\nbogus\n",
+        Run session = run("AuthEncode\nSubmitOrder --stock-code 2330 --quantity 2 --price 995 "
+                        + "--side B --handling-flag 1\nfill A0001 1000 994.50\nQueryReply\nquit\nbogus\n",
                 "simulate");
         assertEquals(0, session.code, session.err);
         assertTrue(session.out.contains("台北證券"), session.out);
         assertTrue(session.out.contains("995.00"), session.out);
+        assertTrue(session.out.contains("994.50"), session.out);
         Run wrong = run("AuthEncode --password wrong\nbogus\nset x y\nfill A\nfill A0009 1 1\n",
                 "simulate");
         assertEquals(1, wrong.code);

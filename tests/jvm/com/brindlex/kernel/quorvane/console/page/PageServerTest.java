@@ -169,6 +169,8 @@ class PageServerTest {
         assertTrue(sent.has("text"), sent.toString());
         String java = sent.getAsJsonObject("copies").get("java").getAsString();
         assertTrue(java.contains(".set(\"price\", \"60050\")"), java);
+        java = order("price", "600").getAsJsonObject("copies").get("java").getAsString();
+        assertTrue(java.contains(".set(\"price\", \"60000\")"), java);
         JsonObject refused = order("price", "600.505");
         assertFalse(refused.has("text"), refused.toString());
         JsonObject problem = refused.getAsJsonArray("problems").get(0).getAsJsonObject();
