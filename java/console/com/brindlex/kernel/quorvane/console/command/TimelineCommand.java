@@ -11,6 +11,7 @@ import com.brindlex.kernel.quorvane.console.timeline.Timeline;
 import java.io.IOException;
 import java.util.List;
 import java.util.concurrent.Callable;
+import java.util.regex.Pattern;
 import java.util.stream.Collectors;
 import picocli.CommandLine.Command;
 import picocli.CommandLine.Mixin;
@@ -30,6 +31,9 @@ import picocli.CommandLine.Spec;
 final class TimelineCommand implements Callable<Integer> {
     private static final String CSV_HEAD = "line,time,direction,operation,title,account,instrument,"
             + "words,status,request_id,request_line,millis,faults\r\n";
+
+    private static final Pattern CALCULATED = Pattern.compile("(?!-?[0-9]+\\z)[=+\\-@\t\r]");
+    private static final Pattern SIMPLE = Pattern.compile("[^\",\r\n]*");
 
     @ParentCommand
     private Quorvane parent;
@@ -125,8 +129,11 @@ final class TimelineCommand implements Callable<Integer> {
                 .stream().map(TimelineCommand::quoted).collect(Collectors.joining(",", "", "\r\n"));
     }
 
+    /** A cell that a spreadsheet would calculate is shown as the text that it is. */
     private static String quoted(String cell) {
-        return cell.matches("[^\",\r\n]*") ? cell : "\"" + cell.replace("\"", "\"\"") + "\"";
+        String text = CALCULATED.matcher(cell).lookingAt() ? "'" + cell : cell;
+        return SIMPLE.matcher(text).matches() ? text
+                                              : "\"" + text.replace("\"", "\"\"") + "\"";
     }
 
     private void summary(List<Row> unanswered) {

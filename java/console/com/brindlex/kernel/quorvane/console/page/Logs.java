@@ -43,14 +43,16 @@ public final class Logs {
 
     Map<String, PageServer.Place> places() {
         return Map.of("GET api/start", question -> start(), "POST api/log", this::take,
-                "GET api/rows", question -> Answer.json(find(question).rows(question.number("from"))),
+                "POST api/charset", this::readAgain, "GET api/rows",
+                question -> Answer.json(find(question).rows(question.number("from"))),
                 "GET api/message",
                 question -> Answer.json(find(question).message(question.number("row"))),
                 "POST api/mask", this::mask, "GET api/masked", this::save);
     }
 
     private Answer start() {
-        return Answer.json(followed == null ? Map.of() : Map.of("log", followed, "name", name));
+        return Answer.json(followed == null ? Map.of()
+                : Map.of("log", followed, "name", name, "charset", charset.name()));
     }
 
     private synchronized String add(OpenLog log) {
@@ -76,7 +78,29 @@ public final class Logs {
     private Answer take(Question question) throws IOException {
         boolean pasted = question.value("from").equals("paste");
         OpenLog log = OpenLog.of(question.body(), pasted ? StandardCharsets.UTF_8 : charset, tag);
-        return Answer.json(Map.of("log", add(log)));
+        return Answer.json(Map.of("log", add(log), "charset", charset.name()));
+    }
+
+    /** The same log in another charset, in place of the one that was wrong. */
+    private synchronized Answer readAgain(Question question) throws IOException {
+        OpenLog before = find(question);
+        OpenLog log = before.in(charset(question.value("charset")));
+        before.close();
+        String id = question.value("log");
+        open.remove(id);
+        masked.remove(id);
+        boolean follows = id.equals(followed);
+        String again = add(log);
+        followed = follows ? again : followed;
+        return Answer.json(Map.of("log", again));
+    }
+
+    private static Charset charset(String name) {
+        try {
+            return Charset.forName(name);
+        } catch (IllegalArgumentException unknown) {
+            throw new IllegalArgumentException("this machine has no charset '" + name + "'");
+        }
     }
 
     /** Opens the masked log beside the other, so that what will be sent on is seen first. */

@@ -31,35 +31,43 @@ final class OpenLog {
     static final int MOST_AT_ONCE = 5_000;
 
     private final Source source;
+    private final Charset charset;
     private final String tag;
+    private final Path file;
     private final List<Event> events = new ArrayList<>();
+    private FollowedFile followed;
     private boolean isCut;
 
     /** The bytes of a log, from their beginning. */
     private interface Source {
-        LineReader open() throws IOException;
+        InputStream open() throws IOException;
     }
 
-    private OpenLog(Source source, String tag) {
+    private OpenLog(Source source, Charset charset, String tag, Path file) {
         this.source = source;
+        this.charset = charset;
         this.tag = tag;
+        this.file = file;
     }
 
     /** Reads a log that is whole. */
     static OpenLog of(byte[] bytes, Charset charset, String tag) throws IOException {
-        OpenLog log = new OpenLog(
-                () -> new LineReader(new ByteArrayInputStream(bytes), charset), tag);
-        log.read(log.source.open());
+        return whole(() -> new ByteArrayInputStream(bytes), charset, tag);
+    }
+
+    private static OpenLog whole(Source source, Charset charset, String tag) throws IOException {
+        OpenLog log = new OpenLog(source, charset, tag, null);
+        log.read(log.lines());
         return log;
     }
 
     /** Reads a file, and goes on for as long as it grows. */
     static OpenLog following(Path file, Charset charset, String tag) throws IOException {
-        OpenLog log = new OpenLog(() -> new LineReader(bounded(file), charset), tag);
-        FollowedFile followed = new FollowedFile(file);
+        OpenLog log = new OpenLog(() -> bounded(file), charset, tag, file);
+        log.followed = new FollowedFile(file);
         Thread reader = new Thread(() -> {
             try {
-                log.read(new LineReader(followed, charset));  // waits for the first bytes
+                log.read(new LineReader(log.followed, charset));  // waits for the first bytes
             } catch (IOException ended) {
                 // what was read stays
             }
@@ -67,6 +75,22 @@ final class OpenLog {
         reader.setDaemon(true);
         reader.start();
         return log;
+    }
+
+    /** The same log, read again in another charset. */
+    OpenLog in(Charset other) throws IOException {
+        return file == null ? whole(source, other, tag) : following(file, other, tag);
+    }
+
+    /** Ends to wait for more of it. */
+    void close() throws IOException {
+        if (followed != null) {
+            followed.close();
+        }
+    }
+
+    private LineReader lines() throws IOException {
+        return new LineReader(source.open(), charset);
     }
 
     private static InputStream bounded(Path file) throws IOException {
@@ -122,7 +146,7 @@ final class OpenLog {
     /** The same log without its secrets but those of the kinds {@code kept}, in UTF-8. */
     byte[] masked(Set<Secret> kept) throws IOException {
         ByteArrayOutputStream out = new ByteArrayOutputStream();
-        new MaskedLog(kept).mask(() -> new LogReader(source.open(), tag), line -> write(line, out));
+        new MaskedLog(kept).mask(() -> new LogReader(lines(), tag), line -> write(line, out));
         return out.toByteArray();
     }
 

@@ -23,7 +23,7 @@ public final class PageServer implements Closeable {
 
     private static final int THREADS = 4;
     private static final Set<String> FILES = Set.of("page.html", "page.css", "page.js", "parts.js",
-            "log.js", "try.js", "session.js", "dictionary.js");
+            "log.js", "csv.js", "try.js", "session.js", "dictionary.js");
 
     private final HttpServer server;
     private final ExecutorService threads;

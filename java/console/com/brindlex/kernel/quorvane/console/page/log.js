@@ -1,5 +1,6 @@
 // Log: the timeline on the left, the message taken apart on the right. Only the rows in view are
 // drawn, however many there are.
+import { saveCsv } from './csv.js';
 import { ask, byId, h, messageTable, note } from './parts.js';
 
 const HEIGHT = 46;
@@ -9,6 +10,7 @@ const POLL_MILLIS = 1000;
 const list = byId('log-rows');
 const spacer = h('div');
 let log = null;      // the id of the log at the server
+let file = '';       // the name of the file that is followed; empty for another log
 let rows = [];       // all rows of the timeline
 let shown = [];      // the numbers of those that the filter takes
 let answers = {};    // the number of the answer by the line of its request
@@ -16,9 +18,12 @@ let asked = {};      // the number of a row by its line
 let chosen = -1;     // the number of the row that is shown on the right
 let reading = 0;     // counts logs: an answer about an older one comes too late
 
-async function read(id, name) {
+/** Shows a log; without a charset it is a text, which has none to choose. */
+async function read(id, charset, name) {
   const mine = ++reading;
   log = id;
+  file = name || '';
+  showCharset(charset);
   rows = [];
   answers = {};
   asked = {};
@@ -191,13 +196,30 @@ function key(event) {
   event.preventDefault();
 }
 
+function showCharset(charset) {
+  const select = byId('log-charset');
+  byId('log-in').hidden = !charset;
+  if (charset && ![...select.options].some(each => each.value === charset)) {
+    select.append(h('option', null, charset));
+  }
+  select.value = charset || '';
+}
+
+async function readAgain() {
+  const charset = byId('log-charset').value;
+  const again = await ask('charset?log=' + log + '&charset=' + charset, { method: 'POST' });
+  if (again) {
+    await read(again.log, charset, file);
+  }
+}
+
 async function send(body, from) {
   note('');
   const opened = await ask('log?from=' + from, { method: 'POST', body });
   if (opened) {
     byId('log-save').hidden = true;
     byId('log-filter').value = '';
-    await read(opened.log);
+    await read(opened.log, from === 'file' ? opened.charset : '');
     list.focus();
   }
 }
@@ -258,6 +280,8 @@ export async function openLog(isHere) {
   });
   byId('log-failures').addEventListener('change', filter);
   byId('log-mask').addEventListener('submit', mask);
+  byId('log-csv').addEventListener('click', () => saveCsv(shown.map(number => rows[number])));
+  byId('log-charset').addEventListener('change', readAgain);
   byId('log-other').addEventListener('click', other);
   byId('log-back').addEventListener('click', () => {
     byId('log-open').hidden = true;
@@ -280,6 +304,6 @@ export async function openLog(isHere) {
   drops(isHere);
   const start = await ask('start');
   if (start && start.log) {
-    read(start.log, start.name);
+    read(start.log, start.charset, start.name);
   }
 }

@@ -308,6 +308,8 @@ class QuorvaneTest {
         Run csv = run(LOG, "timeline", "--csv");
         assertTrue(csv.out.startsWith("line,time,direction,"), csv.out);
         assertTrue(csv.out.contains(",1234567,,login,sent,0013452107,,,\r\n"), csv.out);
+        Run calculated = run(LOG.replace("ACNO=1234567", "ACNO==1+2"), "timeline", "--csv");
+        assertTrue(calculated.out.contains(",'=1+2,"), calculated.out);
         Run json = run(LOG, "timeline", "--json");
         assertTrue(json.out.lines().allMatch(line -> line.startsWith("{\"line\":")), json.out);
         assertEquals(1, run("nothing\n", "timeline").code);

@@ -15,6 +15,7 @@ import java.net.InetSocketAddress;
 import java.net.NetworkInterface;
 import java.net.Socket;
 import java.net.URI;
+import java.nio.charset.Charset;
 import java.nio.charset.StandardCharsets;
 import java.nio.file.Files;
 import java.nio.file.Path;
@@ -265,24 +266,85 @@ class PageServerTest {
         assertEquals(400, ask("POST", "api/mask?log=1&keep=password", "").status());
     }
 
-    @Test
-    void aLogIsFollowed(@TempDir Path folder) throws IOException, InterruptedException {
-        Path file = Files.writeString(folder.resolve("a.log"), "");
+    private void follow(Path file) throws IOException {
         server.close();
         Logs logs = new Logs(StandardCharsets.UTF_8, "gatewayjni");
         logs.follow(file);
         server = new PageServer(0, logs);
         address = URI.create(server.address());
-        assertEquals("a.log", ask("GET", "api/start", "").json().get("name").getAsString());
-        for (int wanted = 1; wanted <= 2; wanted++) {
-            Files.writeString(file, REQUEST.replace("452107", "45210" + wanted) + "\n",
-                    StandardOpenOption.APPEND);
-            int total = 0;
-            for (int tries = 0; total < wanted && tries < 200; tries++) {
-                Thread.sleep(100);
-                total = ask("GET", "api/rows?log=1&from=0", "").json().get("total").getAsInt();
+    }
+
+    private static String request(int number) {
+        return REQUEST.replace("452107", "45210" + number) + "\n";
+    }
+
+    /** Waits for so many rows of a log; their request ids. */
+    private String ids(int log, int wanted) throws IOException, InterruptedException {
+        JsonObject seen = new JsonObject();
+        for (int tries = 0; tries < 200; tries++) {
+            seen = ask("GET", "api/rows?from=0&log=" + log, "").json();
+            if (seen.get("total").getAsInt() >= wanted) {
+                break;
             }
-            assertEquals(wanted, total);
+            Thread.sleep(100);
         }
+        StringBuilder ids = new StringBuilder();
+        seen.getAsJsonArray("rows").forEach(row -> ids.append(' ').append(
+                row.getAsJsonObject().get("requestId").getAsString().replaceFirst("^.{9}", "")));
+        return ids.toString().strip();
+    }
+
+    @Test
+    void aLogIsFollowed(@TempDir Path folder) throws IOException, InterruptedException {
+        Path file = Files.writeString(folder.resolve("a.log"), "");
+        follow(file);
+        assertEquals("a.log", ask("GET", "api/start", "").json().get("name").getAsString());
+        Files.writeString(file, request(1), StandardOpenOption.APPEND);
+        assertEquals("1", ids(1, 1));
+        Files.writeString(file, request(2), StandardOpenOption.APPEND);
+        assertEquals("1 2", ids(1, 2));
+    }
+
+    /** Loggers move a file away and begin another one, or empty it and go on. */
+    @Test
+    void aFileThatBeginsAnewIsFollowedOn(@TempDir Path folder)
+            throws IOException, InterruptedException {
+        Path file = Files.writeString(folder.resolve("a.log"), request(1) + "a line without an end");
+        follow(file);
+        assertEquals("1", ids(1, 1));
+        Files.move(file, folder.resolve("a.log.1"));
+        Thread.sleep(500);
+        Files.writeString(file, request(2) + request(3));
+        assertEquals("1 2 3", ids(1, 3));
+        Files.writeString(file, request(4));
+        assertEquals("1 2 3 4", ids(1, 4));
+    }
+
+    @Test
+    void aLogIsReadAgainInAnotherCharset(@TempDir Path folder)
+            throws IOException, InterruptedException {
+        Path file = folder.resolve("a.log");
+        Files.write(file, "F=7|68=E002|M2=密碼錯誤|\n".getBytes(Charset.forName("Big5")));
+        follow(file);
+        ids(1, 1);
+        assertTrue(ask("GET", "api/rows?log=1&from=0", "").body().contains("broken-bytes"));
+        assertEquals("2", ask("POST", "api/charset?log=1&charset=Big5", "").json().get("log")
+                                  .getAsString());
+        ids(2, 1);
+        String rows = ask("GET", "api/rows?log=2&from=0", "").body();
+        assertTrue(rows.contains("密碼錯誤") && !rows.contains("broken-bytes"), rows);
+        assertEquals("2", ask("GET", "api/start", "").json().get("log").getAsString());
+        assertEquals(400, ask("GET", "api/rows?log=1&from=0", "").status());
+        Files.writeString(file, request(4), StandardOpenOption.APPEND);
+        ids(2, 2);
+        for (String name : new String[] {"", "none-such", "../x"}) {
+            assertEquals(400, ask("POST", "api/charset?log=2&charset=" + name, "").status(), name);
+        }
+        String dropped = new String("F=7|68=E002|M2=密碼錯誤|\n".getBytes("Big5"), "ISO-8859-1");
+        Seen opened = send("POST", address.getPath() + "api/log?from=file",
+                dropped.getBytes("ISO-8859-1"), "Host: " + address.getAuthority());
+        assertEquals("UTF-8", opened.json().get("charset").getAsString());
+        ask("POST", "api/charset?charset=Big5&log=" + opened.json().get("log").getAsString(), "");
+        assertTrue(ask("GET", "api/rows?log=4&from=0", "").body().contains("密碼錯誤"));
     }
 }
