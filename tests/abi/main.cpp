@@ -1,8 +1,9 @@
 // abi_digest [--without-log] DIRECTORY [CALLS]: plays the golden cases of a directory and a drawn
 // load of CALLS calls for each export, and prints one digest for each export and one over all:
 // every byte of each result, status and log line counts. It prints the same on every machine,
-// whatever its word size, sign of `char` or compiler. --without-log is for a library with a log of
-// its own, whose lines do not come by here.
+// whatever its word size, sign of `char` or compiler. Each export gets texts with bytes above 0x7F
+// and with characters that are cut, or it fails. --without-log is for a library with a log of its
+// own, whose lines do not come by here.
 
 #include <cstdint>
 #include <cstdio>
@@ -16,6 +17,7 @@
 #include "tests/abi/load.h"
 #include "tests/support/golden_answer.h"
 #include "tests/support/golden_file.h"
+#include "tests/support/modified_utf8.h"
 #include "tests/support/recording_host.h"
 #include "tests/support/surroundings.h"
 
@@ -50,6 +52,26 @@ class CDigest {
   uint64_t m_nValue = 0xCBF29CE484222325U;
 };
 
+// What the arguments of calls held: where the sign of char could tell, and what lies behind.
+struct Held {
+  size_t foreign = 0;  // a byte above 0x7F
+  size_t cut = 0;      // a byte that belongs to no whole character
+
+  void Add(const Arguments& arguments) {
+    bool anyForeign = false;
+    bool anyCut = false;
+    for (const Argument& argument : arguments) {
+      if (!argument.text.has_value()) continue;
+      for (const char c : *argument.text) {
+        anyForeign = anyForeign || static_cast<unsigned char>(c) > 0x7F;
+      }
+      anyCut = anyCut || !IsModifiedUtf8(argument.text->c_str());
+    }
+    foreign += anyForeign ? 1 : 0;
+    cut += anyCut ? 1 : 0;
+  }
+};
+
 class CAbiRun {
  public:
   explicit CAbiRun(bool withLog) : m_bWithLog(withLog) {}
@@ -65,13 +87,20 @@ class CAbiRun {
     if (cases.empty()) return Fault(std::string(row.name), "has no golden case");
     CDraw draw(cases.size());
     CRecordingHost host;
+    Held held;
     for (size_t call = 0; call < calls; ++call) {
       const GoldenCase& golden = *cases[draw.Below(cases.size())];
       SetClockOf(golden);
-      const Outcome outcome = host.Call(row, Disturb(golden.arguments, draw));
+      const Arguments arguments = Disturb(golden.arguments, draw);
+      held.Add(arguments);
+      const Outcome outcome = host.Call(row, arguments);
       if (!outcome.IsSound()) Fault(golden.Where(), "disturbed, is not answered soundly");
       Count(row, outcome);
     }
+    if (held.foreign == 0) Fault(std::string(row.name), "had no text with a byte above 0x7F");
+    if (held.cut == 0) Fault(std::string(row.name), "had no text with a cut character");
+    m_held.foreign += held.foreign;
+    m_held.cut += held.cut;
   }
 
   // Prints the digests; the exit status of the program.
@@ -82,6 +111,8 @@ class CAbiRun {
                   digest.Text().c_str());
       all.Add(digest.Text());
     }
+    std::printf("%zu calls with a byte above 0x7F, %zu with a cut character\n", m_held.foreign,
+                m_held.cut);
     std::printf("all %zu exports, %zu calls %s\n", m_digests.size(), m_nCalls, all.Text().c_str());
     return m_nFaults == 0 && m_digests.size() == kExportCount ? EXIT_SUCCESS : EXIT_FAILURE;
   }
@@ -112,6 +143,7 @@ class CAbiRun {
 
   bool m_bWithLog;
   std::map<std::string_view, CDigest> m_digests;
+  Held m_held;
   size_t m_nCalls = 0;
   size_t m_nFaults = 0;
 };
