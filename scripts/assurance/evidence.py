@@ -90,7 +90,7 @@ def keep(section, data):
     commit = git("rev-parse", "--short", "HEAD").strip()
     stamp = {"digest": digest(section), "commit": commit,
              "date": time.strftime("%Y-%m-%d %H:%M UTC", time.gmtime()), "tools": tools()}
-    KEPT.mkdir(exist_ok=True)
+    KEPT.mkdir(parents=True, exist_ok=True)
     text = json.dumps({**stamp, **data}, ensure_ascii=False, indent=1)
     (KEPT / f"{section}.json").write_text(text + "\n")
     write_page()
