@@ -4,7 +4,6 @@ import java.io.File;
 import java.io.IOException;
 import java.io.InputStream;
 import java.net.URL;
-import java.net.URLConnection;
 import java.nio.file.Files;
 import java.nio.file.LinkOption;
 import java.nio.file.Path;
@@ -31,7 +30,9 @@ final class Unpacked {
         try {
             folder = Files.createTempDirectory(Paths.get(temporary), PREFIX);
             Path file = folder.resolve(name);
-            copy(packed, file);
+            try (InputStream in = packed.openStream()) {
+                Files.copy(in, file);
+            }
             removeLeftBehind(folder, name);
             return file;
         } catch (IOException refused) {
@@ -40,15 +41,6 @@ final class Unpacked {
             }
             throw new UnsatisfiedLinkError("quorvane-host cannot unpack its library into the folder "
                     + temporary + " (" + refused + "); -Djava.io.tmpdir names another");
-        }
-    }
-
-    /** Another class loader may close the jar under a cached connection. */
-    private static void copy(URL packed, Path file) throws IOException {
-        URLConnection connection = packed.openConnection();
-        connection.setUseCaches(false);
-        try (InputStream in = connection.getInputStream()) {
-            Files.copy(in, file);
         }
     }
 

@@ -12,6 +12,7 @@ import com.brindlex.kernel.quorvane.client.StockOrder;
 import com.brindlex.kernel.quorvane.client.StockOrderReceipt;
 import com.brindlex.kernel.quorvane.simulator.Gateway;
 import com.brindlex.kernel.quorvane.simulator.ReadyMade;
+import java.util.List;
 
 /** A device of a user, whose requests go to a gateway. */
 final class Device {
@@ -47,6 +48,6 @@ final class Device {
     /** How many orders stand in the book. */
     int orders() {
         Reply<?> book = ask(requests.stockOrders(gateway.today()));
-        return book.isResult() ? ((java.util.List<?>) book.orThrow()).size() : 0;
+        return book.isResult() ? ((List<?>) book.orThrow()).size() : 0;
     }
 }

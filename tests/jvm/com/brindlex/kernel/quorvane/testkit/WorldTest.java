@@ -7,6 +7,7 @@ import static org.junit.jupiter.api.Assertions.assertTrue;
 import com.brindlex.kernel.quorvane.client.Contract;
 import com.brindlex.kernel.quorvane.client.Credentials;
 import com.brindlex.kernel.quorvane.client.Handling;
+import com.brindlex.kernel.quorvane.client.Operation;
 import com.brindlex.kernel.quorvane.client.Price;
 import com.brindlex.kernel.quorvane.client.Quantity;
 import com.brindlex.kernel.quorvane.client.Reply;
@@ -26,6 +27,13 @@ import java.time.LocalDate;
 import java.time.LocalDateTime;
 import java.time.LocalTime;
 import java.time.ZoneId;
+import java.util.Collections;
+import java.util.HashSet;
+import java.util.List;
+import java.util.Set;
+import java.util.concurrent.ExecutorService;
+import java.util.concurrent.Executors;
+import java.util.concurrent.Future;
 import org.junit.jupiter.api.Test;
 import org.junit.jupiter.api.function.Executable;
 import org.junit.jupiter.params.ParameterizedTest;
@@ -199,6 +207,21 @@ class WorldTest {
         if (!stocksOpen) {
             assertRefused("非交易時間", stock);
         }
+    }
+
+    @Test
+    void threadsMayShareAGateway() throws Exception {
+        Device device = new Device(Gateway.open());
+        ExecutorService threads = Executors.newFixedThreadPool(8);
+        List<Future<String>> numbers = threads.invokeAll(Collections.nCopies(200,
+                () -> device.buy("2330", 1, "995").orThrow().gatewayNumber()));
+        threads.shutdown();
+        Set<String> all = new HashSet<>();
+        for (Future<String> number : numbers) {
+            all.add(number.get());
+        }
+        assertEquals(200, all.size());
+        assertEquals(200, device.gateway.requests(Operation.SUBMIT_ORDER_ENCODE).size());
     }
 
     @Test
