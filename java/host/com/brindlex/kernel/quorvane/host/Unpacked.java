@@ -14,7 +14,7 @@ import java.util.concurrent.TimeUnit;
 final class Unpacked {
     private static final String PREFIX = "quorvane-host-";
 
-    /** What is older was left by a process that ended while it loaded, or by Windows. */
+    /** What is older was left by a process that was ended while it loaded. */
     private static final long LEFT_BEHIND = TimeUnit.DAYS.toMillis(1);
 
     private Unpacked() {}
@@ -44,9 +44,8 @@ final class Unpacked {
         }
     }
 
-    /** Removes the file and its folder; what a system does not give back yet is removed later. */
+    /** Removes the file, which may be loaded still, and its folder. */
     static void remove(Path file) {
-        // not File.deleteOnExit: Windows holds a loaded library until the process is gone
         if (file.toFile().delete() || !Files.exists(file)) {
             file.getParent().toFile().delete();
         }
