@@ -19,8 +19,10 @@ Word WordAt(const char* at) {
 char* SkipAscii(char* at, const char* end) {
   constexpr ptrdiff_t kWord = sizeof(uint64_t);
   const auto word = [&at](ptrdiff_t i) { return WordAt<uint64_t>(at + i * kWord); };
-  while (end - at >= 4 * kWord && ((word(0) | word(1) | word(2) | word(3)) & kTopBits) == 0) {
-    at += 4 * kWord;
+  for (; end - at >= 8 * kWord; at += 8 * kWord) {
+    const uint64_t all =
+        word(0) | word(1) | word(2) | word(3) | word(4) | word(5) | word(6) | word(7);
+    if ((all & kTopBits) != 0) break;
   }
   while (end - at >= kWord) {
     const uint64_t high = word(0) & kTopBits;

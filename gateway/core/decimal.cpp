@@ -24,29 +24,19 @@ constexpr int64_t kPowersOfTen[] = {1,
                                     100000000000000000,
                                     1000000000000000000};
 
-constexpr ptrdiff_t kSafeDigits = 18;
-
 constexpr bool IsSpace(char c) {
   return c == ' ' || (c >= '\t' && c <= '\r');
-}
-
-constexpr bool IsDigit(char c) {
-  return c >= '0' && c <= '9';
 }
 
 constexpr uint64_t Magnitude(int64_t value) {
   return value < 0 ? 0 - static_cast<uint64_t>(value) : static_cast<uint64_t>(value);
 }
 
-// Writes the leading digits first, two at a time.
+// Writes the leading digits first, four at a time.
 char* WritePlain(char* at, uint64_t value) {
-  if (value >= 100) at = WritePlain(at, value / 100);
-  if (value < 10) {
-    *at = static_cast<char>('0' + value);
-    return at + 1;
-  }
-  WriteDigitPair(at, static_cast<uint32_t>(value % 100));
-  return at + 2;
+  if (value < 10000) return WriteShort(at, static_cast<uint32_t>(value));
+  at = WritePlain(at, value / 10000);
+  return WriteDigits<4>(at, static_cast<uint32_t>(value % 10000));
 }
 
 }  // namespace
@@ -60,8 +50,7 @@ int64_t ReadInt64(std::string_view text) {
     negative = at != end && *at == '-';
     if (at != end && (*at == '-' || *at == '+')) ++at;
   }
-  // So many digits fit 64 bits without a look.
-  const char* const safe = end - at > kSafeDigits ? at + kSafeDigits : end;
+  const char* const safe = static_cast<size_t>(end - at) > kSafeDigits ? at + kSafeDigits : end;
   uint64_t magnitude = 0;
   for (; at != safe && IsDigit(*at); ++at) {
     magnitude = magnitude * 10 + static_cast<uint64_t>(*at - '0');
@@ -95,6 +84,11 @@ size_t DecimalSize(int64_t value, size_t width) {
   for (uint64_t bound = 10; magnitude >= bound; bound *= 10) ++size;  // ends at 10^19 at the latest
   if (value < 0) ++size;
   return size < width ? width : size;
+}
+
+char* WriteShort(char* at, uint32_t value) {
+  if (value < 100) return value < 10 ? WriteDigits<1>(at, value) : WriteDigits<2>(at, value);
+  return value < 1000 ? WriteDigits<3>(at, value) : WriteDigits<4>(at, value);
 }
 
 char* WriteDecimal(char* at, int64_t value, size_t width) {

@@ -10,12 +10,29 @@
 
 #include "gateway/core/branch_hints.h"
 
+constexpr bool IsDigit(char c) {
+  return c >= '0' && c <= '9';
+}
+
+// So many digits fit 64 bits without a look.
+inline constexpr size_t kSafeDigits = 18;
+
 // Reads a number as C's `atoll` does: blanks, a sign, digits up to the first other character.
 // Saturates at the 64-bit limits; a text without digits is 0.
 int64_t ReadInt64(std::string_view text);
 
 // As ReadInt64, then narrowed to 32 bits by wrapping: what `atoi` gives where `long` has 64 bits.
+// Wrapping at each digit comes to the same in a text of digits that cannot saturate, which nearly
+// every number is.
 inline int32_t ReadInt32(std::string_view text) {
+  if (text.size() <= kSafeDigits) {
+    uint32_t number = 0;
+    size_t digits = 0;
+    for (; digits < text.size() && IsDigit(text[digits]); ++digits) {
+      number = number * 10 + static_cast<uint32_t>(text[digits] - '0');
+    }
+    if (digits > 0 || text.empty()) return static_cast<int32_t>(number);
+  }
   return static_cast<int32_t>(static_cast<uint32_t>(static_cast<uint64_t>(ReadInt64(text))));
 }
 
@@ -76,14 +93,23 @@ size_t DecimalSize(int64_t value, size_t width);
 // Writes that many characters at `at`; returns the place behind them.
 char* WriteDecimal(char* at, int64_t value, size_t width);
 
+// The same for a number below 10000 without a width.
+char* WriteShort(char* at, uint32_t value);
+
 // The same where the width is known and most numbers fill it, or have one digit where there is
 // none.
 template <size_t kWidth>
 inline char* WriteNumber(char* at, int64_t value) {
-  constexpr size_t kDigits = kWidth == 0 ? 1 : kWidth;
-  constexpr uint64_t kEnd = PowerOfTen(kDigits);  // below every negative number, taken unsigned
-  if (static_cast<uint64_t>(value) >= kEnd) return WriteDecimal(at, value, kWidth);
-  return WriteDigits<kDigits>(at, static_cast<uint32_t>(value));
+  constexpr uint64_t kEnd = PowerOfTen(kWidth == 0 ? 4 : kWidth);
+  if (Mostly(static_cast<uint64_t>(value) < kEnd)) {  // no negative number is, taken unsigned
+    const auto digits = static_cast<uint32_t>(value);
+    if constexpr (kWidth == 0) {
+      return WriteShort(at, digits);
+    } else {
+      return WriteDigits<kWidth>(at, digits);
+    }
+  }
+  return WriteDecimal(at, value, kWidth);
 }
 
 #endif  // QUORVANE_GATEWAY_CORE_DECIMAL_H_

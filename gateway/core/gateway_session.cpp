@@ -80,9 +80,10 @@ Stamp CGatewayPub::TakeStamp() {
   if (localtime_r(&now, &local) == nullptr) local = {};
   m_nSeqNo = static_cast<int32_t>(static_cast<uint32_t>(m_nSeqNo) % 100);
   Stamp stamp = {WrapAdd(local.tm_year, 1900), local.tm_mon + 1, local.tm_mday, {}};
-  char* at = stamp.digits;
-  for (const int part : {local.tm_hour, local.tm_min, local.tm_sec, m_nSeqNo}) {
-    at = WriteDigits<2>(at, static_cast<uint32_t>(part));
-  }
+  const auto part = [](int value) { return static_cast<uint32_t>(value); };
+  WriteDigits<2>(stamp.digits, part(local.tm_hour));
+  WriteDigits<2>(stamp.digits + 2, part(local.tm_min));
+  WriteDigits<2>(stamp.digits + 4, part(local.tm_sec));
+  WriteDigits<2>(stamp.digits + 6, part(m_nSeqNo));
   return stamp;
 }

@@ -76,15 +76,11 @@ inline std::string_view AsText(std::string_view text) {
   return text;
 }
 
-// Not null even for no characters: memcpy takes none.
-inline WireValue MakeTextValue(std::string_view text) {
-  return {static_cast<int64_t>(text.size()), text.empty() ? "" : text.data()};
-}
-
 template <char kKind, class Value>
 WireValue MakeWireValue(const Value& value) {
   if constexpr (kKind == 's') {
-    return MakeTextValue(AsText(value));
+    const std::string_view text = AsText(value);
+    return {static_cast<int64_t>(text.size()), text.data()};
   } else {
     static_assert(kKind != 'c' || std::is_same_v<Value, char>, "%c takes a char");
     static_assert(kKind != 'd' || std::is_same_v<Value, int> || std::is_same_v<Value, uint8_t>,

@@ -103,8 +103,9 @@ class CWireText {
     constexpr WireMark kMark = kWireMarks<Format>[kAt];
     WriteLiteral<Format, kAt>(at);
     if constexpr (kMark.kind == 's') {
-      memcpy(at, value.text, static_cast<size_t>(value.number));
-      at += value.number;
+      const auto size = static_cast<size_t>(value.number);
+      if (Mostly(size != 0)) memcpy(at, value.text, size);
+      at += size;
     } else if constexpr (kMark.kind == 'c') {
       if (Rarely(value.number == 0)) return false;
       *at++ = static_cast<char>(value.number);

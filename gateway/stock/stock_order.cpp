@@ -4,7 +4,8 @@
 #include "gateway/stock/gateway_stk.h"
 
 void OpenPayload(CTextWriter& line, const OrderKey& key) {
-  line.AppendText(key.head == OrderHead::kSigned ? "|PL=S!!" : "!!");
+  if (key.head == OrderHead::kSigned) line.Append(WIRE("|PL=S"));
+  line.Append(WIRE("!!"));
   key.AppendTo(line);
 }
 

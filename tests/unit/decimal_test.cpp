@@ -144,6 +144,11 @@ void ExpectPrintedAsC(int64_t value, int width) {
   const CRoomAtPageEnd room(size);
   ASSERT_EQ(WriteDecimal(room, value, static_cast<size_t>(width)), room + size);
   ASSERT_EQ(room.Bytes(), expected) << value << ", " << width;
+  if (width == 0) {
+    const CRoomAtPageEnd plain(size);
+    ASSERT_EQ(WriteNumber<0>(plain, value), plain + size);
+    ASSERT_EQ(plain.Bytes(), expected) << value;
+  }
 }
 
 TEST(Decimal, NumbersArePrintedAsTheCLibraryPrintsThem) {
