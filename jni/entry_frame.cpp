@@ -3,26 +3,25 @@
 #include "gateway/core/log.h"
 #include "jni/modified_utf8.h"
 
-bool CEntryCall::Borrow(const jstring* strings, size_t count, jintArray status) {
+bool CEntryCall::Borrow(jintArray status) {
   if (m_options.opening != nullptr) debuglog(m_options.opening);
-  bool lent = true;
-  for (; lent && m_nTexts < count; ++m_nTexts) {
-    jstring string = strings[m_nTexts];
-    const char* const text =
-        string == nullptr ? nullptr : m_pEnv->GetStringUTFChars(string, nullptr);
-    m_strings[m_nTexts] = string;
-    m_texts[m_nTexts] = text;
-    lent = text != nullptr || string == nullptr;
+  for (size_t i = 0; i < m_nTexts; ++i) {
+    const char* text = nullptr;
+    if (m_strings[i] != nullptr) {
+      text = m_pEnv->GetStringUTFChars(m_strings[i], nullptr);
+      if (text == nullptr) return GiveBack(i);
+    }
+    m_texts[i] = text;
   }
   m_status = status;
-  if (lent && status != nullptr) {
-    m_pElements = m_pEnv->GetIntArrayElements(status, nullptr);
-    lent = m_pElements != nullptr;
-  }
-  if (!lent) {
-    for (size_t i = 0; i < m_nTexts; ++i) Release(i);
-  }
-  return lent;
+  if (status == nullptr) return true;
+  m_pElements = m_pEnv->GetIntArrayElements(status, nullptr);
+  return m_pElements != nullptr || GiveBack(m_nTexts);
+}
+
+bool CEntryCall::GiveBack(size_t count) {
+  for (size_t i = 0; i < count; ++i) Release(i);
+  return false;
 }
 
 void CEntryCall::FillSession(CGatewayPub& object, const HostSession& session) const {
@@ -39,7 +38,8 @@ jstring CEntryCall::Finish(char* result) {
   LogStep();
   if (m_options.logsResult) debuglog(result);
   LogStep();
-  for (size_t i = 0; i + m_options.keptTexts < m_nTexts; ++i) {
+  const size_t released = m_nTexts - m_options.keptTexts;
+  for (size_t i = 0; i < released; ++i) {
     Release(i);
     LogStep();
   }

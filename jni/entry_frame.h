@@ -50,13 +50,15 @@ class CEntryCall {
  public:
   static constexpr size_t kMaxTexts = 15;
 
-  CEntryCall(JNIEnv* env, const FrameOptions& options) : m_pEnv(env), m_options(options) {}
+  // The operation's `count` strings outlive the call.
+  CEntryCall(JNIEnv* env, const FrameOptions& options, const jstring* strings, size_t count)
+      : m_pEnv(env), m_options(options), m_strings(strings), m_nTexts(count) {}
   CEntryCall(const CEntryCall&) = delete;
   CEntryCall& operator=(const CEntryCall&) = delete;
 
-  // Asks for the characters of `count` strings, then for the elements of `status` (null for none).
+  // Asks for the characters of the strings, then for the elements of `status` (null for none).
   // False when the VM could not lend them all: what it lent is given back, the call returns null.
-  bool Borrow(const jstring* strings, size_t count, jintArray status);
+  bool Borrow(jintArray status);
 
   // A borrowed text, by the string's place.
   const char* Text(size_t i) const { return m_texts[i]; }
@@ -72,6 +74,7 @@ class CEntryCall {
   jstring Finish(char* result);
 
  private:
+  bool GiveBack(size_t count);  // false
   void Release(size_t i);
   void LogStep() {
     if (m_options.stepLabel != nullptr) WriteStep();
@@ -79,9 +82,9 @@ class CEntryCall {
   void WriteStep();
 
   JNIEnv* m_pEnv;
-  const FrameOptions& m_options;
-  size_t m_nTexts = 0;
-  jstring m_strings[kMaxTexts];
+  const FrameOptions m_options;
+  const jstring* m_strings;
+  size_t m_nTexts;
   const char* m_texts[kMaxTexts];
   jintArray m_status = nullptr;
   jint* m_pElements = nullptr;
@@ -130,8 +133,8 @@ jstring Encode(JNIEnv* env, const FrameOptions& options, const HostSession& sess
   jstring strings[kTexts] = {session.serialNo, session.localIP};
   jstring* at = strings + kSessionTexts;
   (Collect(at, args), ...);
-  CEntryCall call(env, options);
-  if (!call.Borrow(strings, kTexts, status)) return nullptr;
+  CEntryCall call(env, options, strings, kTexts);
+  if (!call.Borrow(status)) return nullptr;
   Gateway object;
   call.FillSession(object, session);
   return call.Finish(CallMethod(object, method, call, std::index_sequence_for<Args...>(), args...));
@@ -141,8 +144,8 @@ jstring Encode(JNIEnv* env, const FrameOptions& options, const HostSession& sess
 template <class Gateway>
 jstring Decode(JNIEnv* env, char* (Gateway::*method)(const char*, int*), jstring reply,
                jintArray status, const FrameOptions& options = {}, jint market = 0) {
-  CEntryCall call(env, options);
-  if (!call.Borrow(&reply, 1, status)) return nullptr;
+  CEntryCall call(env, options, &reply, 1);
+  if (!call.Borrow(status)) return nullptr;
   Gateway object;
   object.m_nMarket = market;
   return call.Finish((object.*method)(call.Text(0), call.Status()));
