@@ -1,5 +1,5 @@
-// Hints to the compiler. Only where they were measured to pay: in what every request and every
-// field passes through.
+// Hints to the compiler, only where they were measured to pay through a virtual machine: in what
+// reads the fields of a reply 2 to 5 % of a list, in what writes a piece 3 % of an order.
 //
 //   Mostly, Rarely   what a condition nearly always is, so that the usual way runs straight on
 #ifndef QUORVANE_GATEWAY_CORE_BRANCH_HINTS_H_

@@ -19,17 +19,9 @@ static_assert(__BYTE_ORDER__ == __ORDER_LITTLE_ENDIAN__,
 
 inline constexpr size_t kBarBlock = 64;
 
-// Bit i is set where block[i] is a '|': the rule that BarsOfBlock is held against.
-inline uint64_t BarsOfBlockPlainly(const char* block) {
-  uint64_t bars = 0;
-  for (size_t i = 0; i < kBarBlock; ++i) {
-    if (block[i] == '|') bars |= uint64_t{1} << i;
-  }
-  return bars;
-}
-
-// The same, as fast as the processor family's first generation allows: a block is compared in
-// vectors, and the comparison's result gathered one bit a byte.
+// Bit i is set where block[i] is a '|', as fast as the processor family's first generation allows:
+// a block is compared in vectors, and the comparison's result gathered one bit a byte. A memchr for
+// each bar instead costs 4 to 15 % of a list through a virtual machine.
 #if defined(__SSE2__)
 inline uint64_t BarsOfQuarter(const char* quarter) noexcept {
   __m128i bytes;

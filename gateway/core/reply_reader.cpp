@@ -81,16 +81,12 @@ bool CRecordWalker::Next(CRecord& record) {
   while (opening != nullptr && Mostly(bar != end)) {
     const char* const start = bar;
     bar = bars.Next();
-    TagKey key = keys.ShortKeyBehind(start);
-    int row = tags.Find(key);
+    const TagKey key = keys.KeyBehind(start);
+    const int row = tags.Find(key);
     if (Rarely(row == CTagTable::kNone)) {
-      if (key == kClosing) {
-        closing = start;
-        break;
-      }
-      key = keys.KeyBehind(start);
-      row = tags.Find(key);
-      if (row == CTagTable::kNone) continue;
+      if (key != kClosing) continue;
+      closing = start;
+      break;
     }
     const std::string_view value = Slice(start + 1 + TagSize(key), bar);
     if (Rarely(((present | skips) >> row & 1) != 0)) {

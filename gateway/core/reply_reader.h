@@ -106,11 +106,6 @@ class CTagReader {
     return m_pEnd - bar == 4 && bar[3] == '=' ? MakeTagKey(bar[1], bar[2], '=') : kNoTag;
   }
 
-  // The same of a field whose tag has two characters; any other key says no more than that.
-  TagKey ShortKeyBehind(const char* bar) const {
-    return Mostly(bar < m_pLong) ? LoadTagKey(bar + 1) & kShortTag : KeyBehind(bar);
-  }
-
  private:
   static constexpr TagKey kShortTag = 0x00ffffff;
 

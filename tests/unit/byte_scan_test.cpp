@@ -15,6 +15,15 @@ namespace {
 constexpr char kFills[] = {'a',    '\0',   '\x01', '\x7b', '\x7d',
                            '\x7f', '\x80', '\xfc', '\xfd', '\xff'};
 
+// What BarsOfBlock is held against.
+uint64_t BarsOfBlockPlainly(const char* block) {
+  uint64_t bars = 0;
+  for (size_t i = 0; i < kBarBlock; ++i) {
+    if (block[i] == '|') bars |= uint64_t{1} << i;
+  }
+  return bars;
+}
+
 TEST(ByteScan, BlocksAgreeWithThePlainRuleForEveryPairOfBars) {
   for (const char fill : kFills) {
     char block[kBarBlock];
