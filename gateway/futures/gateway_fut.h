@@ -37,22 +37,15 @@ class CGatewayFut : public CGatewayPub {
   //   side1, side2         'B' or 'S'
   //   quantity             lots
   //   price                with four implied decimals
-  char* SubmitOrderEncode(const char* branch, const char* identity, const char* password,
-                          const char* orderReference, const char* orderDate, const char* commodity1,
-                          const char* commodity2, const char* month1, const char* month2,
-                          const char* strike1, const char* strike2, const char* callPut1,
-                          const char* callPut2, char handlingFlag, char orderKind, char priceType,
-                          char function, char flagW3, char timeInForce, char unreadLetter,
-                          char side1, char side2, int quantity, int unreadNumber, int price,
-                          int* status);
-  char* SubmitOrderEncode1(const char* branch, const char* identity, const char* password,
-                           const char* orderReference, const char* orderDate,
-                           const char* commodity1, const char* commodity2, const char* month1,
-                           const char* month2, const char* strike1, const char* strike2,
-                           const char* callPut1, const char* callPut2, char handlingFlag,
-                           char orderKind, char priceType, char function, char flagW3,
-                           char timeInForce, char unreadLetter, char side1, char side2,
-                           int quantity, int unreadNumber, int price, int* status);
+  using OrderEncoder = char*(const char* branch, const char* identity, const char* password,
+                             const char* orderReference, const char* orderDate,
+                             const char* commodity1, const char* commodity2, const char* month1,
+                             const char* month2, const char* strike1, const char* strike2,
+                             const char* callPut1, const char* callPut2, char handlingFlag,
+                             char orderKind, char priceType, char function, char flagW3,
+                             char timeInForce, char unreadLetter, char side1, char side2,
+                             int quantity, int unreadNumber, int price, int* status);
+  OrderEncoder SubmitOrderEncode, SubmitOrderEncode1;
 
   // The gateway's answer to an order: "number@date@@accepted@flag@!", or its message with status
   // -1. An empty reply means that the order is under way: status 1.
@@ -85,22 +78,14 @@ class CGatewayFut : public CGatewayPub {
   // Append the order's own tags to the terminated text in `body`, a buffer of kBodySize bytes, and
   // turn the order key in `signature`, a buffer of kBufferSize bytes, into the signature payload.
   // Return 1, or 0 with the parameter error alone in `body`.
-  int EncodeSubmitOrderRecord(const char* orderReference, const char* orderDate,
-                              const char* commodity1, const char* commodity2, const char* month1,
-                              const char* month2, const char* strike1, const char* strike2,
-                              const char* callPut1, const char* callPut2, char handlingFlag,
-                              char orderKind, char priceType, char function, char flagW3,
-                              char timeInForce, char unreadLetter, char side1, char side2,
-                              int quantity, int unreadNumber, int price, char* body,
-                              char* signature);
-  int EncodeSubmitOrderRecord1(const char* orderReference, const char* orderDate,
-                               const char* commodity1, const char* commodity2, const char* month1,
-                               const char* month2, const char* strike1, const char* strike2,
-                               const char* callPut1, const char* callPut2, char handlingFlag,
-                               char orderKind, char priceType, char function, char flagW3,
-                               char timeInForce, char unreadLetter, char side1, char side2,
-                               int quantity, int unreadNumber, int price, char* body,
-                               char* signature);
+  using RecordEncoder = int(const char* orderReference, const char* orderDate,
+                            const char* commodity1, const char* commodity2, const char* month1,
+                            const char* month2, const char* strike1, const char* strike2,
+                            const char* callPut1, const char* callPut2, char handlingFlag,
+                            char orderKind, char priceType, char function, char flagW3,
+                            char timeInForce, char unreadLetter, char side1, char side2,
+                            int quantity, int unreadNumber, int price, char* body, char* signature);
+  RecordEncoder EncodeSubmitOrderRecord, EncodeSubmitOrderRecord1;
 
   // Writes what a reply or record says of itself into `out` (cleared before, `size` bytes): "0000",
   // "5001" (no data), else "message(code)"; nothing when that does not fit. Returns `out`.

@@ -183,26 +183,6 @@ int EncodeRecord(CGatewayPub& gateway, const FuturesOrder& order, Sign* sign, ch
   return EndPublicHead(line, written && fits);
 }
 
-// The host's arguments in their own order.
-FuturesOrder NameOrder(const char* orderReference, const char* commodity1, const char* commodity2,
-                       const char* month1, const char* month2, const char* strike1,
-                       const char* strike2, const char* callPut1, const char* callPut2,
-                       char handlingFlag, char orderKind, char priceType, char function,
-                       char flagW3, char timeInForce, char side1, char side2, int quantity,
-                       int price) {
-  return {orderReference,
-          {side1, commodity1, month1, strike1, callPut1},
-          {side2, commodity2, month2, strike2, callPut2},
-          static_cast<uint8_t>(handlingFlag),
-          OrderKind{static_cast<uint8_t>(orderKind)},
-          static_cast<uint8_t>(priceType),
-          function,
-          flagW3,
-          timeInForce,
-          quantity,
-          price};
-}
-
 }  // namespace
 
 char* CGatewayFut::EncodeOrder(OrderHead head, const OrderOrigin& origin, const FuturesOrder& order,
@@ -228,62 +208,38 @@ char* CGatewayFut::EncodeOrder(OrderHead head, const OrderOrigin& origin, const 
   return Finish(line, status, kBadParameters);
 }
 
-char* CGatewayFut::SubmitOrderEncode(const char* branch, const char* identity, const char* password,
-                                     const char* orderReference, const char* orderDate,
-                                     const char* commodity1, const char* commodity2,
-                                     const char* month1, const char* month2, const char* strike1,
-                                     const char* strike2, const char* callPut1,
-                                     const char* callPut2, char handlingFlag, char orderKind,
-                                     char priceType, char function, char flagW3, char timeInForce,
-                                     char, char side1, char side2, int quantity, int, int price,
-                                     int* status) {
-  return EncodeOrder(OrderHead::kPlain,
-                     {AsText(branch), AsText(identity), AsText(password), AsText(orderDate)},
-                     NameOrder(orderReference, commodity1, commodity2, month1, month2, strike1,
-                               strike2, callPut1, callPut2, handlingFlag, orderKind, priceType,
-                               function, flagW3, timeInForce, side1, side2, quantity, price),
-                     status);
+// What each of these methods takes of an order, and the order that it makes of it.
+#define ORDER_PARAMETERS                                                                      \
+  const char *orderReference, [[maybe_unused]] const char *orderDate, const char *commodity1, \
+      const char *commodity2, const char *month1, const char *month2, const char *strike1,    \
+      const char *strike2, const char *callPut1, const char *callPut2, char handlingFlag,     \
+      char orderKind, char priceType, char function, char flagW3, char timeInForce, char,     \
+      char side1, char side2, int quantity, int, int price
+#define ORDER                                                                                  \
+  FuturesOrder {                                                                               \
+    orderReference, {side1, commodity1, month1, strike1, callPut1},                            \
+        {side2, commodity2, month2, strike2, callPut2}, static_cast<uint8_t>(handlingFlag),    \
+        OrderKind{static_cast<uint8_t>(orderKind)}, static_cast<uint8_t>(priceType), function, \
+        flagW3, timeInForce, quantity, price                                                   \
+  }
+#define ORIGIN_PARAMETERS const char *branch, const char *identity, const char *password
+#define ORIGIN                                                            \
+  OrderOrigin {                                                           \
+    AsText(branch), AsText(identity), AsText(password), AsText(orderDate) \
+  }
+
+char* CGatewayFut::SubmitOrderEncode(ORIGIN_PARAMETERS, ORDER_PARAMETERS, int* status) {
+  return EncodeOrder(OrderHead::kPlain, ORIGIN, ORDER, status);
 }
 
-char* CGatewayFut::SubmitOrderEncode1(const char* branch, const char* identity,
-                                      const char* password, const char* orderReference,
-                                      const char* orderDate, const char* commodity1,
-                                      const char* commodity2, const char* month1,
-                                      const char* month2, const char* strike1, const char* strike2,
-                                      const char* callPut1, const char* callPut2, char handlingFlag,
-                                      char orderKind, char priceType, char function, char flagW3,
-                                      char timeInForce, char, char side1, char side2, int quantity,
-                                      int, int price, int* status) {
-  return EncodeOrder(OrderHead::kSigned,
-                     {AsText(branch), AsText(identity), AsText(password), AsText(orderDate)},
-                     NameOrder(orderReference, commodity1, commodity2, month1, month2, strike1,
-                               strike2, callPut1, callPut2, handlingFlag, orderKind, priceType,
-                               function, flagW3, timeInForce, side1, side2, quantity, price),
-                     status);
+char* CGatewayFut::SubmitOrderEncode1(ORIGIN_PARAMETERS, ORDER_PARAMETERS, int* status) {
+  return EncodeOrder(OrderHead::kSigned, ORIGIN, ORDER, status);
 }
 
-int CGatewayFut::EncodeSubmitOrderRecord(
-    const char* orderReference, const char*, const char* commodity1, const char* commodity2,
-    const char* month1, const char* month2, const char* strike1, const char* strike2,
-    const char* callPut1, const char* callPut2, char handlingFlag, char orderKind, char priceType,
-    char function, char flagW3, char timeInForce, char, char side1, char side2, int quantity, int,
-    int price, char* body, char* signature) {
-  return EncodeRecord(*this,
-                      NameOrder(orderReference, commodity1, commodity2, month1, month2, strike1,
-                                strike2, callPut1, callPut2, handlingFlag, orderKind, priceType,
-                                function, flagW3, timeInForce, side1, side2, quantity, price),
-                      SignPlain, body, signature);
+int CGatewayFut::EncodeSubmitOrderRecord(ORDER_PARAMETERS, char* body, char* signature) {
+  return EncodeRecord(*this, ORDER, SignPlain, body, signature);
 }
 
-int CGatewayFut::EncodeSubmitOrderRecord1(
-    const char* orderReference, const char*, const char* commodity1, const char* commodity2,
-    const char* month1, const char* month2, const char* strike1, const char* strike2,
-    const char* callPut1, const char* callPut2, char handlingFlag, char orderKind, char priceType,
-    char function, char flagW3, char timeInForce, char, char side1, char side2, int quantity, int,
-    int price, char* body, char* signature) {
-  return EncodeRecord(*this,
-                      NameOrder(orderReference, commodity1, commodity2, month1, month2, strike1,
-                                strike2, callPut1, callPut2, handlingFlag, orderKind, priceType,
-                                function, flagW3, timeInForce, side1, side2, quantity, price),
-                      SignInPlaces, body, signature);
+int CGatewayFut::EncodeSubmitOrderRecord1(ORDER_PARAMETERS, char* body, char* signature) {
+  return EncodeRecord(*this, ORDER, SignInPlaces, body, signature);
 }

@@ -94,50 +94,28 @@ constexpr OrderForm kTaggedChange = {'C', OrderHead::kSigned, FindFaultTagged, W
 
 }  // namespace
 
-char* CGatewayStk::CancelOrderEncode(const char* branch, const char* identity, const char* password,
-                                     const char* stockCode, const char* orderDate,
-                                     const char* orderReference, long quantity, long unit,
-                                     long price, char side, char flag13, char orderKind,
-                                     char unreadPriceKind, char tradeType, char handlingFlag,
-                                     int* status) {
-  const StockOrder order(branch, identity, password, stockCode, orderDate, orderReference, quantity,
-                         unit, price, side, flag13, orderKind, unreadPriceKind, tradeType,
-                         handlingFlag);
-  return EncodeOrder(kCancel, order, status);
+// What each of these encoders takes, and the order that it makes of it.
+#define AMENDMENT_PARAMETERS                                                                   \
+  const char *branch, const char *identity, const char *password, const char *stockCode,       \
+      const char *orderDate, const char *orderReference, long quantity, long unit, long price, \
+      char side, char flag13, char orderKind, char unreadPriceKind, char tradeType,            \
+      char handlingFlag, int *status
+#define AMENDMENT                                                                              \
+  StockOrder(branch, identity, password, stockCode, orderDate, orderReference, quantity, unit, \
+             price, side, flag13, orderKind, unreadPriceKind, tradeType, handlingFlag)
+
+char* CGatewayStk::CancelOrderEncode(AMENDMENT_PARAMETERS) {
+  return EncodeOrder(kCancel, AMENDMENT, status);
 }
 
-char* CGatewayStk::CancelOrderEncode1(const char* branch, const char* identity,
-                                      const char* password, const char* stockCode,
-                                      const char* orderDate, const char* orderReference,
-                                      long quantity, long unit, long price, char side, char flag13,
-                                      char orderKind, char unreadPriceKind, char tradeType,
-                                      char handlingFlag, int* status) {
-  const StockOrder order(branch, identity, password, stockCode, orderDate, orderReference, quantity,
-                         unit, price, side, flag13, orderKind, unreadPriceKind, tradeType,
-                         handlingFlag);
-  return EncodeOrder(kTaggedCancel, order, status);
+char* CGatewayStk::CancelOrderEncode1(AMENDMENT_PARAMETERS) {
+  return EncodeOrder(kTaggedCancel, AMENDMENT, status);
 }
 
-char* CGatewayStk::ChangeOrderEncode(const char* branch, const char* identity, const char* password,
-                                     const char* stockCode, const char* orderDate,
-                                     const char* orderReference, long quantity, long unit,
-                                     long price, char side, char flag13, char orderKind,
-                                     char unreadPriceKind, char tradeType, char handlingFlag,
-                                     int* status) {
-  const StockOrder order(branch, identity, password, stockCode, orderDate, orderReference, quantity,
-                         unit, price, side, flag13, orderKind, unreadPriceKind, tradeType,
-                         handlingFlag);
-  return EncodeOrder(kChange, order, status);
+char* CGatewayStk::ChangeOrderEncode(AMENDMENT_PARAMETERS) {
+  return EncodeOrder(kChange, AMENDMENT, status);
 }
 
-char* CGatewayStk::ChangeOrderEncode1(const char* branch, const char* identity,
-                                      const char* password, const char* stockCode,
-                                      const char* orderDate, const char* orderReference,
-                                      long quantity, long unit, long price, char side, char flag13,
-                                      char orderKind, char unreadPriceKind, char tradeType,
-                                      char handlingFlag, int* status) {
-  const StockOrder order(branch, identity, password, stockCode, orderDate, orderReference, quantity,
-                         unit, price, side, flag13, orderKind, unreadPriceKind, tradeType,
-                         handlingFlag);
-  return EncodeOrder(kTaggedChange, order, status);
+char* CGatewayStk::ChangeOrderEncode1(AMENDMENT_PARAMETERS) {
+  return EncodeOrder(kTaggedChange, AMENDMENT, status);
 }

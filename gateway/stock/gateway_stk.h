@@ -21,14 +21,11 @@ class CGatewayStk : public CGatewayPub {
   // kind, trade type and N6 flag are unsigned bytes; side and tag-13 flag are sent as they are.
   //
   // SubmitOrderEncode carries its signature payload bare in tag 33, SubmitOrderEncode1 in tag PL.
-  char* SubmitOrderEncode(const char* branch, const char* identity, const char* password,
-                          const char* stockCode, const char* orderDate, long quantity, long unit,
-                          long price, char side, char flag13, char orderKind, char priceKind,
-                          char tradeType, char handlingFlag, int* status);
-  char* SubmitOrderEncode1(const char* branch, const char* identity, const char* password,
-                           const char* stockCode, const char* orderDate, long quantity, long unit,
-                           long price, char side, char flag13, char orderKind, char priceKind,
-                           char tradeType, char handlingFlag, int* status);
+  using NewOrderEncoder = char*(const char* branch, const char* identity, const char* password,
+                                const char* stockCode, const char* orderDate, long quantity,
+                                long unit, long price, char side, char flag13, char orderKind,
+                                char priceKind, char tradeType, char handlingFlag, int* status);
+  NewOrderEncoder SubmitOrderEncode, SubmitOrderEncode1;
 
   // The brief order: header and trade type alone, nothing checked. When the header fails its
   // message comes with the trade type behind it.
@@ -38,26 +35,12 @@ class CGatewayStk : public CGatewayPub {
   // Cancellations and changes of the order that `orderReference`, two numbers joined by '&', names.
   // Other arguments as in a new order, with neither quantity nor price checked; `unreadPriceKind`
   // is sent by none. The payload is bare, or in tag PL for the names that end in 1.
-  char* CancelOrderEncode(const char* branch, const char* identity, const char* password,
-                          const char* stockCode, const char* orderDate, const char* orderReference,
-                          long quantity, long unit, long price, char side, char flag13,
-                          char orderKind, char unreadPriceKind, char tradeType, char handlingFlag,
-                          int* status);
-  char* CancelOrderEncode1(const char* branch, const char* identity, const char* password,
-                           const char* stockCode, const char* orderDate, const char* orderReference,
-                           long quantity, long unit, long price, char side, char flag13,
-                           char orderKind, char unreadPriceKind, char tradeType, char handlingFlag,
-                           int* status);
-  char* ChangeOrderEncode(const char* branch, const char* identity, const char* password,
-                          const char* stockCode, const char* orderDate, const char* orderReference,
-                          long quantity, long unit, long price, char side, char flag13,
-                          char orderKind, char unreadPriceKind, char tradeType, char handlingFlag,
-                          int* status);
-  char* ChangeOrderEncode1(const char* branch, const char* identity, const char* password,
-                           const char* stockCode, const char* orderDate, const char* orderReference,
-                           long quantity, long unit, long price, char side, char flag13,
-                           char orderKind, char unreadPriceKind, char tradeType, char handlingFlag,
-                           int* status);
+  using AmendmentEncoder = char*(const char* branch, const char* identity, const char* password,
+                                 const char* stockCode, const char* orderDate,
+                                 const char* orderReference, long quantity, long unit, long price,
+                                 char side, char flag13, char orderKind, char unreadPriceKind,
+                                 char tradeType, char handlingFlag, int* status);
+  AmendmentEncoder CancelOrderEncode, CancelOrderEncode1, ChangeOrderEncode, ChangeOrderEncode1;
 
   // The gateway's answer to a new order: "number@date@@accepted!".
   char* SubmitOrderDecode(const char* reply, int* status);

@@ -33,8 +33,7 @@ def _judge_arguments(found, whole, files):
     session = {one["name"] for one in whole["argumentSets"]["session"]}
     for operation in whole["operations"]:
         where = f"{operation['class']}::{operation['method']}"
-        declared = re.search(rf"char\* {operation['method']}\(([^)]*)\)",
-                             headers[operation["class"]])
+        declared = _declaration(headers[operation["class"]], operation["method"])
         if not found.expect(declared, f"{where} is not declared"):
             continue
         names = [each.split()[-1].lstrip("*") for each in declared[1].split(",")]
@@ -46,6 +45,16 @@ def _judge_arguments(found, whole, files):
                          f"{where} calls an argument {name}; the dictionary calls it {listed}")
         found.expect(len(names) == len(said), f"{where} has {len(names)} arguments; the "
                                               f"dictionary has {len(said)}")
+
+
+def _declaration(header, method):
+    """The argument list of a method that is declared by itself, or by the type that several
+    share: `using Encoder = char*(...);` and `Encoder First, Second;`."""
+    alone = re.search(rf"char\* {method}\(([^)]*)\)", header)
+    shared = re.search(rf"^ *(\w+) (?:\w+, )*{method}(?:, \w+)*;", header, re.M)
+    if alone or not shared:
+        return alone
+    return re.search(rf"using {shared[1]} = char\*\(([^)]*)\)", header)
 
 
 def _judge_tables(found, whole, files):
