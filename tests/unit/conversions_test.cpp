@@ -253,6 +253,12 @@ TEST_F(Conversions, SetPriceStringPrintsAsTheFormatItStandsFor) {
   }
 }
 
+TEST_F(Conversions, SetPriceStringTakesNegativeDecimalsAsNone) {
+  for (int decimals : {-1, -2, INT_MIN}) {
+    EXPECT_EQ(PriceText(12345, decimals), PriceText(12345, 0)) << decimals;
+  }
+}
+
 TEST_F(Conversions, SetPriceStringClearsItsBufferAndStaysInIt) {
   const struct {
     size_t size;
