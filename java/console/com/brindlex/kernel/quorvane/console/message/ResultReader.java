@@ -9,6 +9,7 @@ import java.util.HashMap;
 import java.util.IdentityHashMap;
 import java.util.List;
 import java.util.Map;
+import java.util.function.Predicate;
 import java.util.regex.Matcher;
 import java.util.regex.Pattern;
 
@@ -60,22 +61,35 @@ final class ResultReader {
 
     static Message read(String text, List<String> decoders, boolean full) {
         ResultReader reader = new ResultReader(text, full);
-        List<Reply> fitting = new ArrayList<>();
-        for (Operation operation : Dictionary.get().operations()) {
-            Reply reply = Dictionary.get().reply(operation.name());
-            boolean wanted = decoders.isEmpty() || decoders.contains(operation.name());
-            if (reply != null && wanted && reader.fits(reply)) {
-                fitting.add(reply);
-            }
-        }
+        List<Reply> fitting = reader.fitting(decoders, reader::fits);
         if (fitting.isEmpty() && !decoders.isEmpty()) {
-            fitting.add(Dictionary.get().reply(decoders.get(0)));
+            fitting = List.of(Dictionary.get().reply(decoders.get(0)));
+        } else if (fitting.isEmpty()) {
+            fitting = reader.fitting(decoders, reader::beginsAs);
         }
         String words = fitting.isEmpty() ? "result" : reader.take(fitting.get(0));
         Map<String, String> facts = new HashMap<>();
         facts.put("outcome", "done");
         return new Message(Kind.RESULT, fitting.stream().map(Reply::decoder).toList(), words, text,
                 reader.groups, reader.faults, facts);
+    }
+
+    private List<Reply> fitting(List<String> decoders, Predicate<Reply> test) {
+        List<Reply> fitting = new ArrayList<>();
+        for (Operation operation : Dictionary.get().operations()) {
+            Reply reply = Dictionary.get().reply(operation.name());
+            boolean wanted = decoders.isEmpty() || decoders.contains(operation.name());
+            if (reply != null && wanted && test.test(reply)) {
+                fitting.add(reply);
+            }
+        }
+        return fitting;
+    }
+
+    /** Whether the first section is that of a result, whatever became of the others. */
+    private boolean beginsAs(Reply reply) {
+        return sections && reply.result().equals("sections")
+                && text.startsWith(reply.tables().get(0).mark());
     }
 
     private boolean fits(Reply reply) {

@@ -6,6 +6,7 @@ import static org.junit.jupiter.api.Assertions.assertTrue;
 
 import com.brindlex.kernel.quorvane.client.Argument;
 import com.brindlex.kernel.quorvane.client.Operation;
+import com.brindlex.kernel.quorvane.console.message.DamagedMessagesTest;
 import java.io.ByteArrayInputStream;
 import java.io.ByteArrayOutputStream;
 import java.io.InputStream;
@@ -313,6 +314,21 @@ class QuorvaneTest {
         Run json = run(LOG, "timeline", "--json");
         assertTrue(json.out.lines().allMatch(line -> line.startsWith("{\"line\":")), json.out);
         assertEquals(1, run("nothing\n", "timeline").code);
+    }
+
+    /** Of a log, where the line before a reply names its decoder. */
+    @Test
+    void checkNamesEveryDamage() {
+        DamagedMessagesTest.all().forEach((kind, text) -> {
+            String decoder = text.startsWith("|00=") ? "QueryOrderDecode: Len:"
+                    + text.getBytes(StandardCharsets.UTF_8).length + "\n" : "";
+            Run checked = run(decoder + text + "\n~CGatewayPub\n", "check");
+            assertEquals(1, checked.code, kind);
+            int line = decoder.isEmpty() ? 1 : 2;
+            assertTrue(checked.out.startsWith("(input):" + line + ": " + kind + ": "),
+                    () -> kind + ": " + text + "\n" + checked.out);
+            assertEquals(1, checked.out.lines().count(), () -> text + "\n" + checked.out);
+        });
     }
 
     @Test

@@ -85,8 +85,8 @@ class MaskedLogTest {
     void theRecordedSessionHoldsNoSecretAnyMore() throws IOException {
         Set<String> secrets = secrets(RecordedLog.messages());
         assertTrue(secrets.size() > 15, secrets::toString);
-        for (Dress dress : List.of(Dress.HOST, Dress.BRIEF, Dress.PROCESS, Dress.RAW, Dress.THREADTIME,
-                Dress.COLOUR, Dress.LONG, Dress.STUDIO)) {
+        for (Dress dress : List.of(Dress.HOST, Dress.BRIEF, Dress.PROCESS, Dress.RAW,
+                Dress.THREADTIME, Dress.COLOUR, Dress.PRINTABLE, Dress.LONG, Dress.STUDIO)) {
             String log = dress.log(RecordedLog.messages());
             String masked = mask(log);
             for (String secret : secrets) {
@@ -94,10 +94,33 @@ class MaskedLogTest {
                 assertFalse(masked.contains(Base64.getEncoder().encodeToString(
                         secret.getBytes(StandardCharsets.UTF_8))), () -> dress + ": " + secret);
             }
+            Matcher base64 = Pattern.compile("[A-Za-z0-9+/]{8,}={0,2}").matcher(masked);
+            while (base64.find()) {
+                assertNoSecret(decoded(base64.group()), secrets, dress + " " + base64.group());
+            }
+            assertNoSecret(masked.replace("%20", " "), secrets, dress.name());
             List<Row> before = rows(log);
             List<Row> after = rows(masked);
             assertEquals(before.stream().map(MaskedLogTest::said).toList(),
                     after.stream().map(MaskedLogTest::said).toList(), dress.name());
+        }
+    }
+
+    private static void assertNoSecret(String text, Set<String> secrets, String where) {
+        for (String secret : secrets) {
+            assertFalse(text.contains(secret), () -> where + " holds " + secret);
+        }
+    }
+
+    /** What a text is the Base64 of, if it is cut anywhere; nothing where it is none. */
+    private static String decoded(String text) {
+        try {
+            String whole = text.replace("=", "");
+            return new String(Base64.getDecoder().decode(
+                    whole.substring(0, whole.length() - (whole.length() % 4 == 1 ? 1 : 0))),
+                    StandardCharsets.UTF_8);
+        } catch (IllegalArgumentException none) {
+            return "";
         }
     }
 

@@ -5,11 +5,13 @@ import static org.junit.jupiter.api.Assertions.assertTrue;
 
 import java.util.HashSet;
 import java.util.List;
+import java.util.Map;
 import java.util.Set;
+import java.util.TreeMap;
 import org.junit.jupiter.api.Test;
 
 /** Each damage is found, alone, at its place, and has a name of its own. */
-class DamagedMessagesTest {
+public class DamagedMessagesTest {
     private static final String HEAD = "F=1|KIND=S|BHNO=9A00|CB=1|IP=10.0.0.1|11=NO DEFINE|VER=24369"
             + "|SN=SN0001|65=0013452107|14=I|15=0|IDNO=A123456789|ACNO=1234567|PWD=pw"
             + "|21=20240115|22=134521|23=13452107|24=5|V4=";
@@ -97,6 +99,14 @@ class DamagedMessagesTest {
             new Damage("unknown-section", POSITIONS, "<6>", "<7>"));
 
     private static final List<String> DECODERS_OF_BOOK = List.of("QueryOrderDecode");
+
+    /** Every damaged message by the kind of its fault. */
+    public static Map<String, String> all() {
+        Map<String, String> all = new TreeMap<>();
+        DAMAGES.forEach(each -> all.put(each.kind(),
+                each.from().equals("~") ? each.sound() : each.damaged()));
+        return all;
+    }
 
     private static Message read(String text) {
         return MessageReader.read(text,
