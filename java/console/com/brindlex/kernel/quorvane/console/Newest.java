@@ -3,7 +3,7 @@ package com.brindlex.kernel.quorvane.console;
 import java.util.LinkedHashMap;
 import java.util.Map;
 
-/** What was asked for last: so many entries, of which the one that nobody used longest goes first. */
+/** What was asked for last: so many entries; the one that nobody used longest goes first. */
 public final class Newest<K, V> extends LinkedHashMap<K, V> {
     private static final long serialVersionUID = 1;
 

@@ -18,7 +18,8 @@ import picocli.CommandLine.ParentCommand;
 @Command(name = "check", mixinStandardHelpOptions = true, sortOptions = false,
         description = "Holds every value against the dictionary, and every signature payload "
                 + "against the order that it signs; writes what is wrong, one line a fault.",
-        footer = {"", "Exit codes: 0 all is sound, 1 something is wrong or the log holds no message, "
+        footer = {"",
+                "Exit codes: 0 all is sound, 1 something is wrong or the log holds no message, "
                 + "2 usage.", "",
                 "  quorvane check log.txt",
                 "  quorvane check 'F=7|KIND=S|BHNO=9A01|...'",

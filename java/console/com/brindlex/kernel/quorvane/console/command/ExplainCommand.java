@@ -44,7 +44,8 @@ final class ExplainCommand implements Callable<Integer> {
             description = "The operation of the messages, where that is known.")
     private String operation;
 
-    @Option(names = "--all", description = "Also what is no message: headers that a request repeats, "
+    @Option(names = "--all",
+            description = "Also what is no message: headers that a request repeats, "
             + "lengths, marks, texts.")
     private boolean all;
 

@@ -29,8 +29,8 @@ final class LogOptions {
     private String log;
 
     @Option(names = "--charset", paramLabel = "NAME", defaultValue = "UTF-8",
-            description = "Charset of a log without a byte order mark: UTF-8 (the usual one), Big5, "
-                    + "UTF-16LE ...")
+            description = "Charset of a log without a byte order mark: UTF-8 (the usual one), "
+                    + "Big5, UTF-16LE ...")
     private Charset charset;
 
     @Option(names = "--tag", paramLabel = "TAG", defaultValue = LogReader.TAG,

@@ -29,11 +29,14 @@ final class Options {
                             .type(String.class)
                             .paramLabel(argument.type().name().replaceFirst(".*_", ""))
                             .required(given == null && !isPassword(argument))
-                            .description(WrittenRequest.purpose(argument) + (given == null || given.isBlank()
-                                            ? "" : "; usually " + given.replace("%", "%%")));
+                            .description(WrittenRequest.purpose(argument) + usually(given));
             spec.addOption(given == null ? option.build() : option.defaultValue(given).build());
         }
         return spec;
+    }
+
+    private static String usually(String given) {
+        return given == null || given.isBlank() ? "" : "; usually " + given.replace("%", "%%");
     }
 
     /** Whether it stays off the command line, where everybody on the machine reads it. */

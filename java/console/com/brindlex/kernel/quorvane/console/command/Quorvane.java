@@ -12,8 +12,8 @@ import picocli.CommandLine.TypeConversionException;
 import picocli.CommandLine;
 
 /** The message codec on the command line. */
-@Command(name = "quorvane", mixinStandardHelpOptions = true, versionProvider = Quorvane.Version.class,
-        sortOptions = false,
+@Command(name = "quorvane", mixinStandardHelpOptions = true, sortOptions = false,
+        versionProvider = Quorvane.Version.class,
         description = "Builds requests, reads replies, and explains what a log holds of both.",
         footer = {"", "Exit codes: 0 done, 1 the operation failed or a line is damaged, 2 usage.",
                 "",

@@ -2,7 +2,7 @@ package com.brindlex.kernel.quorvane.console.log;
 
 import java.util.regex.Matcher;
 
-/** The header of the line before: most lines have the same again, but for the digits of its time. */
+/** The header of the line before: most lines have it again, but for the digits of its time. */
 final class LastHeader {
     private final String text;
     private final int timeBegin;

@@ -9,7 +9,8 @@ public enum LogFormat {
     THREADTIME(Part.TIME + " +(?:\\w+ +)??(?<process>\\d+) +(?<thread>\\d+) [VDIWEFAS] "
             + "(?<tag>.*?) *: ?"),
     /** {@code 2024-01-15 13:45:21.123  1234-5678  gatewayjni  com.example  D  text}. */
-    STUDIO(Part.TIME + " +(?<process>\\d+)-(?<thread>\\d+) +(?<tag>\\S+) +\\S+ +[VDIWEFA](?:  ?|$)"),
+    STUDIO(Part.TIME + " +(?<process>\\d+)-(?<thread>\\d+) +(?<tag>\\S+) +\\S+ "
+            + "+[VDIWEFA](?:  ?|$)"),
     /** {@code 2020-01-15 13:45:21.123 1234-5678/com.example D/gatewayjni: text}. */
     STUDIO_OLD(Part.TIME + ":? +(?<process>\\d+)-(?<thread>\\d+)/\\S+ [VDIWEFA]/(?<tag>.*?) *: ?"),
     /** {@code 01-15 13:45:21.123 D/gatewayjni( 1234): text}. */
@@ -17,7 +18,8 @@ public enum LogFormat {
     /** {@code D/gatewayjni( 1234): text}. */
     BRIEF("[VDIWEFAS]/(?<tag>[^(:]*?) *\\( *" + Part.USER + "(?<process>\\d+)\\): ?"),
     /** {@code D( 1234) text  (gatewayjni)}. */
-    PROCESS("[VDIWEFAS]\\( *" + Part.USER + "(?<process>\\d+)\\) (?=.*  \\((?<tag>[^()]*)\\)\\s*$)"),
+    PROCESS("[VDIWEFAS]\\( *" + Part.USER + "(?<process>\\d+)\\) "
+            + "(?=.*  \\((?<tag>[^()]*)\\)\\s*$)"),
     /** {@code D( 1234: 5678) text}. */
     THREAD("[VDIWEFAS]\\( *" + Part.USER + "(?<process>\\d+): *(?<thread>\\d+)\\) ?"),
     /** {@code D/gatewayjni: text}. */
@@ -30,7 +32,8 @@ public enum LogFormat {
 
     /** What several formats share. */
     private static final class Part {
-        static final String TIME = "(?<time>(?:(?:\\d{4}-)?\\d\\d-\\d\\d )?\\d\\d:\\d\\d:\\d\\d\\.\\d{3,9}"
+        static final String TIME = "(?<time>(?:(?:\\d{4}-)?\\d\\d-\\d\\d )?"
+                + "\\d\\d:\\d\\d:\\d\\d\\.\\d{3,9}"
                 + "(?: [+-]\\d{4})?|\\d+\\.\\d{3,9})";
         static final String USER = "(?:[^\\s:()]+: *)?";
     }

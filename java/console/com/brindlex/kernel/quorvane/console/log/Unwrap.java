@@ -7,7 +7,8 @@ import java.util.regex.Pattern;
 final class Unwrap {
     /** The first field of a request or a reply, with no letter or digit right before it. */
     private static final Pattern BEGIN = Pattern.compile(
-            "(?<![A-Za-z0-9|])(?:F=[17]\\||\\|(?:F|00|68|39)=|\\[GATEWAY\\]error|\\[BROKER\\]timeout)");
+            "(?<![A-Za-z0-9|])(?:F=[17]\\||\\|(?:F|00|68|39)=|\\[GATEWAY\\]error"
+                    + "|\\[BROKER\\]timeout)");
     private static final Pattern RESULT = Pattern.compile("(?<=[\"'])(?:[0-9]{1,9}|<[0-9]>)!");
 
     /** What the patterns cannot do without: most texts hold none of it, and need no search. */

@@ -6,7 +6,7 @@ import java.util.HashMap;
 import java.util.List;
 import java.util.Map;
 
-/** Finds any of many texts within a text, the longest first, by the three letters they begin with. */
+/** Finds any of many texts within a text, the longest first, by their first three letters. */
 final class Forms {
     /** No text is shorter. */
     static final int SHORTEST = 3;

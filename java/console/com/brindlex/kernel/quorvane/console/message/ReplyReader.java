@@ -73,8 +73,9 @@ final class ReplyReader {
         close("fields of the reply");
         ReplyWords words = new ReplyWords(form, pieces, good);
         boolean refused = words.isRefused();
-        if (form.reply.isList() && records > 0 && !ended && recordBegin < 0 && !refused && !words.code().equals(NO_DATA)
-                && !form.reply.record().endsAtEmptyRecord()) {
+        boolean wanted = form.reply.isList() && !form.reply.record().endsAtEmptyRecord()
+                && records > 0 && !refused && !words.code().equals(NO_DATA);
+        if (wanted && !ended && recordBegin < 0) {
             faults.add(new Fault(text.length(), "no-end-mark", "the list has no end: no record "
                             + "with tag 67 of " + form.reply.record().endMark() + " or more"));
         }

@@ -16,6 +16,9 @@ final class RequestForms {
     /** What a request is for: values that weigh more than a field in common. */
     private static final List<String> TELLING = List.of("F", "FUNC", "FUNC1", "14", "KIND", "15");
 
+    /** What a field in common weighs. */
+    private static final int IN_COMMON = 4;
+
     /** So many kinds of damaged requests are remembered with the forms that come closest. */
     private static final int MOST_REMEMBERED = 256;
     private static final int LONGEST_REMEMBERED = 1000;
@@ -89,8 +92,16 @@ final class RequestForms {
     private List<Template> search(List<Cut.Piece> pieces) {
         List<Template> best = new ArrayList<>();
         int most = Integer.MIN_VALUE;
+        Set<String> tags = new HashSet<>();
+        pieces.forEach(piece -> tags.add(piece.tag()));
         for (Template template : all) {
-            int score = score(template, pieces);
+            int told = told(template, pieces);
+            int shared = (int) template.slots.stream()
+                    .filter(slot -> tags.contains(slot.tag())).count();
+            if (told + IN_COMMON * shared < most) {
+                continue;  // no order of the fields makes it come closest
+            }
+            int score = told + IN_COMMON * Alignment.common(template.slots, pieces);
             if (score > most) {
                 best.clear();
                 most = score;
@@ -102,8 +113,8 @@ final class RequestForms {
         return best;
     }
 
-    /** Fields in common, with weight on those that tell what a request is for. */
-    private static int score(Template template, List<Cut.Piece> pieces) {
+    /** What the values say that tell what a request is for, and how many fields it has. */
+    private static int told(Template template, List<Cut.Piece> pieces) {
         int score = 0;
         for (String tag : TELLING) {
             String constant = template.constant(tag);
@@ -116,7 +127,6 @@ final class RequestForms {
         if (Cut.value(pieces, "F").equals("1")) {
             score += template.operation.isFutures() == futures ? 12 : -12;
         }
-        return score + 4 * Alignment.common(template.slots, pieces)
-                - 2 * Math.abs(template.slots.size() - pieces.size());
+        return score - 2 * Math.abs(template.slots.size() - pieces.size());
     }
 }

@@ -153,8 +153,8 @@ final class Values {
             case "shares" -> require(Digits.all(wire, 1, 10)
                     && Long.parseLong(wire) <= Integer.MAX_VALUE, value, "not-a-number",
                     "is no quantity");
-            case "fillOrKill", "immediateOrCancel" -> require(wire.equals("0") || wire.equals("1"), value,
-                    "unknown-code", "is neither 0 nor 1");
+            case "fillOrKill", "immediateOrCancel" -> require(wire.equals("0") || wire.equals("1"),
+                    value, "unknown-code", "is neither 0 nor 1");
             case "period" -> require(dictionary.codes("periods").findWire(wire) != null, value,
                     "unknown-code", "is no period code");
             default -> { }

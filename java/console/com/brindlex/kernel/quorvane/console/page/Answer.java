@@ -21,7 +21,8 @@ record Answer(int status, String type, byte[] body, String fileName) {
 
     /** A refusal that says why. */
     static Answer refused(int status, String why) {
-        return new Answer(status, "application/json", bytes(GSON.toJson(Map.of("error", why))), null);
+        byte[] body = bytes(GSON.toJson(Map.of("error", why)));
+        return new Answer(status, "application/json", body, null);
     }
 
     static Answer file(byte[] body, String fileName) {

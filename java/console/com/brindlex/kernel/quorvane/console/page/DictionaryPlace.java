@@ -54,7 +54,8 @@ final class DictionaryPlace {
         Map<List<String>, List<String>> scenes = new LinkedHashMap<>();
         for (String scene : dictionary.scenes()) {
             dictionary.tags(scene).values().forEach(tag -> scenes.computeIfAbsent(
-                    List.of(tag.tag(), tag.label(), tag.name(), tag.note() == null ? "" : tag.note()),
+                    List.of(tag.tag(), tag.label(), tag.name(),
+                            tag.note() == null ? "" : tag.note()),
                     each -> new ArrayList<>()).add(scene));
         }
         List<Entry> all = new ArrayList<>();

@@ -9,8 +9,8 @@ import java.nio.file.Path;
 import java.nio.file.attribute.BasicFileAttributes;
 
 /**
- * A file that others write on: its end is where more is waited for. A file that was emptied, or that
- * another one took the place of, is read from its begin, on a line of its own.
+ * A file that others write on: its end is where more is waited for. A file that was emptied, or
+ * that another one took the place of, is read from its begin, on a line of its own.
  */
 final class FollowedFile extends InputStream {
     private static final long PAUSE_MILLIS = 200;

@@ -11,7 +11,7 @@ import java.util.Locale;
 import java.util.Map;
 import java.util.Set;
 
-/** The logs that the page has open: the one that the command named, and what was pasted or dropped. */
+/** The logs that the page has open: the one that the command named, what was pasted or dropped. */
 public final class Logs {
     /** The newest logs alone are kept. */
     private static final int MOST = 4;

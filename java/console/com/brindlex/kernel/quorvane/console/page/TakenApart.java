@@ -18,7 +18,8 @@ final class TakenApart {
     static Map<String, Object> of(Message message, List<Fault> faults) {
         List<Fault> left = new ArrayList<>(faults);
         List<Object> groups = new ArrayList<>();
-        List<Field> all = message.groups().stream().flatMap(each -> each.fields().stream()).toList();
+        List<Field> all = message.groups().stream()
+                .flatMap(each -> each.fields().stream()).toList();
         for (Group group : message.groups()) {
             List<Object> fields = new ArrayList<>();
             for (Field field : group.fields()) {

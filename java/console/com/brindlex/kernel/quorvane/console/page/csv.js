@@ -2,7 +2,8 @@
 import { h } from './parts.js';
 
 const COLUMNS = {
-  line: row => row.line, time: row => row.time, direction: row => row.isRequest ? 'request' : 'reply',
+  line: row => row.line, time: row => row.time,
+  direction: row => row.isRequest ? 'request' : 'reply',
   operation: row => row.operation, title: row => row.title, account: row => row.account,
   instrument: row => row.instrument, words: row => row.words, status: row => row.status,
   request_id: row => row.requestId, request_line: row => row.requestLine || '',

@@ -112,7 +112,8 @@ function line(place, tied) {
     id: 'row-' + number, role: 'option', 'aria-selected': String(number === chosen),
     'aria-setsize': shown.length, 'aria-posinset': place + 1,
   }, h('div', { className: 'head' }, (row.isRequest ? '→ ' : '← ') + row.time + ' ',
-      h('b', null, name || '(unknown)'), ' ' + (row.account ? row.account + ' · ' : '') + row.status + took),
+      h('b', null, name || '(unknown)'),
+      ' ' + (row.account ? row.account + ' · ' : '') + row.status + took),
   h('div', { className: 'words', title: row.words },
       row.words + (faults ? ' [' + faults + ']' : '')));
   element.style.top = place * HEIGHT + 'px';

@@ -61,8 +61,8 @@ export function messageTable(message) {
         h('td', { className: 'value' }, field.value),
         h('td', null, field.meaning, ...field.faults.map(faultLine))));
     parts.push(h('table', { className: 'fields' },
-        parts.some(each => each.tagName === 'TABLE') ? null : h('thead', null, h('tr', null, h('th', { scope: 'col' }, 'Field'),
-            h('th', { scope: 'col' }, 'Value'), h('th', { scope: 'col' }, 'Meaning, fault'))),
+        parts.some(each => each.tagName === 'TABLE') ? null : h('thead', null, h('tr', null,
+            ...['Field', 'Value', 'Meaning, fault'].map(each => h('th', { scope: 'col' }, each)))),
         h('tbody', null, ...rows)));
   }
   parts.push(h('details', null, h('summary', null, 'The message as it stands'),
