@@ -123,6 +123,7 @@ const Decoding kDecodings[] = {
     {"LastLineFeedReadsThePlaceBehind", "YWJj\n", "abc\xac\0\0"s},
     {"LastLineBreakReadsItsLineFeed", "YWJj\r\n", "abc\xac\0\0"s},
     {"OnlyALineFeed", "\n", "\xac\0\0"s},
+    {"LastForeignCharacterBehindALineFeedIsNoError", "YW\n*", "a"},
     {"OnlyAForeignCharacter", "r", "\xac\0\0"s, 1},
     {"PadBehindAForeignCharacterIsForeign", "YW\n==", "a", 1},
 };
