@@ -1,7 +1,6 @@
 package com.brindlex.kernel.quorvane.console.message;
 
 import com.brindlex.kernel.quorvane.console.dictionary.Dictionary;
-import com.brindlex.kernel.quorvane.console.dictionary.Operation;
 import com.brindlex.kernel.quorvane.console.dictionary.Reply;
 import java.math.BigDecimal;
 import java.util.ArrayList;
@@ -9,6 +8,7 @@ import java.util.HashMap;
 import java.util.IdentityHashMap;
 import java.util.List;
 import java.util.Map;
+import java.util.Objects;
 import java.util.function.Predicate;
 import java.util.regex.Matcher;
 import java.util.regex.Pattern;
@@ -18,6 +18,7 @@ final class ResultReader {
     private static final Pattern LIST = Pattern.compile("(?s)([0-9]{1,9})!(.*)");
     private static final Pattern SECTION = Pattern.compile("<([0-9])>!([0-9]{1,9})!");
     private static final String NOTICE = "<M>@";
+    private static final List<Reply> REPLIES = replies();
     private static final Map<Reply.Table, Integer> PLACES = countPlaces();
 
     private final String text;
@@ -29,14 +30,15 @@ final class ResultReader {
     private final int places;
     private int records;
 
+    private static List<Reply> replies() {
+        return Dictionary.get().operations().stream()
+                .map(each -> Dictionary.get().reply(each.name())).filter(Objects::nonNull).toList();
+    }
+
     private static Map<Reply.Table, Integer> countPlaces() {
         Map<Reply.Table, Integer> places = new IdentityHashMap<>();
-        for (Operation operation : Dictionary.get().operations()) {
-            Reply reply = Dictionary.get().reply(operation.name());
-            if (reply != null) {
-                reply.tables().forEach(each -> places.put(each, countPlaces(each)));
-            }
-        }
+        REPLIES.forEach(reply -> reply.tables().forEach(
+                each -> places.put(each, countPlaces(each))));
         return places;
     }
 
@@ -76,10 +78,9 @@ final class ResultReader {
 
     private List<Reply> fitting(List<String> decoders, Predicate<Reply> test) {
         List<Reply> fitting = new ArrayList<>();
-        for (Operation operation : Dictionary.get().operations()) {
-            Reply reply = Dictionary.get().reply(operation.name());
-            boolean wanted = decoders.isEmpty() || decoders.contains(operation.name());
-            if (reply != null && wanted && test.test(reply)) {
+        for (Reply reply : REPLIES) {
+            boolean wanted = decoders.isEmpty() || decoders.contains(reply.decoder());
+            if (wanted && test.test(reply)) {
                 fitting.add(reply);
             }
         }

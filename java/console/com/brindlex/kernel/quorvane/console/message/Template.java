@@ -39,6 +39,9 @@ final class Template {
     final List<Slot> slots;
     final String tags;
 
+    /** The fixed value of each field; null for one with a place. */
+    private final String[] constants;
+
     Template(Operation operation, Operation.Form form, Header header, Header.Identity identity,
             String whole) {
         this.operation = operation;
@@ -52,6 +55,11 @@ final class Template {
         this.slots = pieces.stream()
                 .map(piece -> new Slot(piece.tag(), parts(piece.value()))).toList();
         this.tags = Cut.tags(pieces);
+        this.constants = slots.stream().map(Template::constant).toArray(String[]::new);
+    }
+
+    private static String constant(Slot slot) {
+        return slot.parts().size() == 1 ? slot.parts().get(0).literal() : null;
     }
 
     private static String hideBars(String text) {
@@ -112,10 +120,8 @@ final class Template {
 
     /** Whether fields with these tags have the fixed values of this form, too. */
     boolean hasConstants(List<Cut.Piece> pieces) {
-        for (int i = 0; i < slots.size(); i++) {
-            List<Part> parts = slots.get(i).parts();
-            boolean fixed = parts.size() == 1 && !parts.get(0).isPlace();
-            if (fixed && !pieces.get(i).value().equals(parts.get(0).literal())) {
+        for (int i = 0; i < constants.length; i++) {
+            if (constants[i] != null && !constants[i].equals(pieces.get(i).value())) {
                 return false;
             }
         }
