@@ -18,6 +18,8 @@
 #include <sanitizer/asan_interface.h>
 #elif defined(QUORVANE_MEMORY_SANITIZER)
 #include <sanitizer/msan_interface.h>
+#elif defined(QUORVANE_POISONS)
+#error "without a sanitizer nothing notices a read behind what was lent"
 #endif
 
 namespace gateway_fuzz {
