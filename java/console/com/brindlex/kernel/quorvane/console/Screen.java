@@ -171,8 +171,9 @@ public final class Screen {
     /** Columns that a text takes: characters of the East Asian scripts take two. */
     public static int width(String text) {
         int width = 0;
-        for (int at = 0; at < text.length(); at = text.offsetByCodePoints(at, 1)) {
-            width += isWide(text.codePointAt(at)) ? 2 : 1;
+        for (int at = 0, c; at < text.length(); at += Character.charCount(c)) {
+            c = text.codePointAt(at);
+            width += isWide(c) ? 2 : 1;
         }
         return width;
     }

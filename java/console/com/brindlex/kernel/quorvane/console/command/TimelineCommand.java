@@ -75,7 +75,7 @@ final class TimelineCommand implements Callable<Integer> {
         RowFilter filter = new RowFilter(account, stock, operation, failures);
         Timeline timeline = new Timeline();
         boolean read = !csv || out.write(CSV_HEAD);
-        try (LogReader reader = log.open()) {
+        try (LogReader reader = log.open(out.holdingUntil(log.stream()))) {
             LogMessage message;
             while (read && (message = reader.next(line -> { })) != null) {
                 Event event = timeline.accept(message);
@@ -83,6 +83,8 @@ final class TimelineCommand implements Callable<Integer> {
                     read = show(event.row());
                 }
             }
+        } finally {
+            out.send();
         }
         if (!csv && !terminal.isJson()) {
             summary(timeline.unanswered().stream().filter(filter::takes).toList());

@@ -12,8 +12,6 @@ import java.util.regex.Pattern;
 final class Joining {
     private static final Pattern LENGTH = Pattern.compile("(?:\\w+: |regMsg )Len:([0-9]{1,9})");
     private static final Pattern BASE64 = Pattern.compile("[A-Za-z0-9+/=]*\r?(?:\\|.*)?");
-    private static final Pattern OPEN_BASE64 =
-            Pattern.compile("(?s).*\\|MSG=[A-Za-z0-9+/=\r\n]*");
 
     /** What Android keeps of an entry: 4,068 bytes with its priority, its tag and two ends. */
     private static final int LONGEST_ENTRY = 4068;
@@ -54,8 +52,23 @@ final class Joining {
         this.bytes = counts || kind == Kind.REQUEST ? bytes(first) : 0;
         boolean told = counts && expected > bytes;
         this.expected = told ? expected : -1;
-        this.isOpenBase64 = kind == Kind.REQUEST && first.contains("|MSG=")
-                && OPEN_BASE64.matcher(first).matches();
+        this.isOpenBase64 = kind == Kind.REQUEST && endsInBase64(first);
+    }
+
+    /** Whether nothing but Base64 and the ends of its lines stands behind the last tag MSG. */
+    private static boolean endsInBase64(String text) {
+        int at = text.lastIndexOf("|MSG=");
+        if (at < 0) {
+            return false;
+        }
+        for (int i = at + "|MSG=".length(); i < text.length(); i++) {
+            char c = text.charAt(i);
+            boolean letter = c >= 'A' && c <= 'Z' || c >= 'a' && c <= 'z' || c >= '0' && c <= '9';
+            if (!letter && "+/=\r\n".indexOf(c) < 0) {
+                return false;
+            }
+        }
+        return true;
     }
 
     /** How long the next text is, when this one says so; -1 otherwise. */

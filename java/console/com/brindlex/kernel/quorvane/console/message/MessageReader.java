@@ -70,7 +70,7 @@ public final class MessageReader {
     }
 
     /** Without the trade type, which one encoder writes behind a message. */
-    private static String bare(String text) {
+    public static String bare(String text) {
         return text.contains("|28=") ? text.replaceFirst("\\|28=[0-9]+$", "") : text;
     }
 

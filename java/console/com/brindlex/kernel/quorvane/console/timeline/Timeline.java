@@ -197,7 +197,7 @@ public final class Timeline {
         if (call.header != null) {
             return true;
         }
-        String bare = text.replaceFirst("\\|28=[0-9]+$", "");
+        String bare = MessageReader.bare(text);
         for (Dictionary.Message each : Dictionary.get().messages()) {
             if (each.text().equals(bare)) {
                 return Dictionary.get().operations().stream().noneMatch(operation ->
