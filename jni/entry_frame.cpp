@@ -16,7 +16,8 @@ bool CEntryCall::Borrow(jintArray status) {
   m_status = status;
   if (status == nullptr) return true;
   m_pElements = m_pEnv->GetIntArrayElements(status, nullptr);
-  return m_pElements != nullptr || GiveBack(m_nTexts);
+  if (m_pElements == nullptr) return GiveBack(m_nTexts);
+  return true;
 }
 
 bool CEntryCall::GiveBack(size_t count) {
