@@ -141,7 +141,7 @@ class CPlainReply {
   // As C reads a number: saturating in 64 bits, then the lower 32 of them.
   static int Number(std::string_view text) {
     char digits[32] = {};
-    std::memcpy(digits, text.data(), text.size() < 31 ? text.size() : 31);
+    text.copy(digits, sizeof digits - 1);
     return static_cast<int>(static_cast<unsigned>(std::strtoll(digits, nullptr, 10)));
   }
 
