@@ -43,7 +43,7 @@ final class Output {
 
     /**
      * The same stream. From now on what is written is held until more is asked of it, which may have
-     * to be waited for: a call of the system for every line costs a long log a third of its time.
+     * to be waited for: a call of the system for every line costs a long log a sixth of its time.
      * Whoever holds must {@link #send} at the end.
      */
     InputStream holdingUntil(InputStream stream) {
