@@ -1,7 +1,5 @@
 #include "gateway/core/conversions.h"
 
-#include <iterator>
-
 #include "gateway/core/gateway_pub.h"
 
 namespace {

@@ -90,7 +90,7 @@ int CGatewayPub::WritePublicHead(OrderHead head, char function, const OrderOrigi
     key.AppendTo(text);
     text.Text();
   }
-  return EndPublicHead(line, written);
+  return EndPublicText(line, written);
 }
 
 bool CGatewayPub::WriteOrderHead(CTextWriter& line, const OrderKey& key) {

@@ -39,8 +39,9 @@ inline std::string_view TakePiece(std::string_view& rest, char separator) {
   return piece;
 }
 
-// What a public header method returns: 1, or 0 with a message alone in its buffer.
-inline int EndPublicHead(CTextWriter& line, bool written) {
+// What a public method that writes into its caller's buffer returns: 1, or 0 with a message alone
+// there.
+inline int EndPublicText(CTextWriter& line, bool written) {
   const bool fits = !line.Overflowed();
   if (!fits) line.Replace(kBadParameters);
   line.Text();

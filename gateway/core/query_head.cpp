@@ -42,7 +42,7 @@ int CGatewayPub::initQueryHead(const char* branch, const char* identity, const c
                                char* out) {
   CTextWriter line = CTextWriter::Continue(out, kBufferSize);
   const bool written = WriteQueryHead(line, branch, identity, password);
-  return EndPublicHead(line, written);
+  return EndPublicText(line, written);
 }
 
 CTextWriter CGatewayPub::StartQuery(const char* branch, const char* identity, const char* password,

@@ -16,9 +16,7 @@ CGatewayFut::CGatewayFut()
 
 CGatewayFut::~CGatewayFut() {
   delete[] m_pFutData;
-  m_pFutData = nullptr;
   delete[] m_pOptData;
-  m_pOptData = nullptr;
 }
 
 void CGatewayFut::AppendFutData(const char* data, int length, bool reset) {
@@ -52,7 +50,7 @@ char* CGatewayFut::AnswerWithoutRecords(std::string_view reply, std::string_view
   if (code == kDoneCode) return nullptr;
   if (code == kNoDataCode) return Answer(noData);
   *status = -1;
-  CTextWriter answer(m_szBuffer, sizeof m_szBuffer);
+  CTextWriter answer = StartRequest();
   WriteReplyCode(code, reply, answer);
   return answer.Text();
 }

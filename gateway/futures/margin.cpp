@@ -88,7 +88,7 @@ char* CGatewayFut::QueryFinanceDecode(const char* reply, int* status) {
   CRecord record(kTags);
   CRecordWalker walker(text, kUnbounded);
   walker.Next(record);
-  CTextWriter result(m_szBuffer, sizeof m_szBuffer);
+  CTextWriter result = StartRequest();
   result.AppendText("1!TWD@");
   for (const Place& place : kLayout) AppendPlace(result, record, place);
   result.AppendChar('!');

@@ -87,7 +87,7 @@ constexpr TagRow kRows[] = {{kSequence, "67", 16},
 constexpr CListTable kTags(kRows, {kRecord});
 
 // A number that stands until a record brings another.
-class CStanding {
+class CStandingNumber {
  public:
   void Update(const CRecord& record, int field) {
     if (record.Has(field)) m_nValue = record.Number(field);
@@ -100,8 +100,8 @@ class CStanding {
 
 // What goes from one record to the next.
 struct Standing {
-  CStanding fillOrKill, immediateOrCancel;
-  CStanding quantity, cancelled, reduced, filled;
+  CStandingNumber fillOrKill, immediateOrCancel;
+  CStandingNumber quantity, cancelled, reduced, filled;
   char timeInForce = '\0';
   const char* product = "";
 };

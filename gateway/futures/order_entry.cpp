@@ -180,7 +180,7 @@ int EncodeRecord(CGatewayPub& gateway, const FuturesOrder& order, Sign* sign, ch
   const bool fits = !payload.Overflowed();
   payload.Text();
   if (!written || !fits) line.Replace(kBadParameters);
-  return EndPublicHead(line, written && fits);
+  return EndPublicText(line, written && fits);
 }
 
 }  // namespace

@@ -15,7 +15,7 @@
 namespace {
 
 // A section is never longer than twice its reply: the shortest record, 16 characters, gives 19, and
-// a price gives less than its field.
+// a price at most one character more than its field, where it wraps.
 constexpr size_t kSectionPerReply = 2;
 
 // Of the fields that are named by their tags no more is known than where the result shows them.
