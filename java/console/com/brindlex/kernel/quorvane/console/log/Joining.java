@@ -1,16 +1,16 @@
 package com.brindlex.kernel.quorvane.console.log;
 
+import com.brindlex.kernel.quorvane.console.Utf8;
 import com.brindlex.kernel.quorvane.console.message.Kind;
 import com.brindlex.kernel.quorvane.console.message.MessageReader;
-import java.nio.charset.StandardCharsets;
 import java.util.ArrayList;
 import java.util.List;
-import java.util.regex.Matcher;
 import java.util.regex.Pattern;
 
 /** A message that is being put together from the lines of a log. */
 final class Joining {
-    private static final Pattern LENGTH = Pattern.compile("(?:\\w+: |regMsg )Len:([0-9]{1,9})");
+    private static final String LENGTH = "Len:";
+    private static final int MOST_DIGITS = 9;
     private static final Pattern BASE64 = Pattern.compile("[A-Za-z0-9+/=]*\r?(?:\\|.*)?");
 
     /** What Android keeps of an entry: 4,068 bytes with its priority, its tag and two ends. */
@@ -41,15 +41,16 @@ final class Joining {
     /**
      * Begins with an entry.
      *
-     * @param kind what its text is
+     * @param text the text of the entry
+     * @param kind what that is
      * @param expected the bytes that a length line told of it; -1 when none did
      */
-    Joining(LogEntry entry, Kind kind, int expected) {
+    Joining(LogEntry entry, String text, Kind kind, int expected) {
         entries.add(entry);
-        this.first = entry.text();
+        this.first = text;
         this.kind = kind;
         boolean counts = kind == Kind.REPLY || kind == Kind.TEXT;
-        this.bytes = counts || kind == Kind.REQUEST ? bytes(first) : 0;
+        this.bytes = counts || kind == Kind.REQUEST ? Utf8.length(first) : 0;
         boolean told = counts && expected > bytes;
         this.expected = told ? expected : -1;
         this.isOpenBase64 = kind == Kind.REQUEST && endsInBase64(first);
@@ -71,14 +72,10 @@ final class Joining {
         return true;
     }
 
-    /** How long the next text is, when this one says so; -1 otherwise. */
-    static int length(String text) {
-        Matcher matcher = text.contains("Len:") ? LENGTH.matcher(text) : null;
-        return matcher != null && matcher.matches() ? Integer.parseInt(matcher.group(1)) : -1;
-    }
-
-    private static int bytes(String text) {
-        return text.getBytes(StandardCharsets.UTF_8).length;
+    /** How long a length line says that the next text is; -1 when it is no length that can be. */
+    static int length(String line) {
+        String number = line.substring(line.lastIndexOf(LENGTH) + LENGTH.length());
+        return number.length() <= MOST_DIGITS ? Integer.parseInt(number) : -1;
     }
 
     /** Whether nothing can follow. */
@@ -109,6 +106,9 @@ final class Joining {
 
     /** Looks at what was not seen yet: a message of many lines is read once. */
     private void look() {
+        if (seen == length()) {
+            return;
+        }
         int from = Math.max(0, seen - RECORD_END.length() + 1);
         String fresh = joined == null ? first : joined.substring(from);
         isSigned |= fresh.contains("!!");
@@ -136,7 +136,7 @@ final class Joining {
         splits.add(joined.length());
         joined.append(more);
         entries.add(entry);
-        bytes += bytes(more) + (feed ? 1 : 0);
+        bytes += Utf8.length(more) + (feed ? 1 : 0);
         isOpenBase64 &= more.indexOf('|') < 0;
         return true;
     }
@@ -161,7 +161,7 @@ final class Joining {
                 || its == Kind.HEADER || its == Kind.MARK || its == Kind.RESULT
                 || begins(more);
         return !another && length() < LineReader.LONGEST
-                && (expected < 0 || bytes + bytes(more) <= expected);
+                && (expected < 0 || bytes + Utf8.length(more) <= expected);
     }
 
     private static boolean begins(String text) {
@@ -170,14 +170,14 @@ final class Joining {
 
     /** Whether a line feed stood before a line; where a text is logged in pieces none did. */
     private boolean isFeed(String more) {
-        boolean room = expected < 0 || bytes + bytes(more) < expected;
+        boolean room = expected < 0 || bytes + Utf8.length(more) < expected;
         return isOpenBase64 || room && !isPiece();
     }
 
     /** Whether the last line is as long as pieces are: a round number, or what an entry holds. */
     private boolean isPiece() {
         String last = entries.get(entries.size() - 1).text();
-        return bytes(last) >= ROUND_PIECES
+        return Utf8.isAtLeast(last, ROUND_PIECES)
                 || last.length() >= LIKELY_CUT && last.length() % 100 == 0;
     }
 
@@ -203,10 +203,10 @@ final class Joining {
                             + "the charset: is it another one (--charset)?"));
         }
         Kind its = joined == null ? kind : MessageReader.kind(whole);
-        return new LogMessage(its, List.copyOf(entries), whole, List.copyOf(splits), flaws);
+        return new LogMessage(its, entries, whole, splits, flaws);
     }
 
     private boolean isCutByAndroid() {
-        return bytes(entries.get(entries.size() - 1).text()) >= LONGEST_ENTRY - 80;
+        return Utf8.isAtLeast(entries.get(entries.size() - 1).text(), LONGEST_ENTRY - 80);
     }
 }

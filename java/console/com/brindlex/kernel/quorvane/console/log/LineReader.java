@@ -19,7 +19,7 @@ public final class LineReader implements Closeable {
     public static final int LONGEST = 1 << 20;
 
     private final InputStream stream;
-    private final char[] buffer = new char[8192];
+    private final char[] buffer = new char[1 << 16];
     private final StringBuilder line = new StringBuilder();
     private Charset charset;
     private Reader in;

@@ -88,11 +88,12 @@ public final class LogReader implements Closeable {
         Kind kind = own || tagless ? MessageReader.kind(text) : Kind.TEXT;
         int[] found = isBegin(kind, text) ? null : Unwrap.find(text);
         if (found == null) {
-            return own || tagless ? new Joining(entry, kind, expected) : null;
+            return own || tagless ? new Joining(entry, text, kind, expected) : null;
         }
         LogEntry message = new LogEntry(entry.line(), header, entry.begin() + found[0],
                 entry.begin() + found[1]);
-        return new Joining(message, MessageReader.kind(message.text()), expected);
+        String inside = message.text();
+        return new Joining(message, inside, MessageReader.kind(inside), expected);
     }
 
     /** Whether a text is a message from its begin on: nothing stands around it. */

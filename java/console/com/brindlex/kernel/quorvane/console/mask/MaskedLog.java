@@ -1,5 +1,6 @@
 package com.brindlex.kernel.quorvane.console.mask;
 
+import com.brindlex.kernel.quorvane.console.Utf8;
 import com.brindlex.kernel.quorvane.console.log.LogEntry;
 import com.brindlex.kernel.quorvane.console.log.LogLine;
 import com.brindlex.kernel.quorvane.console.log.LogMessage;
@@ -7,7 +8,6 @@ import com.brindlex.kernel.quorvane.console.log.LogReader;
 import com.brindlex.kernel.quorvane.console.message.Kind;
 import com.brindlex.kernel.quorvane.console.message.MessageReader;
 import java.io.IOException;
-import java.nio.charset.StandardCharsets;
 import java.util.ArrayList;
 import java.util.List;
 import java.util.Set;
@@ -85,13 +85,9 @@ public final class MaskedLog {
             return;
         }
         Masker.Masked masked = masker.mask(message.text(), message.splits());
-        longer = bytes(masked.text()) - bytes(message.text());
+        longer = Utf8.length(masked.text()) - Utf8.length(message.text());
         flush();
         write(message, masked, out);
-    }
-
-    private static int bytes(String text) {
-        return text.getBytes(StandardCharsets.UTF_8).length;
     }
 
     private void writeLength(LogMessage message, Consumer<String> out) {

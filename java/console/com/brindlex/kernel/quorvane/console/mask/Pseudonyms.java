@@ -1,5 +1,6 @@
 package com.brindlex.kernel.quorvane.console.mask;
 
+import com.brindlex.kernel.quorvane.console.Utf8;
 import java.net.URLEncoder;
 import java.nio.charset.StandardCharsets;
 import java.time.LocalDate;
@@ -124,7 +125,7 @@ final class Pseudonyms {
             return;
         }
         alone.put(value, name);
-        int bytes = value.getBytes(StandardCharsets.UTF_8).length;
+        int bytes = Utf8.length(value);
         boolean few = bytes < SHORTEST_WORD || value.length() < Forms.SHORTEST
                 || bytes < SHORTEST_NUMBER && value.matches("[0-9]+");
         if (few) {
