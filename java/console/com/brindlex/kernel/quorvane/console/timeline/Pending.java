@@ -2,12 +2,13 @@ package com.brindlex.kernel.quorvane.console.timeline;
 
 import com.brindlex.kernel.quorvane.console.dictionary.Dictionary;
 import com.brindlex.kernel.quorvane.console.message.Message;
-import java.util.ArrayList;
 import java.util.HashMap;
 import java.util.Iterator;
 import java.util.LinkedHashMap;
+import java.util.LinkedHashSet;
 import java.util.List;
 import java.util.Map;
+import java.util.Set;
 
 /** The requests that wait for their replies: by their ids, and in the order of the log. */
 final class Pending {
@@ -21,12 +22,11 @@ final class Pending {
     private final Map<String, Request> byId = new HashMap<>();
 
     void add(Row row, long millis, Message message) {
-        List<String> decoders = new ArrayList<>();
+        Set<String> decoders = new LinkedHashSet<>();
         for (String operation : message.operations()) {
             decoders.addAll(Dictionary.get().operation(operation).answeredBy());
         }
-        Request request = new Request(row, millis, decoders.stream().distinct().toList(),
-                message.text());
+        Request request = new Request(row, millis, List.copyOf(decoders), message.text());
         inOrder.put(row.line(), request);
         if (!row.requestId().isEmpty()) {
             byId.put(row.requestId(), request);

@@ -25,6 +25,9 @@ public final class Timeline {
     /** The one decoder whose result is not logged, nor its reply. */
     private static final String UNLOGGED = "FutQueryOrderDecode";
 
+    private static final List<String> DECODERS = decoders(false);
+    private static final List<String> STOCK_DECODERS = decoders(true);
+
     private final Pending pending = new Pending();
     private final Map<String, Call> calls = new Newest<>(MOST_THREADS);
     private String lastReply = "";
@@ -211,15 +214,14 @@ public final class Timeline {
         return operation.refusals().contains(message.id());
     }
 
+    private static List<String> decoders(boolean ofStock) {
+        return Dictionary.get().operations().stream().filter(each -> !each.isEncoder()
+                && (!ofStock || each.gatewayClass().equals("CGatewayStk")))
+                .map(Operation::name).toList();
+    }
+
     private static List<String> ofClass(Call call) {
-        List<String> decoders = new ArrayList<>();
-        for (Operation operation : Dictionary.get().operations()) {
-            boolean stock = operation.gatewayClass().equals("CGatewayStk");
-            if (!operation.isEncoder() && (!call.isStock || stock)) {
-                decoders.add(operation.name());
-            }
-        }
-        return decoders;
+        return call.isStock ? STOCK_DECODERS : DECODERS;
     }
 
     /** The end of a call that has shown nothing: its text, if an empty one, was its result. */
@@ -233,7 +235,7 @@ public final class Timeline {
             return answered(source, pending.takeOldest(List.of(UNLOGGED)),
                     "answered; the library does not log how", "answered");
         }
-        if (call.text == null) {
+        if (call.text == null || oldest == null) {
             return null;
         }
         boolean empty = call.text.text().isEmpty();
