@@ -35,12 +35,17 @@ final class Binding {
         this.text = text;
     }
 
-    /** Lays a request over the one of several forms that fits it best. */
-    static List<Binding> best(List<Template> templates, List<Cut.Piece> pieces, String text) {
+    /**
+     * Lays a request over the one of several forms that fits it best.
+     *
+     * @param tags the tags of the fields, as {@link Cut#tags} has them
+     */
+    static List<Binding> best(List<Template> templates, List<Cut.Piece> pieces, String tags,
+            String text) {
         List<Binding> best = new ArrayList<>(2);
         for (Template template : templates) {
             Binding binding = new Binding(template, text);
-            binding.bind(pieces);
+            binding.bind(pieces, tags);
             int order = best.isEmpty() ? -1
                     : Integer.compare(binding.weight(), best.get(0).weight());
             if (order < 0) {
@@ -78,8 +83,8 @@ final class Binding {
         return null;
     }
 
-    private void bind(List<Cut.Piece> pieces) {
-        if (template.tags.equals(Cut.tags(pieces))) {
+    private void bind(List<Cut.Piece> pieces, String tags) {
+        if (template.tags.equals(tags)) {
             for (int i = 0; i < pieces.size(); i++) {
                 bind(template.slots.get(i), pieces.get(i));
             }

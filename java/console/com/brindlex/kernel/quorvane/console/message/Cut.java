@@ -66,22 +66,27 @@ final class Cut {
     }
 
     private static Piece piece(String text, int begin, int end) {
-        int sign = text.indexOf('=', begin);
-        if (sign < 0 || sign >= end || sign - begin > LONGEST_TAG || !isTag(text, begin, sign)) {
+        int sign = tagEnd(text, begin, end);
+        if (sign < 0) {
             return new Piece("", text.substring(begin, end), begin, begin);
         }
         return new Piece(text.substring(begin, sign), text.substring(sign + 1, end), begin,
                 sign + 1);
     }
 
-    private static boolean isTag(String text, int begin, int end) {
-        for (int i = begin; i < end; i++) {
+    /** Where the tag of a field ends, before its equals sign; -1 when the field has none. */
+    private static int tagEnd(String text, int begin, int end) {
+        int last = Math.min(end - 1, begin + LONGEST_TAG);
+        for (int i = begin; i <= last; i++) {
             char c = text.charAt(i);
+            if (c == '=') {
+                return i > begin ? i : -1;
+            }
             if (!(c >= '0' && c <= '9' || c >= 'A' && c <= 'Z')) {
-                return false;
+                return -1;
             }
         }
-        return end > begin;
+        return -1;
     }
 
     /** The tags of fields in order, as one text to compare by. */

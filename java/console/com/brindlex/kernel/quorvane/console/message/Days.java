@@ -9,16 +9,12 @@ final class Days {
 
     private Days() {}
 
-    private static boolean isDigits(String text) {
-        return !text.isEmpty() && text.chars().allMatch(c -> c >= '0' && c <= '9');
-    }
-
     /**
      * A date: YYYYMMDD, or the year of the Republic of China with MMDD; null when it is none, or
      * none that there ever was.
      */
     static LocalDate date(String text) {
-        if (text.length() < 6 || text.length() > 8 || !isDigits(text)) {
+        if (!Digits.all(text, 6, 8)) {
             return null;
         }
         int number = Integer.parseInt(text);
@@ -32,10 +28,10 @@ final class Days {
 
     /** Whether the first six characters are a time of day, HHMMSS. */
     static boolean isTime(String text) {
-        if (text.length() < 6 || !isDigits(text.substring(0, 6))) {
+        if (!Digits.begin(text, 6)) {
             return false;
         }
-        int number = Integer.parseInt(text.substring(0, 6));
+        int number = Integer.parseInt(text, 0, 6, 10);
         return number / 10000 < 24 && number / 100 % 100 < 60 && number % 100 < 61;
     }
 
@@ -53,7 +49,6 @@ final class Days {
 
     /** Whether a text is a contract month, YYYYMM. */
     static boolean isMonth(String text) {
-        return text.length() >= 6 && isDigits(text.substring(0, 6))
-                && date(text.substring(0, 6) + "01") != null;
+        return Digits.begin(text, 6) && date(text.substring(0, 6) + "01") != null;
     }
 }

@@ -10,10 +10,15 @@ final class Digits {
 
     /** Whether a text is digits alone, so many of them. */
     static boolean all(String text, int least, int most) {
-        if (text.length() < least || text.length() > most) {
+        return text.length() >= least && text.length() <= most && begin(text, text.length());
+    }
+
+    /** Whether a text begins with so many digits. */
+    static boolean begin(String text, int count) {
+        if (text.length() < count) {
             return false;
         }
-        for (int i = 0; i < text.length(); i++) {
+        for (int i = 0; i < count; i++) {
             if (!isDigit(text.charAt(i))) {
                 return false;
             }

@@ -49,10 +49,10 @@ public final class MessageReader {
                 return Kind.MESSAGE;
             }
         }
-        if (RESULT.matcher(text).lookingAt()) {
+        if (text.indexOf('!') >= 0 && RESULT.matcher(text).lookingAt()) {
             return Kind.RESULT;
         }
-        if (FIELDS.matcher(text).lookingAt()) {
+        if (text.indexOf('|') >= 0 && FIELDS.matcher(text).lookingAt()) {
             return isRequest(text) ? Kind.REQUEST : Kind.REPLY;
         }
         return isKnownMessage(text) ? Kind.MESSAGE : Kind.TEXT;

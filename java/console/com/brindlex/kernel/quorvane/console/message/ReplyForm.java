@@ -30,6 +30,7 @@ final class ReplyForm {
 
     final Operation operation;
     final Reply reply;
+    final boolean isReceipt;
     final Map<String, Dictionary.Tag> names;
     private final Map<String, Integer> ofReply = new HashMap<>();
     private final Map<String, Integer> ofRecord = new HashMap<>();
@@ -41,6 +42,7 @@ final class ReplyForm {
     private ReplyForm(Operation operation, Reply reply) {
         this.operation = operation;
         this.reply = reply;
+        this.isReceipt = reply.isReceipt();
         this.names = Dictionary.get().tags(operation.scene());
         reply.replyTags().forEach(each -> ofReply.put(each.tag(), each.bound()));
         if (reply.record() != null) {
@@ -110,7 +112,12 @@ final class ReplyForm {
     }
 
     boolean reads(String tag) {
-        return ofRecord.containsKey(tag) || ofReply.containsKey(tag);
+        return ofRecord.containsKey(tag) || ofReply(tag);
+    }
+
+    /** Whether a tag is read from the whole reply, not record by record. */
+    boolean ofReply(String tag) {
+        return ofReply.containsKey(tag);
     }
 
     /** The size that bounds a value; null when nothing does. */

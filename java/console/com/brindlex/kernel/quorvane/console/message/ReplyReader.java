@@ -1,8 +1,8 @@
 package com.brindlex.kernel.quorvane.console.message;
 
+import com.brindlex.kernel.quorvane.console.Utf8;
 import com.brindlex.kernel.quorvane.console.dictionary.Dictionary;
 import com.brindlex.kernel.quorvane.console.dictionary.Reply;
-import java.nio.charset.StandardCharsets;
 import java.util.ArrayList;
 import java.util.HashMap;
 import java.util.LinkedHashSet;
@@ -85,10 +85,10 @@ final class ReplyReader {
     }
 
     private void checkOutcome(ReplyWords words) {
-        if (words.code().isEmpty() && !form.reply.isReceipt() && form.reads("68")) {
+        if (words.code().isEmpty() && !form.isReceipt && form.reads("68")) {
             faults.add(new Fault(0, "no-result-code", "the reply has no result code (tag 68)"));
         }
-        if (form.reply.isReceipt() && pieces.stream().noneMatch(each -> each.tag().equals("39"))) {
+        if (form.isReceipt && pieces.stream().noneMatch(each -> each.tag().equals("39"))) {
             faults.add(new Fault(0, "missing-field",
                     "the receipt has no refusal mark (tag 39): it reads as refused"));
         }
@@ -115,13 +115,13 @@ final class ReplyReader {
         } else {
             check(piece);
         }
-        Dictionary.Tag name = form.names.get(tag);
-        show(new Field(piece.offset(), tag, piece.value(), name == null ? null : name.label(),
-                full ? meaning(tag, piece.value()) : ""));
+        show(piece);
     }
 
     private void end(Cut.Piece piece) {
-        show(new Field(piece.offset(), "01", piece.value(), "record ends", ""));
+        if (full) {
+            open.add(new Field(piece.offset(), "01", piece.value(), "record ends", ""));
+        }
         if (recordBegin < 0) {
             if (records > 0) {
                 faults.add(new Fault(piece.offset(), "record-not-opened",
@@ -129,14 +129,12 @@ final class ReplyReader {
             }
             return;
         }
-        int length = piece.offset() - recordBegin;
         Reply.Records layout = form.reply.record();
-        if (layout != null && layout.size() != null && length * 3 >= layout.size()) {
-            int bytes = text.substring(recordBegin, piece.offset())
-                    .getBytes(StandardCharsets.UTF_8).length;
-            if (bytes >= layout.size()) {
-                faults.add(new Fault(recordBegin, "record-too-long", "a record of " + bytes
-                                + " bytes is dropped: there is room for "
+        if (layout != null && layout.size() != null) {
+            String whole = text.substring(recordBegin, piece.offset());
+            if (Utf8.isAtLeast(whole, layout.size())) {
+                faults.add(new Fault(recordBegin, "record-too-long", "a record of "
+                                + Utf8.length(whole) + " bytes is dropped: there is room for "
                                 + (layout.size() - 1)));
             }
         }
@@ -174,10 +172,9 @@ final class ReplyReader {
             return;
         }
         Integer bound = form.bound(tag, recordBegin >= 0);
-        if (bound != null && piece.value().length() * 3 >= bound
-                && piece.value().getBytes(StandardCharsets.UTF_8).length >= bound) {
+        if (bound != null && Utf8.isAtLeast(piece.value(), bound)) {
             faults.add(new Fault(piece.at(), "too-long", "tag " + tag + ": "
-                            + piece.value().getBytes(StandardCharsets.UTF_8).length
+                            + Utf8.length(piece.value())
                             + " bytes are dropped, there is room for " + (bound - 1)));
         } else if (!ended) {
             ReplyValues.check(form, piece, faults);
@@ -191,9 +188,11 @@ final class ReplyReader {
         return ReplyValues.meaning(form.column(tag), value);
     }
 
-    private void show(Field field) {
+    private void show(Cut.Piece piece) {
         if (full) {
-            open.add(field);
+            Dictionary.Tag name = form.names.get(piece.tag());
+            open.add(new Field(piece.offset(), piece.tag(), piece.value(),
+                    name == null ? null : name.label(), meaning(piece.tag(), piece.value())));
         }
     }
 

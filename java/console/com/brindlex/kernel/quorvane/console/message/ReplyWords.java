@@ -13,13 +13,15 @@ final class ReplyWords {
     private final List<Cut.Piece> pieces;
     private final int records;
     private final String code;
+    private final boolean isRefused;
 
     ReplyWords(ReplyForm form, List<Cut.Piece> pieces, int records) {
         this.form = form;
         this.pieces = pieces;
         this.records = records;
-        boolean ofReply = form.reply.replyTags().stream().anyMatch(tag -> tag.tag().equals("68"));
-        this.code = Cut.value(ofReply ? pieces : firstRecord(pieces), "68");
+        this.code = Cut.value(form.ofReply("68") ? pieces : firstRecord(pieces), "68");
+        this.isRefused = form.isReceipt ? !isAccepted()
+                : form.reads("68") && !code.equals("0000") && !code.equals("5001");
     }
 
     /** The first record; the whole reply when it has none. */
@@ -40,9 +42,7 @@ final class ReplyWords {
     }
 
     boolean isRefused() {
-        return form.reply.isReceipt() ? !isAccepted()
-                                      : form.reads("68") && !code.equals("0000")
-                                              && !code.equals("5001");
+        return isRefused;
     }
 
     /** A single blank in tag 39, and an acceptance letter in tag 19. */
@@ -60,12 +60,11 @@ final class ReplyWords {
     }
 
     String words() {
-        if (form.reply.isReceipt()) {
-            String number = Cut.value(pieces, "46");
-            return isAccepted() ? ("accepted " + number).strip()
-                                : "refused: " + orNothing(Cut.value(pieces, "K1"));
+        if (form.isReceipt) {
+            return isRefused ? "refused: " + orNothing(Cut.value(pieces, "K1"))
+                             : ("accepted " + Cut.value(pieces, "46")).strip();
         }
-        if (isRefused()) {
+        if (isRefused) {
             String said = orNothing(Cut.value(pieces, "M2"));
             return "refused: " + said + (code.isEmpty() ? "" : " (" + code + ")");
         }
@@ -93,7 +92,7 @@ final class ReplyWords {
         if (!id.isEmpty()) {
             facts.put("requestId", id);
         }
-        facts.put("outcome", isRefused() ? "refused" : "done");
+        facts.put("outcome", isRefused ? "refused" : "done");
         if (!code.isEmpty()) {
             facts.put("code", code);
         }

@@ -26,11 +26,11 @@ final class RequestReader {
         }
         List<Template> same = new ArrayList<>(alike);
         same.removeIf(each -> !each.hasConstants(pieces));
-        List<Binding> best = Binding.best(same, pieces, request);
+        List<Binding> best = Binding.best(same, pieces, tags, request);
         if (best.isEmpty() || !best.get(0).fits()) {
             List<Template> all = new ArrayList<>(alike);
             all.addAll(forms.closest(pieces));
-            best = Binding.best(all, pieces, request);
+            best = Binding.best(all, pieces, tags, request);
         }
         Binding binding = best.get(0);
         List<String> operations = best.size() == 1 ? List.of(binding.template.operation.name())
@@ -107,13 +107,8 @@ final class RequestReader {
 
     /** The places of a signature payload, named as the form names them. */
     private static List<Field> payload(Binding binding, Cut.Piece piece) {
-        String separator = Signature.separator(binding.template);
-        List<List<Template.Part>> places = List.of();
-        for (Template.Slot slot : binding.template.slots) {
-            if (slot.tag().equals(Cut.PAYLOAD)) {
-                places = Signature.places(slot.parts(), separator);
-            }
-        }
+        String separator = binding.template.separator;
+        List<List<Template.Part>> places = binding.template.signed;
         List<Field> fields = new ArrayList<>();
         int offset = piece.at();
         int at = 0;

@@ -10,16 +10,9 @@ import java.util.List;
 /** Holds a signature payload, place by place, against the body that it signs. */
 final class Signature {
     private final Binding binding;
-    private final String separator;
 
     private Signature(Binding binding) {
         this.binding = binding;
-        this.separator = separator(binding.template);
-    }
-
-    /** What stands between the places: commas in tag PL, underscores in a bare payload. */
-    static String separator(Template template) {
-        return template.has("PL") ? "," : "_";
     }
 
     static void check(Binding binding, Slot slot, Cut.Piece piece) {
@@ -27,7 +20,8 @@ final class Signature {
     }
 
     private void check(Slot slot, Cut.Piece piece) {
-        List<List<Part>> places = places(slot.parts(), separator);
+        String separator = binding.template.separator;
+        List<List<Part>> places = binding.template.signed;
         List<String> values = Arrays.asList(piece.value().split(separator, -1));
         if (places.size() != values.size()) {
             if (!piece.value().equals(rendered(slot.parts()))) {
@@ -45,15 +39,26 @@ final class Signature {
 
     /** The payload as the body makes it; an unknown place makes it none. */
     private String rendered(List<Part> parts) {
+        if (parts.size() == 1) {
+            return rendered(parts.get(0));
+        }
         StringBuilder out = new StringBuilder();
         for (Part part : parts) {
-            Bound known = part.isPlace() ? binding.bound.get(part.key()) : null;
-            if (part.isPlace() && known == null) {
+            String text = rendered(part);
+            if (text == null) {
                 return null;
             }
-            out.append(part.isPlace() ? known.wire() : part.literal());
+            out.append(text);
         }
         return out.toString();
+    }
+
+    private String rendered(Part part) {
+        if (!part.isPlace()) {
+            return part.literal();
+        }
+        Bound known = binding.bound.get(part.key());
+        return known == null ? null : known.wire();
     }
 
     /** Cuts the parts of a payload at its separators. */
@@ -107,11 +112,10 @@ final class Signature {
     private void checkJoined(List<Part> parts, String value, int offset) {
         int at = 0;
         for (Part part : parts) {
-            Bound known = part.isPlace() ? binding.bound.get(part.key()) : null;
-            if (part.isPlace() && known == null) {
+            String text = rendered(part);
+            if (text == null) {
                 return;
             }
-            String text = part.isPlace() ? known.wire() : part.literal();
             if (!value.startsWith(text, at)) {
                 binding.fault(offset, "signature-mismatch", "the signature says "
                                 + binding.quoted(value) + ", which does not begin with "

@@ -17,7 +17,7 @@ final class Template {
      * @param literal the fixed text; null for a place
      * @param name what fills the place, or what the fixed text is; null when it is nothing
      * @param conversion how it is written; null when it stands as it is
-     * @param key name and conversion as one
+     * @param key name and conversion as one, interned: the rules look values up by literals
      * @param argument the argument of that name; null when the value is worked out
      */
     record Part(String literal, String name, String conversion, String key, Argument argument) {
@@ -39,6 +39,12 @@ final class Template {
     final List<Slot> slots;
     final String tags;
 
+    /** What stands between the places of the payload: commas in tag PL, else underscores. */
+    final String separator;
+
+    /** The places of the signature payload; empty when the form has none. */
+    final List<List<Part>> signed;
+
     /** The fixed value of each field; null for one with a place. */
     private final String[] constants;
 
@@ -55,6 +61,9 @@ final class Template {
         this.slots = pieces.stream()
                 .map(piece -> new Slot(piece.tag(), parts(piece.value()))).toList();
         this.tags = Cut.tags(pieces);
+        this.separator = has("PL") ? "," : "_";
+        this.signed = slots.stream().filter(slot -> slot.tag().equals(Cut.PAYLOAD)).findFirst()
+                .map(slot -> Signature.places(slot.parts(), separator)).orElse(List.of());
         this.constants = slots.stream().map(Template::constant).toArray(String[]::new);
     }
 
@@ -98,9 +107,9 @@ final class Template {
                 continue;
             }
             String[] place = inside.split(String.valueOf(BAR));
-            String conversion = place.length > 1 ? place[1] : null;
-            parts.add(new Part(null, place[0], conversion,
-                    conversion == null ? place[0] : place[0] + "|" + conversion,
+            String conversion = place.length > 1 ? place[1].intern() : null;
+            String key = conversion == null ? place[0] : place[0] + "|" + conversion;
+            parts.add(new Part(null, place[0].intern(), conversion, key.intern(),
                     operation.argument(place[0])));
             at = close + 1;
         }

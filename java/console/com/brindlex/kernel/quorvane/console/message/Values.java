@@ -1,16 +1,17 @@
 package com.brindlex.kernel.quorvane.console.message;
 
+import com.brindlex.kernel.quorvane.console.Utf8;
 import com.brindlex.kernel.quorvane.console.dictionary.Argument;
 import com.brindlex.kernel.quorvane.console.dictionary.CodeTable;
 import com.brindlex.kernel.quorvane.console.dictionary.Dictionary;
 import com.brindlex.kernel.quorvane.console.message.Binding.Bound;
-import java.nio.charset.StandardCharsets;
 import java.util.Base64;
 import java.util.List;
 import java.util.regex.Pattern;
 
 /** Holds each value of a request against its argument, its conversion and its codes. */
 final class Values {
+    private static final Pattern STRIKE = Pattern.compile("[0-9]{1,9}(\\.[0-9]*)?");
     private static final Pattern BETWEEN_DIGITS = Pattern.compile("(?<=[0-9])[-/.](?=[0-9])");
     private static final String NO_PRICE = "00000000.000000";
     private static final String OF_ONE_OR_TWO_BYTES = "====";
@@ -81,7 +82,7 @@ final class Values {
                         "is no contract month");
             }
             if (argument.name().startsWith("strike")) {
-                require(wire.matches("[0-9]{1,9}(\\.[0-9]*)?"), value, "not-a-price",
+                require(STRIKE.matcher(wire).matches(), value, "not-a-price",
                         "is no strike price");
             }
         }
@@ -90,7 +91,7 @@ final class Values {
 
     private void length(Bound value, Argument argument) {
         Integer longest = argument.maxLength();
-        if (longest == null || bytes(value.wire()) <= longest) {
+        if (longest == null || !Utf8.isAtLeast(value.wire(), longest + 1)) {
             return;
         }
         // a serial number that fills its field runs on into the address
@@ -113,12 +114,13 @@ final class Values {
     }
 
     private void code(Bound value, Argument argument) {
-        if (argument.codes() == null || !dictionary.codes(argument.codes()).isClosed()) {
+        CodeTable table = argument.codes() == null ? null : dictionary.codes(argument.codes());
+        if (table == null || !table.isClosed()) {
             return;
         }
         String wire = value.wire();
         boolean blank = wire.isBlank() && !argument.required();
-        CodeTable.Code code = dictionary.codes(argument.codes()).find(wire);
+        CodeTable.Code code = table.find(wire);
         String operation = binding.template.operation.name();
         boolean listsOnly = code != null && code.listsOnly()
                 && binding.template.operation.scene().equals("stockOrder");
@@ -170,14 +172,10 @@ final class Values {
         }
         String lengths = conversion.equals("first") ? binding.template.identity.first()
                                                     : binding.template.identity.second();
-        int length = bytes(value.wire());
+        int length = Utf8.length(value.wire());
         require(value.tag().equals(Cut.PAYLOAD) || inside(lengths, length), value, "wrong-length",
                 "has " + length + " characters, not "
                         + lengths.replace(" ", " or ").replace("-", " to "));
-    }
-
-    private static int bytes(String text) {
-        return text.getBytes(StandardCharsets.UTF_8).length;
     }
 
     private static boolean inside(String lengths, int length) {
@@ -210,8 +208,9 @@ final class Values {
     }
 
     private void date(Bound value, String wire) {
-        String digits = BETWEEN_DIGITS.matcher(wire).replaceAll("");
-        require(Days.date(digits) != null, value, "impossible-date", "is no date");
+        boolean good = Days.date(wire) != null
+                || Days.date(BETWEEN_DIGITS.matcher(wire).replaceAll("")) != null;
+        require(good, value, "impossible-date", "is no date");
     }
 
     private void require(boolean good, Bound value, String kind, String said) {
