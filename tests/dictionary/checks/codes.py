@@ -36,6 +36,8 @@ def run(whole, program, _):
     for books, name in (("stock", "QueryOrderDecode"), ("futures", "FutQueryOrderDecode")):
         if name in wanted:
             _judge_states(found, tables, decoders[name], books)
+    if "QueryOrderDecode" in wanted:
+        _judge_markets(found, tables, decoders["QueryOrderDecode"])
     return found.finish("codes")
 
 
@@ -147,3 +149,19 @@ def _judge_states(found, tables, decoder, books):
     shown.discard("")
     found.expect(shown == listed, f"{decoder.name}: the states {sorted(shown ^ listed)} stand on "
                                   f"one side")
+
+
+def _judge_markets(found, tables, decoder):
+    """The markets that show a sent or waiting order in other words are those of the table."""
+    listed = {row["code"] for row in tables["markets"]["values"] if row["code"].isdigit()}
+    usual = dict(library.usual(decoder.operation))
+    lines = [decoder.line(None, dict(decoder.fields, **{"39": state, "K1": text}))
+             for state, text in (("0", "委託已傳送，等待接收回報！"), ("E", "WAIT "))]
+    markets = [str(market) for market in range(-128, 600)]
+    calls = [(decoder.operation, dict(usual, market=market, reply=line))
+             for market in markets for line in lines]
+    answers = [result for _, result, _ in decoder.lib.ask(calls)]
+    shown = dict(zip(markets, zip(answers[::2], answers[1::2])))
+    own = {market for market in markets if shown[market] != shown["0"]}
+    found.expect(own == listed, f"{decoder.name}: the markets {sorted(own ^ listed)} stand on one "
+                                f"side")

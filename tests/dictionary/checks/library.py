@@ -26,7 +26,7 @@ class Library:
             [self.program], input="\n".join(lines).encode() + b"\n", capture_output=True, check=False)
         answers = run.stdout.decode("utf-8", "surrogateescape").split("\n")[:-1]
         if run.returncode != 0 or len(answers) != len(lines):
-            raise SystemExit(f"{self.program}: {run.stderr.decode()}")
+            raise SystemExit(f"{self.program}: {run.stderr.decode()[:300]}")
         return [_answer(answer) for answer in answers]
 
 
