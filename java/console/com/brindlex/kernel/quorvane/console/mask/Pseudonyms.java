@@ -5,7 +5,7 @@ import java.net.URLEncoder;
 import java.nio.charset.StandardCharsets;
 import java.time.LocalDate;
 import java.util.Base64;
-import java.util.HashMap;
+import java.util.EnumMap;
 import java.util.HashSet;
 import java.util.LinkedHashMap;
 import java.util.Map;
@@ -17,7 +17,7 @@ final class Pseudonyms {
     private static final int SHORTEST_WORD = 4;
     private static final int SHORTEST_NUMBER = 6;
 
-    private final Map<Secret, Map<String, String>> names = new HashMap<>();
+    private final Map<Secret, Map<String, String>> names = new EnumMap<>(Secret.class);
     private final Map<String, String> forms = new LinkedHashMap<>();
     private final Map<String, String> alone = new HashMap<>();
     private final Set<String> taken = new HashSet<>();
