@@ -13,6 +13,7 @@
 #include "tests/fuzz/lean_host.h"
 #include "tests/fuzz/lent_memory.h"
 #include "tests/fuzz/plain_reader.h"
+#include "tests/fuzz/reply_tables.h"
 #include "tests/support/surroundings.h"
 
 namespace gateway_fuzz {
@@ -22,37 +23,7 @@ using gateway_tests::AllExports;
 using gateway_tests::Export;
 using gateway_tests::kExportCount;
 
-constexpr size_t kUnbounded = 0;
 constexpr size_t kNowhere = std::string_view::npos;
-
-// A field: its tag, the size of its buffer, and whether blank values are passed over.
-struct Field {
-  const char* tag;
-  size_t bound;
-  bool skipBlank;
-};
-
-// The answer to a reply that is none.
-struct Failure {
-  int32_t status;
-  const char* text;
-};
-
-// What a decoder reads of a reply. Lists of fields end with one that has no tag.
-struct Table {
-  const char* decoder;
-  size_t recordSize;       // of the buffer that a record must fit
-  int endMark;             // a record whose 67 is as high ends the list; 0 where none does
-  bool endsAtEmptyRecord;  // so does a record that is empty, or too long
-  bool onlyFirst;          // reads one record alone
-  Field head[16];          // of the whole reply
-  Field record[64];
-  Failure failures[3];  // a gateway that is down, a broker that is, nothing at all
-};
-
-constexpr Table kTables[] = {
-#include "tests/fuzz/reply_tables.inc"
-};
 constexpr size_t kDecoders = sizeof kTables / sizeof *kTables;
 
 Export s_rows[kDecoders];
