@@ -5,6 +5,7 @@
 #include <string>
 #include <string_view>
 
+#include "tests/fuzz/reply_tables.h"
 #include "tests/support/recording_host.h"
 #include "tests/support/sample_replies.h"
 
@@ -27,10 +28,20 @@ Outcome DecodeWithSequence(std::string_view decoder, std::string_view sequence) 
 
 TEST(ListReplies, BlankSequenceIsTakenAndEndsNoList) {
   for (const std::string_view decoder : kListDecoders) {
-    const Outcome blank = DecodeWithSequence(decoder, "|67= ");
-    const Outcome ended = DecodeWithSequence(decoder, "|67=900001");
-    EXPECT_NE(blank.result, ended.result) << decoder;
-    EXPECT_EQ(DecodeWithSequence(decoder, "|67= |67=900001").result, blank.result) << decoder;
+    EXPECT_EQ(DecodeWithSequence(decoder, "|67= |67=900001").result,
+              DecodeWithSequence(decoder, "|67= ").result)
+        << decoder;
+  }
+}
+
+TEST(ListReplies, EndMarkIsTheFirstSequenceThatEndsAList) {
+  for (const gateway_fuzz::Table& table : gateway_fuzz::kTables) {
+    if (table.endMark == 0) continue;
+    const auto decode = [&table](int sequence) {
+      return DecodeWithSequence(table.decoder, "|67=" + std::to_string(sequence)).result;
+    };
+    EXPECT_EQ(decode(table.endMark - 1), decode(1)) << table.decoder;
+    EXPECT_NE(decode(table.endMark), decode(1)) << table.decoder;
   }
 }
 
