@@ -120,5 +120,12 @@ TEST_F(StockOrderReplies, AcceptedOrderShowsNumberAndDate) {
   }
 }
 
+TEST_F(StockOrderReplies, AcceptedCancellationSaysNothingOfAnEarlierRefusal) {
+  CGatewayStk gateway;
+  int status = 77;
+  EXPECT_STREQ(gateway.CancelChangeOrderDecode("39=E|K1=closed|", &status), "closed");
+  EXPECT_STREQ(gateway.CancelChangeOrderDecode("39= |19=S|", &status), "");
+}
+
 }  // namespace
 }  // namespace gateway_tests
