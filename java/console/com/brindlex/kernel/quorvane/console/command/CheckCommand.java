@@ -54,7 +54,7 @@ final class CheckCommand implements Callable<Integer> {
             }
         }
         if (messages == 0) {
-            terminal.error("no message found; is the tag another one (--tag)?");
+            terminal.error(LogOptions.NOTHING);
             return 1;
         }
         terminal.note(messages + " messages, " + (faults == 0 ? "all sound" : faults + " faults"));

@@ -20,6 +20,10 @@ import picocli.CommandLine.Spec;
 
 /** Where a log comes from: what all commands that read one have in common. */
 final class LogOptions {
+    /** What is said of a log in which nothing was found. */
+    static final String NOTHING =
+            "no message found; is the tag or the charset another one (--tag, --charset)?";
+
     @Spec(Spec.Target.MIXEE)
     private CommandSpec spec;
 
@@ -58,6 +62,11 @@ final class LogOptions {
     /** Whether the argument is a message and no file. */
     boolean isMessage() {
         return !log.equals("-") && !isFile() && MessageReader.kind(log) != Kind.TEXT;
+    }
+
+    /** Whether the log is this very file. */
+    boolean isFile(Path file) throws IOException {
+        return isFile() && Files.exists(file) && Files.isSameFile(Path.of(log), file);
     }
 
     private boolean isFile() {

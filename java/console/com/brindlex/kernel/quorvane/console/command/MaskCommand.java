@@ -21,6 +21,7 @@ import picocli.CommandLine.Mixin;
 import picocli.CommandLine.Model.CommandSpec;
 import picocli.CommandLine.Option;
 import picocli.CommandLine.ParameterException;
+import picocli.CommandLine.ParentCommand;
 import picocli.CommandLine.Spec;
 
 /** Writes a log without its secrets. */
@@ -30,11 +31,15 @@ import picocli.CommandLine.Spec;
                 + "signatures and certificates, and what an applicant tells of himself unless they "
                 + "are kept.",
         footer = {"", "Nothing is written before the whole log was read once.", "",
+                "Exit codes: 0 done, 1 the log holds no message and is not written, 2 usage.", "",
                 "  quorvane mask log.txt > log-to-send.txt",
                 "  adb logcat -d | quorvane mask --keep account --output log-to-send.txt"})
 final class MaskCommand implements Callable<Integer> {
     @Spec
     private CommandSpec spec;
+
+    @ParentCommand
+    private Quorvane parent;
 
     @Mixin
     private LogOptions log;
@@ -53,6 +58,9 @@ final class MaskCommand implements Callable<Integer> {
             throw new ParameterException(spec.commandLine(), "passwords are always replaced");
         }
         if (!log.isStandardInput()) {
+            if (output != null && log.isFile(output)) {
+                throw new ParameterException(spec.commandLine(), output + " is the log itself");
+            }
             return mask(log::stream);
         }
         // a log is read twice: the standard input is kept where its owner alone can read it
@@ -80,10 +88,13 @@ final class MaskCommand implements Callable<Integer> {
             boolean marked = charset.equals(StandardCharsets.UTF_16LE)
                     || charset.equals(StandardCharsets.UTF_16BE);
             write(out, standard, charset, marked ? "\uFEFF" : "");
-            new MaskedLog(kept).mask(() -> log.open(bytes.open()),
-                    line -> write(out, standard, charset, line));
+            if (new MaskedLog(kept).mask(() -> log.open(bytes.open()),
+                    line -> write(out, standard, charset, line))) {
+                return 0;
+            }
         }
-        return 0;
+        parent.terminal().error(LogOptions.NOTHING + " Nothing is written.");
+        return 1;
     }
 
     private static void write(OutputStream out, Output standard, Charset charset, String text) {

@@ -140,7 +140,7 @@ final class TimelineCommand implements Callable<Integer> {
 
     private void summary(List<Row> unanswered) {
         if (shown == 0) {
-            terminal.error("no message found; is the tag another one (--tag)?");
+            terminal.error(LogOptions.NOTHING);
             return;
         }
         String waiting = unanswered.isEmpty() ? "" : "; no answer found for line "

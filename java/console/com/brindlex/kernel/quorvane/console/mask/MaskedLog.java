@@ -36,8 +36,14 @@ public final class MaskedLog {
         this.masker = new Masker(kept);
     }
 
-    /** Reads the log to its end, and writes it line by line, each with its end. */
-    public void mask(Source source, Consumer<String> out) throws IOException {
+    /**
+     * Reads the log to its end, and writes it line by line, each with its end. A log without any
+     * message is not written: whoever cannot read it cannot know what is secret in it.
+     *
+     * @return whether there was a message
+     */
+    public boolean mask(Source source, Consumer<String> out) throws IOException {
+        boolean speaks = false;
         try (LogReader log = source.open()) {
             boolean certificate = false;
             for (LogMessage each = log.next(line -> { }); each != null;
@@ -47,7 +53,11 @@ public final class MaskedLog {
                 }
                 certificate = each.text().startsWith(TAKES_CERTIFICATE);
                 masker.learn(each.text());
+                speaks |= each.kind() != Kind.TEXT;
             }
+        }
+        if (!speaks) {
+            return false;
         }
         try (LogReader log = source.open()) {
             Consumer<LogLine> others = line -> later(() ->
@@ -57,6 +67,7 @@ public final class MaskedLog {
             }
         }
         flush();
+        return true;
     }
 
     /** Writes at once, or behind the length line that waits for the message that it counts. */

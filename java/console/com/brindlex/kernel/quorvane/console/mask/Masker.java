@@ -13,6 +13,7 @@ import java.util.Set;
 public final class Masker {
     /** Ends each line of Base64. */
     private static final String LINE_END = "\r\n";
+    private static final int LINE = 1024;
 
     private final Pseudonyms pseudonyms = new Pseudonyms();
     private final Set<Secret> masked;
@@ -112,7 +113,11 @@ public final class Masker {
         for (int i = 0; i < fields.size(); i++) {
             Found found = fields.get(i);
             String value = text.substring(found.begin(), found.end());
+            boolean certificate = found.tag().equals("MSG");
             if (!masked.contains(found.kind())) {
+                if (certificate) {
+                    spans.add(new Span(found.begin(), found.end(), kept(value)));
+                }
                 continue;
             }
             if (found.tag().equals("17")) {
@@ -128,7 +133,7 @@ public final class Masker {
                 spans.add(new Span(found.begin(), found.end(),
                         name.substring(Math.min(name.length(), account.length()))));
                 account = "";
-            } else if (found.tag().equals("MSG")) {
+            } else if (certificate) {
                 spans.add(new Span(found.begin(), found.end(), message(value)));
             } else {
                 spans.add(new Span(found.begin(), found.end(), escaped(value,
@@ -151,7 +156,19 @@ public final class Masker {
     /** The Base64 of what stands for a certificate's text, in lines as the library writes them. */
     private String message(String value) {
         String name = pseudonyms.of(Secret.SIGNATURE, decoded(value).strip());
-        String base64 = Base64.getEncoder().encodeToString(name.getBytes(StandardCharsets.UTF_8));
-        return base64 + (value.endsWith("\n") || value.endsWith("\r") ? LINE_END : "");
+        return encoded(name, value);
+    }
+
+    /** A certificate's text that is kept, without the other secrets that stand in it. */
+    private String kept(String value) {
+        String text = decoded(value);
+        String without = mask(text);
+        return without.equals(text) ? value : encoded(without, value);
+    }
+
+    private static String encoded(String text, String before) {
+        String base64 = Base64.getMimeEncoder(LINE, LINE_END.getBytes(StandardCharsets.US_ASCII))
+                .encodeToString(text.getBytes(StandardCharsets.UTF_8));
+        return base64 + (before.endsWith("\n") || before.endsWith("\r") ? LINE_END : "");
     }
 }

@@ -136,7 +136,10 @@ final class Pseudonyms {
         put(value.replace(" ", "%20"), name.replace(" ", "%20"));
         if (kind == Secret.PASSWORD || kind == Secret.ID) {
             put(base64(value), base64(name));
-            put(URLEncoder.encode(value, StandardCharsets.UTF_8), name);
+            String escaped = URLEncoder.encode(value, StandardCharsets.UTF_8);
+            put(escaped, name);
+            put(escaped.replace("+", "%20"), name);
+            put(asApps(escaped), name);
             put(value.replace("\\", "\\\\").replace("\"", "\\\""), name);
         }
     }
@@ -144,6 +147,12 @@ final class Pseudonyms {
     private void put(String form, String name) {
         forms.putIfAbsent(form, name);
         alone.putIfAbsent(form, name);
+    }
+
+    /** What an app's URI leaves as it is, a form's encoding escapes. */
+    private static String asApps(String escaped) {
+        return escaped.replace("+", "%20").replace("%21", "!").replace("%27", "'")
+                .replace("%28", "(").replace("%29", ")").replace("%7E", "~");
     }
 
     private static String base64(String text) {

@@ -2,6 +2,7 @@ package com.brindlex.kernel.quorvane.console.mask;
 
 import com.brindlex.kernel.quorvane.console.message.Kind;
 import com.brindlex.kernel.quorvane.console.message.MessageReader;
+import com.brindlex.kernel.quorvane.console.message.Payload;
 import java.util.ArrayList;
 import java.util.List;
 import java.util.Map;
@@ -36,8 +37,8 @@ final class SecretFields {
         if (kind != Kind.REQUEST && kind != Kind.REPLY) {
             return found;
         }
-        int payload = text.indexOf("!!");
-        int limit = kind == Kind.REQUEST && payload >= 0 ? payload : text.length();
+        int payload = kind == Kind.REQUEST ? Payload.find(text) : -1;
+        int limit = payload < 0 ? text.length() : payload;
         boolean certificate = kind == Kind.REPLY && isCertificate(text);
         int begin = 0;
         while (begin < limit) {

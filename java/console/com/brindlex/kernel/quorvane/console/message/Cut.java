@@ -5,8 +5,8 @@ import java.util.List;
 
 /** Cuts a message at its bars. */
 final class Cut {
-    /** Stands before a signature payload, which has no tag of its own. */
-    static final String PAYLOAD = "!!";
+    /** The tag of a signature payload, which has none of its own. */
+    static final String PAYLOAD = Payload.MARK;
 
     private static final int LONGEST_TAG = 7;
 
@@ -42,7 +42,7 @@ final class Cut {
      */
     static List<Piece> request(String text) {
         List<Piece> pieces = new ArrayList<>(48);
-        int mark = text.indexOf(PAYLOAD);
+        int mark = Payload.find(text);
         int limit = mark < 0 ? text.length() : mark;
         int begin = 0;
         while (begin <= limit) {

@@ -146,7 +146,10 @@ final class OpenLog {
     /** The same log without its secrets but those of the kinds {@code kept}, in UTF-8. */
     byte[] masked(Set<Secret> kept) throws IOException {
         ByteArrayOutputStream out = new ByteArrayOutputStream();
-        new MaskedLog(kept).mask(() -> new LogReader(lines(), tag), line -> write(line, out));
+        MaskedLog masked = new MaskedLog(kept);
+        if (!masked.mask(() -> new LogReader(lines(), tag), line -> write(line, out))) {
+            throw new IllegalArgumentException("no message was found: nothing can be masked");
+        }
         return out.toByteArray();
     }
 

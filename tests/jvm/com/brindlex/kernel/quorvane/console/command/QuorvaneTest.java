@@ -9,17 +9,21 @@ import com.brindlex.kernel.quorvane.client.Operation;
 import com.brindlex.kernel.quorvane.console.message.DamagedMessagesTest;
 import java.io.ByteArrayInputStream;
 import java.io.ByteArrayOutputStream;
+import java.io.IOException;
 import java.io.InputStream;
 import java.io.PrintStream;
 import java.io.PrintWriter;
 import java.io.StringWriter;
 import java.nio.charset.StandardCharsets;
+import java.nio.file.Files;
+import java.nio.file.Path;
 import java.util.ArrayList;
 import java.util.LinkedHashMap;
 import java.util.List;
 import java.util.Map;
 import java.util.stream.Stream;
 import org.junit.jupiter.api.Test;
+import org.junit.jupiter.api.io.TempDir;
 import picocli.CommandLine;
 
 /** The commands as a user runs them: what they write, and their exit codes. */
@@ -350,6 +354,21 @@ class QuorvaneTest {
         assertEquals(0, run(masked.out, "check").code);
         assertTrue(run(LOG, "mask", "--keep", "id,account").out.contains("IDNO=A123456789"));
         assertEquals(2, run(LOG, "mask", "--keep", "password").code);
+        Run foreign = run("A123456789 and other lines\n", "mask");
+        assertEquals(1, foreign.code);
+        assertEquals("", foreign.out);
+        assertTrue(foreign.err.contains("--charset"), foreign.err);
+    }
+
+    @Test
+    void maskLeavesTheLogItselfAlone(@TempDir Path folder) throws IOException {
+        Path log = Files.writeString(folder.resolve("log.txt"), LOG);
+        Path same = Files.createSymbolicLink(folder.resolve("same.txt"), log);
+        assertEquals(2, run("", "mask", log.toString(), "-o", same.toString()).code);
+        assertEquals(LOG, Files.readString(log));
+        Path masked = folder.resolve("masked.txt");
+        assertEquals(0, run("", "mask", log.toString(), "-o", masked.toString()).code);
+        assertFalse(Files.readString(masked).contains("pass1234"));
     }
 
     @Test

@@ -169,6 +169,53 @@ class MaskedLogTest {
         assertTrue(masked.contains("PWD=password2|FUNC=0"), masked);
     }
 
+    /** The mark of a signature payload may stand in a password, too. */
+    @Test
+    void aPasswordWithThePayloadsMarkGoes() throws IOException {
+        for (String password : List.of("hi!!there", "!!x9z", "x9z!!", "a!!!b9")) {
+            String order = "F=1|KIND=S|BHNO=9A00|CB=1|PWD=" + password
+                    + "|32=B|33=!!9A00_1234567_A123456789_I";
+            String change = LOGIN.replace("open sesame|FUNC=0", password + "|FUNC=1|54=" + password
+                    + "|55=N" + password);
+            String log = HEAD + change + "\n" + HEAD + order + "\n" + password + "\n";
+            String masked = mask(log);
+            assertFalse(masked.contains(password.replace("!", "")), masked);
+            assertFalse(masked.contains(password), masked);
+            assertTrue(masked.contains("PWD=password1|FUNC=1|54=password1|55=password2|"), masked);
+            assertTrue(masked.contains("PWD=password1|32=B|33=!!9A00_0000001_A000000001_I"), masked);
+            assertTrue(masked.endsWith("\npassword1\n"), masked);
+        }
+    }
+
+    /** Passwords always go, also from the text of a certificate that is kept. */
+    @Test
+    void aKeptCertificateHoldsNoOtherSecret() throws IOException {
+        String text = "CSR " + "x".repeat(800) + " of A123456789 with open sesame";
+        String request = LOGIN.replace("FUNC=0", "FUNC=13|MSG=" + Base64.getMimeEncoder(1024,
+                new byte[] {'\r', '\n'}).encodeToString(text.getBytes(StandardCharsets.UTF_8))
+                + "|BIRTH=19800229");
+        String masked = mask(HEAD + request.replace("\n", "\n" + HEAD) + "\n", Secret.SIGNATURE);
+        String kept = RecordedLog.read(masked).get(0).text();
+        String message = kept.substring(kept.indexOf("MSG=") + 4, kept.indexOf("|BIRTH"));
+        assertEquals(text.replace("A123456789", "A000000001").replace("open sesame", "password1"),
+                new String(Base64.getMimeDecoder().decode(message), StandardCharsets.UTF_8));
+    }
+
+    @Test
+    void aPasswordGoesHoweverALinkWritesIt() throws IOException {
+        String login = HEAD + LOGIN.replace("open sesame", "o'pen (se)~sam!") + "\n";
+        for (String written : List.of("o%27pen+%28se%29%7Esam%21", "o%27pen%20%28se%29%7Esam%21",
+                "o'pen%20(se)~sam!")) {
+            assertTrue(mask(login + "https://x/?p=" + written + "\n")
+                    .endsWith("https://x/?p=password1\n"), written);
+        }
+    }
+
+    @Test
+    void aLogThatNobodyUnderstandsIsNotWritten() throws IOException {
+        assertEquals("", mask("A123456789\nsome lines\n"));
+    }
+
     @Test
     void aShortPasswordIsReplacedInItsPlacesAlone() throws IOException {
         String masked = mask("7\n" + HEAD + LOGIN.replace("open sesame", "7") + "\n");

@@ -124,6 +124,15 @@ public class DamagedMessagesTest {
         }
     }
 
+    /** The mark of a signature payload may stand in a password, too. */
+    @Test
+    void aPasswordMayHoldTheMarkOfThePayload() {
+        for (String sound : List.of(ORDER, TAGGED, FUTURES, LOGIN)) {
+            String typed = sound.replace("PWD=pw", "PWD=p!!w");
+            assertEquals(List.of(), read(typed).faults(), typed);
+        }
+    }
+
     @Test
     void everyDamageIsNamedAndNothingElse() {
         Set<String> kinds = new HashSet<>();
