@@ -14,6 +14,7 @@ public final class EntryReader implements Closeable {
     private LastHeader before;
     private LogHeader above;
     private boolean isFirstBelow;
+    private int padding;
 
     /** Reads the lines of {@code lines}. */
     public EntryReader(LineReader lines) {
@@ -59,6 +60,8 @@ public final class EntryReader implements Closeable {
             return LogEntry.without(line);
         }
         above = null;
+        // the blanks behind a header may be lost where no text follows
+        padding = !header.format().isPadded() ? 0 : begin < end ? begin : Integer.MAX_VALUE;
         int textEnd = header.format() == LogFormat.PROCESS
                 ? line.text().lastIndexOf("  (" + header.tag()) : end;
         return new LogEntry(line, header, Math.min(begin, textEnd), textEnd);
@@ -68,10 +71,8 @@ public final class EntryReader implements Closeable {
     private LogEntry below(LogLine line, int begin, int end) {
         if (above == null) {
             int from = begin;
-            if (last == LogFormat.STUDIO) {
-                while (from < end && line.text().charAt(from) == ' ') {
-                    from++;
-                }
+            while (from < end && from < padding && line.text().charAt(from) == ' ') {
+                from++;
             }
             return new LogEntry(line, null, from, end);
         }

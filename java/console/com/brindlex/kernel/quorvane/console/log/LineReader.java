@@ -26,7 +26,7 @@ public final class LineReader implements Closeable {
     private int at;
     private int filled;
     private long number;
-    private boolean carriageReturns;
+    private int carriageReturns;
 
     /**
      * Reads from {@code stream}.
@@ -121,16 +121,20 @@ public final class LineReader implements Closeable {
         return filled > 0;
     }
 
-    /** The first line tells whether the log ends its lines with carriage returns. */
+    /** The first line tells how many carriage returns the log ends its lines with. */
     private LogLine ended(String text, String end, boolean cut) {
         number++;
-        boolean feed = text.endsWith("\r");
-        if (number == 1) {
-            carriageReturns = feed;
+        int returns = 0;
+        while (returns < text.length() && text.charAt(text.length() - 1 - returns) == '\r') {
+            returns++;
         }
-        boolean drop = carriageReturns && feed;
-        return new LogLine(number, drop ? text.substring(0, text.length() - 1) : text,
-                drop ? "\r" + end : end, cut);
+        if (number == 1) {
+            carriageReturns = returns;
+        }
+        int drop = Math.min(carriageReturns, returns);
+        return drop == 0 ? new LogLine(number, text, end, cut)
+                : new LogLine(number, text.substring(0, text.length() - drop),
+                        "\r".repeat(drop) + end, cut);
     }
 
     @Override

@@ -19,7 +19,7 @@ public enum LogFormat {
     BRIEF("[VDIWEFAS]/(?<tag>[^(:]*?) *\\( *" + Part.USER + "(?<process>\\d+)\\): ?"),
     /** {@code D( 1234) text  (gatewayjni)}. */
     PROCESS("[VDIWEFAS]\\( *" + Part.USER + "(?<process>\\d+)\\) "
-            + "(?=.*  \\((?<tag>[^()]*)\\)\\s*$)"),
+            + "(?=(?s:.*)  \\((?<tag>[^()]*)\\)\\s*$)"),
     /** {@code D( 1234: 5678) text}. */
     THREAD("[VDIWEFAS]\\( *" + Part.USER + "(?<process>\\d+): *(?<thread>\\d+)\\) ?"),
     /** {@code D/gatewayjni: text}. */
@@ -55,6 +55,11 @@ public enum LogFormat {
     /** Whether the text stands on the lines below. */
     boolean isAbove() {
         return this == LONG;
+    }
+
+    /** Whether the further lines of a text stand below its begin, behind blanks. */
+    boolean isPadded() {
+        return this == STUDIO || this == COMPACT;
     }
 
     /** Finds the format at the begin of a line; null when the line has another. */

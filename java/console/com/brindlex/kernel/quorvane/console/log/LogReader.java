@@ -90,8 +90,11 @@ public final class LogReader implements Closeable {
         if (found == null) {
             return own || tagless ? new Joining(entry, text, kind, expected) : null;
         }
-        LogEntry message = new LogEntry(entry.line(), header, entry.begin() + found[0],
-                entry.begin() + found[1]);
+        boolean timed = header != null && !header.time().isEmpty();
+        String time = timed ? "" : Unwrap.time(text.substring(0, found[0]));
+        LogEntry message = new LogEntry(entry.line(),
+                time.isEmpty() ? header : LogHeader.withTime(header, time),
+                entry.begin() + found[0], entry.begin() + found[1]);
         String inside = message.text();
         return new Joining(message, inside, MessageReader.kind(inside), expected);
     }

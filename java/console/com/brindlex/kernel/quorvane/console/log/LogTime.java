@@ -13,6 +13,9 @@ public final class LogTime {
     private static final int CLOCK_LENGTH = "13:45:21".length();
     private static final int DATE_LENGTH = "01-15 ".length();
     private static final int LEAP_YEAR = 2000;
+    private static final long NO_YEAR =
+            LocalDate.of(LEAP_YEAR, 1, 1).toEpochDay() * MILLIS_OF_DAY;
+    private static final long YEAR = 366 * MILLIS_OF_DAY;
 
     private LogTime() {}
 
@@ -40,6 +43,28 @@ public final class LogTime {
         } catch (DateTimeException | NumberFormatException | IndexOutOfBoundsException never) {
             return NONE;
         }
+    }
+
+    /**
+     * The milliseconds from one time of a log to a later one; null where they are not known, or
+     * where a clock was set back. A day or a year that the log does not write may have begun between.
+     */
+    public static Long between(long from, long to) {
+        if (from == NONE || to == NONE) {
+            return null;
+        }
+        long took = to - from;
+        boolean hours = from < MILLIS_OF_DAY && to < MILLIS_OF_DAY;
+        long round = hours ? MILLIS_OF_DAY : YEAR;
+        boolean again = hours || isOfNoYear(from) && isOfNoYear(to);
+        if (again && took < -round / 2) {
+            took += round;
+        }
+        return took < 0 ? null : took;
+    }
+
+    private static boolean isOfNoYear(long millis) {
+        return millis >= NO_YEAR && millis < NO_YEAR + YEAR;
     }
 
     /** The day that the month and the day of month at a place make, if there are any. */

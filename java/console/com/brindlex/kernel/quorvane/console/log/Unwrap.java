@@ -16,6 +16,13 @@ final class Unwrap {
         "F=1|", "F=7|", "|00=", "|68=", "|39=", "|F=", "[GATEWAY]error", "[BROKER]timeout"};
     private static final String[] QUOTES = {"\"", "'"};
 
+    /** What may stand right before a message, and what then ends it. */
+    private static final String OPENING = "\"'`([{<“‘「『";
+    private static final String CLOSING = "\"'`)]}>”’」』";
+
+    private static final Pattern TIME = Pattern.compile("(?<![0-9])((?:[0-9]{4}[-/])?[0-9]{2}[-/]"
+            + "[0-9]{2}[T ])?([0-9]{2}:[0-9]{2}:[0-9]{2}(?:[.,][0-9]{3,9})?)(?![0-9])");
+
     private Unwrap() {}
 
     /**
@@ -34,15 +41,36 @@ final class Unwrap {
             return null;
         }
         int from = begin.start();
-        int to = text.length();
-        char quote = from > 0 ? text.charAt(from - 1) : ' ';
-        if (quote == '"' || quote == '\'' || quote == '`') {
-            int close = text.lastIndexOf(quote);
-            to = close > from ? close : to;
-            boolean feed = text.startsWith("\\n", to - 2);
-            to -= feed ? 2 : 0;
+        int opened = from > 0 ? OPENING.indexOf(text.charAt(from - 1)) : -1;
+        return new int[] {from, opened < 0 ? text.length() : end(text, from, opened)};
+    }
+
+    /** Where what was opened before a message is closed, behind its last field or record. */
+    private static int end(String text, int from, int opened) {
+        char open = OPENING.charAt(opened);
+        char close = CLOSING.charAt(opened);
+        int last = Math.max(from, text.lastIndexOf('|') > from ? text.lastIndexOf('|')
+                                                               : text.lastIndexOf('!'));
+        int depth = 0;
+        for (int at = last; at < text.length(); at++) {
+            char c = text.charAt(at);
+            if (c == close && depth == 0) {
+                return text.startsWith("\\n", at - 2) ? at - 2 : at;
+            }
+            depth += c == close ? -1 : c == open ? 1 : 0;
         }
-        return new int[] {from, to};
+        return text.length();
+    }
+
+    /** The time that an app wrote before its message, as logs write it; empty when it did not. */
+    static String time(String before) {
+        Matcher found = TIME.matcher(before);
+        if (!found.find()) {
+            return "";
+        }
+        String day = found.group(1) == null ? ""
+                                            : found.group(1).replace('/', '-').replace('T', ' ');
+        return day + found.group(2).replace(',', '.');
     }
 
     private static Matcher find(Pattern pattern, String text, String[] needed) {

@@ -78,7 +78,9 @@ public final class Timeline {
     }
 
     private static String thread(LogHeader header) {
-        return header == null ? "" : header.process() + ":" + header.thread();
+        boolean named = header != null
+                && (!header.process().isEmpty() || !header.thread().isEmpty());
+        return named ? header.process() + ":" + header.thread() : "";
     }
 
     private Event request(LogMessage source, Call call) {
@@ -270,9 +272,7 @@ public final class Timeline {
             String status) {
         boolean asks = status.equals("sent") || message.kind() == Kind.MESSAGE && request == null;
         Row asked = request == null ? null : request.row();
-        long now = millis(source);
-        Long took = request == null || now == LogTime.NONE || request.millis() == LogTime.NONE
-                ? null : now - request.millis();
+        Long took = request == null ? null : LogTime.between(request.millis(), millis(source));
         String operation = message.operation() != null ? message.operation()
                 : asked == null || request.decoders().isEmpty() ? "" : request.decoders().get(0);
         Operation known = Dictionary.get().operation(operation);

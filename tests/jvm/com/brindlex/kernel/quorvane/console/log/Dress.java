@@ -43,7 +43,7 @@ public enum Dress {
     STUDIO("{yyyy-MM-dd HH:mm:ss.SSS}  1234-5678  gatewayjni              "
             + "com.example.app                      D  ", "", true),
     STUDIO_OLD("{yyyy-MM-dd HH:mm:ss.SSS} 1234-5678/com.example.app D/gatewayjni: ", "", true),
-    STUDIO_COMPACT("{HH:mm:ss.SSS}  D  ", "", false);
+    STUDIO_COMPACT("{HH:mm:ss.SSS}  D  ", "", true);
 
     private static final LocalDateTime BEGIN = LocalDateTime.of(2024, 1, 15, 13, 45, 21);
     private static final int STEP = 7;
@@ -57,6 +57,11 @@ public enum Dress {
         this.head = head;
         this.foot = foot;
         this.whole = whole;
+    }
+
+    /** Android Studio writes further lines below the text of the first one. */
+    private boolean isPadded() {
+        return this == STUDIO || this == STUDIO_COMPACT;
     }
 
     /** Whether it writes when a message was logged. */
@@ -74,7 +79,7 @@ public enum Dress {
             boolean feed = this != HOST && text.endsWith("\n");
             text = feed ? text.substring(0, text.length() - 1) : text;
             text = name().startsWith("PRINTABLE") ? printable(text) : text;
-            String more = whole ? this == STUDIO ? " ".repeat(head.length()) : "" : foot + head;
+            String more = whole ? isPadded() ? " ".repeat(head.length()) : "" : foot + head;
             String gap = whole ? "\n" + more : foot + "\n" + head;
             out.append(head).append(text.replace("\n", gap)).append(foot).append('\n');
         }

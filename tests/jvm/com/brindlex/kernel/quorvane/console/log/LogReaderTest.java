@@ -68,6 +68,21 @@ class LogReaderTest {
     }
 
     @Test
+    void messagesOfSeveralLinesAreJoinedInEveryFormat() throws IOException {
+        String base64 = Base64.getMimeEncoder(1024, new byte[] {'\r', '\n'})
+                .encodeToString(new byte[2500]) + "\r\n";
+        String notice = "F=7|68=0000|M3=one\n  two\n three|00=1|67=1|68=0000|01=";
+        List<String> messages = List.of(REGISTER + base64 + "|01=", "~CGatewayPub",
+                "AuthDecode: Len:" + bytes(notice), notice, "~CGatewayPub");
+        for (Dress dress : Dress.values()) {
+            for (String end : new String[] {"\n", "\r\n", "\r\r\n"}) {  // as Windows writes it
+                assertEquals(messages, texts(dress.log(messages).replace("\n", end)),
+                        () -> dress + " " + end.length());
+            }
+        }
+    }
+
+    @Test
     void aReplyOfSeveralLinesIsJoinedByItsLength() throws IOException {
         String reply = "F=7|68=0000|M3=one\ntwo\n\nfour|00=1|67=1|68=0000|01=";
         String log = HEAD + "AuthDecode: Len:" + bytes(reply) + "\n" + HEAD
@@ -141,10 +156,14 @@ class LogReaderTest {
     void aMessageIsFoundBehindAnyPrefix() throws IOException {
         for (String around : new String[] {
                 "13:45:21 INFO [main] GatewayClient - send: %s", ">> %s", "request=\"%s\"",
-                "{\"time\":1,\"sent\":\"%s\\n\"}", "'%s'", "I/MyApp( 77): out %s",
+                "{\"time\":1,\"sent\":\"%s\\n\"}", "'%s'", "{\"sent\":\"%s\",\"id\":\"a\"}",
+                "send(%s) [main] (1)", "<%s> 12 bytes", "[%s] {x}", "{%s}", "“%s”", "「%s」。",
+                "I/MyApp( 77): out %s",
                 "01-15 13:45:21.123  1234  5678 I okhttp.OkHttpClient: %s", "[net] %s"}) {
             assertEquals(List.of(LOGIN), texts(around.replace("%s", LOGIN) + "\n"), around);
         }
+        String refused = "F=1|39=E|19=|K1=餘額不足(E1) \"x\"";
+        assertEquals(List.of(refused), texts("recv(" + refused + ") in 3 ms (ok)\n"));
         assertEquals(List.of("|00=1|68=0000|M2=x|01="),
                 texts("recv -> |00=1|68=0000|M2=x|01=\n"));
         assertEquals(List.of(), texts("01-15 13:45:21.123  1234  5678 I App: started [12!x@y]\n"));

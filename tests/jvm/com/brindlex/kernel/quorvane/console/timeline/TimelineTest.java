@@ -2,6 +2,7 @@ package com.brindlex.kernel.quorvane.console.timeline;
 
 import static org.junit.jupiter.api.Assertions.assertEquals;
 import static org.junit.jupiter.api.Assertions.assertFalse;
+import static org.junit.jupiter.api.Assertions.assertNull;
 import static org.junit.jupiter.api.Assertions.assertTrue;
 
 import com.brindlex.kernel.quorvane.console.log.LineReader;
@@ -173,6 +174,37 @@ class TimelineTest {
                     + at(count % 50_000, count, "~CGatewayPub");
             return new ByteArrayInputStream(text.getBytes(StandardCharsets.UTF_8));
         }
+    }
+
+    /** An app's own log tells the time before its messages. */
+    @Test
+    void theTimeStandsInAnAppsOwnPrefix() throws IOException {
+        for (String stamp : List.of("2026-01-15 13:45:21.%s", "[2026-01-15T13:45:21.%sZ] INFO",
+                "13:45:21,%s [main]", "I/flutter ( 1234): 13:45:21.%s")) {
+            List<Row> rows = rows(stamp.replace("%s", "100") + " send " + login("13452101") + "\n",
+                    stamp.replace("%s", "350") + " recv F=7|65=0013452101|68=E1|M2=no|\n");
+            assertTrue(rows.get(0).time().endsWith("13:45:21.100"), () -> rows.get(0).time());
+            assertEquals(250, rows.get(1).millis(), stamp);
+        }
+        List<Row> seconds = rows("2026/01/15 13:45:21 send " + login("13452101") + "\n",
+                "2026/01/15 13:45:22 recv F=7|65=0013452101|68=E1|M2=no|\n");
+        assertEquals("2026-01-15 13:45:21", seconds.get(0).time());
+        assertNull(seconds.get(1).millis());
+    }
+
+    @Test
+    void anAnswerOfTheNextDayOrYearTookNoLongTime() throws IOException {
+        String reply = "F=7|65=0013452101|68=E1|M2=no|\n";
+        for (String head : List.of("12-31 23:59:59.900|01-01 00:00:00.100|  1  2 D gatewayjni: ",
+                "2025-12-31 23:59:59.900|2026-01-01 00:00:00.100|  1  2 D gatewayjni: ",
+                "23:59:59.900|00:00:00.100|  D  ")) {
+            String[] part = head.split("\\|");
+            List<Row> rows = rows(part[0] + part[2] + login("13452101") + "\n",
+                    part[1] + part[2] + reply);
+            assertEquals(200, rows.get(1).millis(), head);
+        }
+        List<Row> backwards = rows(at(500, 1, login("13452101")), at(300, 1, reply));
+        assertNull(backwards.get(1).millis());
     }
 
     @Test
