@@ -90,7 +90,13 @@ public final class WrittenRequest {
 
     /** What an argument is for, without how the natives write it: here amounts are written. */
     public static String purpose(Argument argument) {
-        return argument.purpose().replaceFirst(" \\(`[0-9]+` is [0-9.]+\\)", "");
+        return argument.purpose().replaceFirst(" \\(`[0-9]+` is [0-9.]+\\)", "")
+                .replaceFirst(" \\((?:hundredths|ten-thousandths)\\)$", "");
+    }
+
+    /** The codes that an argument takes, with their names; empty where others may be good, too. */
+    public static String choices(Operation operation, Argument argument) {
+        return WrittenValue.choices(operation, argument.name());
     }
 
     /**

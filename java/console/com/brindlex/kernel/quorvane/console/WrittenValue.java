@@ -27,6 +27,9 @@ final class WrittenValue {
             Map.of("hundredths", 2, "ten-thousandths", 4);
     private static final int WESTERN = 8;
 
+    /** The natives take prices and counts as 32 bits. */
+    private static final BigDecimal MOST = BigDecimal.valueOf(Integer.MAX_VALUE);
+
     private final Operation operation;
     private final Argument argument;
     private final UnaryOperator<String> texts;
@@ -66,7 +69,7 @@ final class WrittenValue {
 
     /** A row by its code, its name or its label; a number may be one that the table leaves out. */
     private String code(CodeTable table) {
-        List<CodeTable.Code> rows = table.values().stream().filter(this::isOffered).toList();
+        List<CodeTable.Code> rows = offered(operation, table);
         String word = text.strip();
         for (CodeTable.Code each : rows) {
             if (each.code().equalsIgnoreCase(word) || word.equalsIgnoreCase(each.label())
@@ -80,11 +83,27 @@ final class WrittenValue {
         if (open) {
             return text;
         }
-        throw refused("must be " + rows.stream().map(each -> each.name() == null ? each.code()
-                : each.code() + " (" + each.name() + ")").collect(Collectors.joining(", ")));
+        throw refused("must be " + named(rows));
     }
 
-    private boolean isOffered(CodeTable.Code row) {
+    private static String named(List<CodeTable.Code> rows) {
+        return rows.stream().map(each -> each.name() == null ? each.code()
+                : each.code() + " (" + each.name() + ")").collect(Collectors.joining(", "));
+    }
+
+    /** The codes that an argument takes, with their names; empty where others may be good, too. */
+    static String choices(Operation operation, String name) {
+        Argument known = Dictionary.get().operation(operation.method()).argument(name);
+        CodeTable table = known == null || known.unread() || known.codes() == null
+                ? null : Dictionary.get().codes(known.codes());
+        return table == null || !table.isClosed() ? "" : named(offered(operation, table));
+    }
+
+    private static List<CodeTable.Code> offered(Operation operation, CodeTable table) {
+        return table.values().stream().filter(each -> isOffered(operation, each)).toList();
+    }
+
+    private static boolean isOffered(Operation operation, CodeTable.Code row) {
         boolean fits = row.only() == null
                 || List.of(row.only().split(" ")).contains(operation.method());
         return fits && !row.listsOnly() && !row.code().contains(" ");
@@ -104,6 +123,12 @@ final class WrittenValue {
         if (shifted.stripTrailingZeros().scale() > 0) {
             throw refused(amount.group(2) == null ? "must have at most " + decimals + " decimals"
                                                   : "must be whole " + argument.unit());
+        }
+        if (shifted.signum() < 0) {
+            throw refused("must not be negative");
+        }
+        if (shifted.compareTo(MOST) > 0) {
+            throw refused("must be at most " + MOST.movePointLeft(decimals).toPlainString());
         }
         return shifted.toBigInteger().toString();
     }
@@ -148,7 +173,11 @@ final class WrittenValue {
                 && !unit.equals(count.group(2) + "s")) {
             throw refused("is counted in " + unit + " here");
         }
-        return count.group(1).replace(",", "");
+        String digits = count.group(1).replace(",", "");
+        if (new BigDecimal(digits).compareTo(MOST) > 0) {
+            throw refused("must be at most " + MOST);
+        }
+        return digits;
     }
 
     /** {@code lots; shares for trade type 2} depends on another argument. */

@@ -16,6 +16,14 @@ import picocli.CommandLine;
 
 /** Builds one request; there is one such command for each encoder. */
 final class EncodeCommand implements Callable<Integer> {
+    private static final String[] VALUES = {
+        "", "Values are written as people write them: --side BUY, --price 600 or 600.5, "
+            + "--date 2026-11-21, --quantity '2 lots'. A price as the library takes it is written "
+            + "with its unit: --price '60050 hundredths', for futures '180005000 "
+            + "ten-thousandths'.",
+        "Passwords that are not given are asked for, without showing them; where there is no "
+            + "terminal, and for '-', each is a line of the standard input."};
+
     private final CommandLine root;
     private final Operation operation;
     private CommandSpec spec;
@@ -30,12 +38,7 @@ final class EncodeCommand implements Callable<Integer> {
         CommandSpec all = CommandSpec.create().name("encode");
         all.mixinStandardHelpOptions(true);
         all.usageMessage().description("Builds a request and writes it.");
-        all.usageMessage().footer("", "Values are written as people write them: --side BUY, "
-                + "--price 600 or 600.5, --date 2026-11-21, --quantity '2 lots'. A price as the "
-                + "library takes it is written with its unit: --price '60050 hundredths', for "
-                + "futures '180005000 ten-thousandths'.",
-                "Passwords that are not given are asked for, without showing them; where there is "
-                + "no terminal, and for '-', each is a line of the standard input.");
+        all.usageMessage().footer(VALUES);
         all.usageMessage().customSynopsis(
                 "quorvane encode OPERATION [--json] [OPTION VALUE]...",
                 "       quorvane encode OPERATION --help");
@@ -44,6 +47,7 @@ final class EncodeCommand implements Callable<Integer> {
             if (operation.isEncoder()) {
                 EncodeCommand command = new EncodeCommand(root, operation);
                 command.spec = Options.command(operation, Map.of(), command);
+                command.spec.usageMessage().footer(VALUES);
                 encode.addSubcommand(operation.method(), command.spec);
             }
         }

@@ -33,6 +33,7 @@ final class LogOptions {
     private String log;
 
     @Option(names = "--charset", paramLabel = "NAME", defaultValue = "UTF-8",
+            converter = CharsetName.class,
             description = "Charset of a log without a byte order mark: UTF-8 (the usual one), "
                     + "Big5, UTF-16LE ...")
     private Charset charset;
@@ -71,7 +72,7 @@ final class LogOptions {
 
     private boolean isFile() {
         try {
-            return Files.exists(Path.of(log));
+            return !log.isEmpty() && Files.exists(Path.of(log));
         } catch (InvalidPathException message) {
             return false;
         }
@@ -102,7 +103,8 @@ final class LogOptions {
             return new ByteArrayInputStream(log.getBytes(StandardCharsets.UTF_8));
         }
         if (!isFile()) {
-            throw new ParameterException(spec.commandLine(), "no file " + log);
+            throw new ParameterException(
+                    spec.commandLine(), "neither a file nor a message: '" + log + "'");
         }
         if (Files.isDirectory(Path.of(log))) {
             throw new ParameterException(spec.commandLine(), log + " is a folder");

@@ -27,12 +27,23 @@ final class Options {
             OptionSpec.Builder option =
                     OptionSpec.builder("--" + dashed(argument.name()))
                             .type(String.class)
-                            .paramLabel(argument.type().name().replaceFirst(".*_", ""))
+                            .paramLabel(label(argument))
                             .required(given == null && !isPassword(argument))
-                            .description(WrittenRequest.purpose(argument) + usually(given));
+                            .description(WrittenRequest.purpose(argument)
+                                    + choices(operation, argument) + usually(given));
             spec.addOption(given == null ? option.build() : option.defaultValue(given).build());
         }
         return spec;
+    }
+
+    private static String label(Argument argument) {
+        boolean amount = !WrittenRequest.purpose(argument).equals(argument.purpose());
+        return amount ? "AMOUNT" : argument.type().name().replaceFirst(".*_", "");
+    }
+
+    private static String choices(Operation operation, Argument argument) {
+        String choices = WrittenRequest.choices(operation, argument);
+        return choices.isEmpty() ? "" : ": " + choices;
     }
 
     private static String usually(String given) {

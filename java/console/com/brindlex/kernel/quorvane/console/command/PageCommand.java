@@ -45,6 +45,7 @@ final class PageCommand implements Callable<Integer> {
     private boolean noOpen;
 
     @Option(names = "--charset", paramLabel = "NAME", defaultValue = "UTF-8",
+            converter = CharsetName.class,
             description = "Charset of files without a byte order mark; usually UTF-8.")
     private Charset charset;
 

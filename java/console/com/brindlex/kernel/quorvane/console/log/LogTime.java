@@ -47,7 +47,8 @@ public final class LogTime {
 
     /**
      * The milliseconds from one time of a log to a later one; null where they are not known, or
-     * where a clock was set back. A day or a year that the log does not write may have begun between.
+     * where a clock was set back. A new day or year may have begun between them, where the log does
+     * not write it.
      */
     public static Long between(long from, long to) {
         if (from == NONE || to == NONE) {

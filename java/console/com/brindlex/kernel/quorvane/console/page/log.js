@@ -63,8 +63,8 @@ async function read(id, charset, name) {
 
 function take(row) {
   const number = rows.length;
-  row.search = [row.time, row.account, row.instrument, row.operation, row.title, row.words,
-    row.status, row.requestId].join(' ').toLowerCase();
+  row.search = [row.time, row.account, row.idNumber, row.instrument, row.operation, row.title,
+    row.words, row.status, row.requestId].join(' ').toLowerCase();
   row.bad = row.faults.length > 0 || row.status === 'refused' || row.status === 'failed';
   asked[row.line] = number;
   if (row.requestLine) {

@@ -11,7 +11,8 @@ import java.util.List;
  * @param isRequest whether the app sent it; else it answers
  * @param operation the native method that built it or that reads it; empty when nobody knows
  * @param title the operation in words; empty when nobody knows
- * @param account the account that it is for; empty when it names none
+ * @param account the account that it is for, else the ID number; empty when it names none
+ * @param idNumber the ID number of the request; empty when it names none
  * @param instrument the stock or the commodity; empty when it names none
  * @param words what it says
  * @param status sent, done, refused, failed, pending or answered
@@ -21,8 +22,8 @@ import java.util.List;
  * @param faults what is wrong with the message
  */
 public record Row(long line, String time, boolean isRequest, String operation, String title,
-        String account, String instrument, String words, String status, String requestId,
-        long requestLine, Long millis, List<Fault> faults) {
+        String account, String idNumber, String instrument, String words, String status,
+        String requestId, long requestLine, Long millis, List<Fault> faults) {
     /** Whether a person should look at it. */
     public boolean isFailure() {
         return !faults.isEmpty() || status.equals("refused") || status.equals("failed");

@@ -13,7 +13,7 @@ import java.util.Locale;
 public record RowFilter(String account, String instrument, String operation, boolean failures) {
     /** Whether a row is wanted. */
     public boolean takes(Row row) {
-        return (account == null || row.account().equals(account))
+        return (account == null || row.account().equals(account) || row.idNumber().equals(account))
                 && (instrument == null || row.instrument().equalsIgnoreCase(instrument))
                 && (operation == null || holds(row.operation()) || holds(row.title()))
                 && (!failures || row.isFailure());

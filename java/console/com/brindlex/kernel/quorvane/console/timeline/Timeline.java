@@ -279,6 +279,7 @@ public final class Timeline {
         Row row = new Row(source.line(), time(source, message, asks), asks, operation,
                 known == null ? "" : known.title(),
                 asked == null ? account(message) : asked.account(),
+                asked == null ? message.fact("idNumber") : asked.idNumber(),
                 asked == null ? message.fact("instrument") : asked.instrument(),
                 message.words(), status,
                 asked == null ? message.fact("requestId") : asked.requestId(),

@@ -166,6 +166,10 @@ class QuorvaneTest {
             {"--order-date", "1151341", "orderDate must be a day such as 2026-11-21"},
             {"--quantity", "500 shares", "quantity is counted in lots here, not '500 shares'"},
             {"--quantity", "many", "quantity must be a whole number, not 'many'"},
+            {"--quantity", "99999999999", "quantity must be at most 2147483647, not '99999999999'"},
+            {"--price", "-5", "price must not be negative, not '-5'"},
+            {"--price", "21474836.48", "price must be at most 21474836.47, not '21474836.48'"},
+            {"--price", "2147483648 hundredths", "price must be at most 21474836.47, not "},
             {"--price-kind", "MARKET", "priceKind must be 0 (LIMIT), 1 (LIMIT_DOWN)"},
         };
         for (String[] each : wrong) {
@@ -173,6 +177,18 @@ class QuorvaneTest {
             assertEquals(2, refused.code, each[2]);
             assertTrue(refused.err.contains(each[2]), refused.err);
         }
+    }
+
+    /** A price is an amount, and the help of each request says so. */
+    @Test
+    void theHelpOfARequestSaysHowValuesAreWritten() {
+        String help = run("", "encode", "SubmitOrderEncode", "--help").out.replaceAll("\\s+", " ");
+        assertTrue(help.contains("--price=AMOUNT limit price"), help);
+        assertFalse(help.contains("(hundredths)"), help);
+        assertTrue(help.contains("B (BUY), S (SELL)"), help);
+        assertTrue(help.contains("--price 600 or 600.5"), help);
+        String futures = run("", "encode", "FutSubmitOrderEncode", "--help").out;
+        assertFalse(futures.contains("(ten-thousandths)"), futures);
     }
 
     @Test
@@ -222,7 +238,8 @@ class QuorvaneTest {
             {}, {"nothing"}, {"encode"}, {"encode", "NoEncode"}, {"encode", "AuthEncode"},
             {"decode"}, {"decode", "NoDecode"}, {"decode", "AuthEncode"},
             {"decode", "AuthDecode", "/no/such/file"}, {"explain", "--operation", "None"},
-            {"operations", "None"}, {"simulate", "--brokerage", "NONE"},
+            {"operations", "None"}, {"simulate", "--brokerage", "NONE"}, {"explain", ""},
+            {"timeline", "--charset", "Klingon"}, {"page", "--charset", "Klingon"},
             words("encode", "AuthEncode", DEVICE, USER, new String[] {"--market", "one"}),
             words("encode", "AuthEncode", DEVICE, USER, new String[] {"--colour", "red"}),
         };

@@ -214,6 +214,7 @@ class TimelineTest {
         assertEquals(2, count(rows, new RowFilter(null, "2330", null, false)));
         assertEquals(1, count(rows, new RowFilter(null, null, "login", false)));
         assertEquals(3, count(rows, new RowFilter("1234567", null, null, false)));
+        assertEquals(3, count(rows, new RowFilter("A123456789", null, null, false)));
         assertEquals(0, count(rows, new RowFilter("7654321", null, null, false)));
         assertEquals(1, count(rows, new RowFilter(null, null, null, true)));
         assertEquals(2, count(rows, new RowFilter(null, null, "QueryCredit", false)));
