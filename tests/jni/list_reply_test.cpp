@@ -12,18 +12,22 @@
 namespace gateway_tests {
 namespace {
 
-// A reply of two records, the first of which has `sequence` where its sequence stands.
-Outcome DecodeWithSequence(std::string_view decoder, std::string_view sequence) {
-  std::string reply = SampleList(decoder, 2);
-  const size_t begin = reply.find("|67=");
-  EXPECT_NE(begin, std::string::npos) << decoder;
-  reply.replace(begin, reply.find('|', begin + 1) - begin, sequence);
+Outcome Decode(std::string_view decoder, const std::string& reply) {
   const Export& row = *FindExport(decoder);
   Arguments arguments = {Argument::Text(reply)};
   if (row.shape.front() == 'i') arguments.insert(arguments.begin(), Argument::Int(0));  // a market
   Outcome outcome = CRecordingHost().Call(row, arguments);
   EXPECT_TRUE(outcome.IsSound()) << testing::PrintToString(outcome.violations);
   return outcome;
+}
+
+// A reply of two records, the first of which has `sequence` where its sequence stands.
+Outcome DecodeWithSequence(std::string_view decoder, std::string_view sequence) {
+  std::string reply = SampleList(decoder, 2);
+  const size_t begin = reply.find("|67=");
+  EXPECT_NE(begin, std::string::npos) << decoder;
+  reply.replace(begin, reply.find('|', begin + 1) - begin, sequence);
+  return Decode(decoder, reply);
 }
 
 TEST(ListReplies, BlankSequenceIsTakenAndEndsNoList) {
@@ -42,6 +46,23 @@ TEST(ListReplies, EndMarkIsTheFirstSequenceThatEndsAList) {
     };
     EXPECT_EQ(decode(table.endMark - 1), decode(1)) << table.decoder;
     EXPECT_NE(decode(table.endMark), decode(1)) << table.decoder;
+  }
+}
+
+// A record too long for its buffer is an empty one; after the second of three such a list has one
+// record, or two.
+TEST(ListReplies, EmptyRecordEndsTheListsThatSaySo) {
+  for (const gateway_fuzz::Table& table : gateway_fuzz::kTables) {
+    if (table.endMark == 0) continue;
+    std::string reply = SampleList(table.decoder, 3);
+    const size_t second = reply.find("|00=", reply.find("|01=")) + 1;
+    const size_t third = reply.find("|00=", second) + 1;
+    reply.insert(second + 4, "|XX=" + std::string(table.recordSize, 'x'));
+    const std::string whole = *Decode(table.decoder, reply).result;
+    reply.erase(third + table.recordSize + 4,
+                reply.find("|00=", third + table.recordSize + 4) - third - table.recordSize - 3);
+    const std::string withoutThird = *Decode(table.decoder, reply).result;
+    EXPECT_EQ(whole == withoutThird, table.endsAtEmptyRecord) << table.decoder;
   }
 }
 

@@ -55,7 +55,8 @@ class CChangedReply {
       m_nAt = ofRecord ? m_reply.find('|', record + 1) : 0;
     } else {
       m_nSize = m_reply.find('|', m_nAt + 1) - m_nAt;
-      m_value = m_reply.substr(m_nAt + m_mark.size(), m_nSize - m_mark.size());
+      const std::string value = m_reply.substr(m_nAt + m_mark.size(), m_nSize - m_mark.size());
+      if (!value.empty()) m_value = value;
     }
   }
 
@@ -108,26 +109,44 @@ TEST(ReplyFields, BlankValueIsTakenOrPassedOver) {
       });
 }
 
-// Fields that are asked for single letters or digits alone: a long value is as none.
-constexpr std::string_view kShortValues[] = {"19", "32", "39", "JV", "M8"};
+// Fields of which single characters are known: a longer value is as none.
+constexpr std::string_view kShortValues[] = {"32", "39", "JV", "M8"};
+
+bool IsShort(std::string_view tag) {
+  return std::count(std::begin(kShortValues), std::end(kShortValues), tag) != 0;
+}
+
+// A long value that may mean something: a number, a text, an end mark, an acceptance letter.
+struct Filling {
+  std::string_view begin;
+  char fill;
+  std::string_view end;
+
+  std::string OfSize(size_t size) const {
+    const size_t filled = size - begin.size() - end.size();
+    return std::string(begin) + std::string(filled, fill) + std::string(end);
+  }
+};
+
+constexpr Filling kFillings[] = {
+    {"", '1', ""}, {"", '9', ""}, {"", 'x', ""}, {"", '0', "900001"}, {"S", 'x', ""}};
 
 TEST(ReplyFields, ValueFitsUpToItsBound) {
   std::set<std::string> hidden;
   ForEachField([&hidden](const Table& table, const Field& field, const Turn& turn,
                          const CChangedReply& reply) {
-    const bool fitsRecord = table.recordSize == 0 || field.bound + 200 < table.recordSize;
+    const bool fitsRecord = table.recordSize == 0 || field.bound + 120 < table.recordSize;
     if (field.bound == gateway_fuzz::kUnbounded || !fitsRecord) return;
     const std::string name = std::string(table.decoder) + " " + field.tag;
-    if (turn.from.empty() &&
-        std::count(std::begin(kShortValues), std::end(kShortValues), field.tag) == 0)
-      hidden.insert(name);
-    for (const char fill : {'1', '9', 'x'}) {
-      const std::string tooLong = reply.Decode({std::string(field.bound, fill)});
-      EXPECT_EQ(reply.Decode({std::string(field.bound + 1, fill)}), tooLong);
-      if (reply.Decode({std::string(field.bound - 1, fill)}) != tooLong) hidden.erase(name);
+    if (turn.from.empty() && !IsShort(field.tag)) hidden.insert(name);
+    for (const Filling& filling : kFillings) {
+      const std::string tooLong = reply.Decode({filling.OfSize(field.bound)});
+      EXPECT_EQ(reply.Decode({filling.OfSize(field.bound + 1)}), tooLong);
+      if (reply.Decode({filling.OfSize(field.bound - 1)}) != tooLong) hidden.erase(name);
     }
   });
-  EXPECT_EQ(hidden, std::set<std::string>()) << "a value that just fits is not seen";
+  // The lists of accounts know one code.
+  EXPECT_EQ(hidden, (std::set<std::string>{"AuthDecode 68", "GetTotalAccountDecode 68"}));
 }
 
 }  // namespace

@@ -49,6 +49,8 @@ TEST_F(FuturesAnswer, EveryKind) {
       {"39 at the very start is not found", "39= |19=S|46=A|K1=no", "no", -1},
       {"K1 of 127", "|39=E|K1=" + std::string(127, 'k'), std::string(127, 'k'), -1},
       {"K1 of 128 is dropped", "|39=E|K1=" + std::string(128, 'k'), "", -1},
+      {"K1 of 127 beside 19", "|39= |19=N|K1=" + std::string(127, 'k'), std::string(127, 'k'), -1},
+      {"K1 of 128 beside 19 is dropped", "|39= |19=N|K1=" + std::string(128, 'k'), "", -1},
       {"46 of 127", "|39= |19=S|46=" + std::string(127, 'n'), std::string(127, 'n') + "@@@1@@!", 1},
       {"46 of 128 is dropped", "|39= |19=S|46=" + std::string(128, 'n'), "@@@1@@!", 1},
       {"44 of 15", "|39= |19=S|44=123456789012345", "@123456789012345@@1@@!", 1},

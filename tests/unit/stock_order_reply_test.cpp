@@ -123,8 +123,11 @@ TEST_F(StockOrderReplies, AcceptedOrderShowsNumberAndDate) {
 TEST_F(StockOrderReplies, AcceptedCancellationSaysNothingOfAnEarlierRefusal) {
   CGatewayStk gateway;
   int status = 77;
-  EXPECT_STREQ(gateway.CancelChangeOrderDecode("39=E|K1=closed|", &status), "closed");
-  EXPECT_STREQ(gateway.CancelChangeOrderDecode("39= |19=S|", &status), "");
+  EXPECT_STREQ(gateway.CancelChangeOrderDecode("|39=E|K1=closed", &status), "closed");
+  EXPECT_EQ(status, -1);
+  status = 1;
+  EXPECT_STREQ(gateway.CancelChangeOrderDecode("|39= |19=S", &status), "");
+  EXPECT_EQ(status, 1);
 }
 
 }  // namespace
