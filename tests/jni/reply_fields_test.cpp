@@ -110,13 +110,14 @@ TEST(ReplyFields, BlankValueIsTakenOrPassedOver) {
 }
 
 // Fields of which single characters are known: a longer value is as none.
-constexpr std::string_view kShortValues[] = {"32", "39", "JV", "M8"};
+constexpr std::string_view kShortValues[] = {"32", "39", "JV"};
 
 bool IsShort(std::string_view tag) {
   return std::count(std::begin(kShortValues), std::end(kShortValues), tag) != 0;
 }
 
-// A long value that may mean something: a number, a text, an end mark, an acceptance letter.
+// A long value that may mean something: a number, a text, an end mark, an acceptance letter, a
+// kind.
 struct Filling {
   std::string_view begin;
   char fill;
@@ -128,8 +129,8 @@ struct Filling {
   }
 };
 
-constexpr Filling kFillings[] = {
-    {"", '1', ""}, {"", '9', ""}, {"", 'x', ""}, {"", '0', "900001"}, {"S", 'x', ""}};
+constexpr Filling kFillings[] = {{"", '1', ""},       {"", '9', ""},  {"", 'x', ""},
+                                 {"", '0', "900001"}, {"S", 'x', ""}, {"", '0', "1"}};
 
 TEST(ReplyFields, ValueFitsUpToItsBound) {
   std::set<std::string> hidden;
