@@ -215,6 +215,7 @@ class CParent {
     child.process = fork();
     if (child.process != 0) return;
     std::signal(SIGINT, SIG_IGN);  // the parent decides
+    std::signal(SIGTERM, SIG_IGN);
     s_nRandom = seed | 1;
     CWorker(m_run, *child.slot).Work(seconds);
     _exit(0);
@@ -237,16 +238,20 @@ class CParent {
   void End(Child& child) {
     if (child.process <= 0) return;
     int status = 0;
-    if (s_nStopped != 0) kill(child.process, SIGTERM);
-    for (int i = 0; i < 10 * kPatience; ++i) {
+    for (int looks = s_nStopped != 0 ? 1 : 10 * kPatience; looks > 0; --looks) {
       if (waitpid(child.process, &status, WNOHANG) != 0) {
-        if (status != 0 && s_nStopped == 0) KeepFinding(child);
+        if (status != 0) KeepFinding(child);
         return;
       }
       usleep(100000);
     }
+    Kill(child);
+    if (s_nStopped == 0) KeepFinding(child);  // stopped amid any input
+  }
+
+  static void Kill(const Child& child) {
     kill(child.process, SIGKILL);
-    KeepFinding(child);
+    waitpid(child.process, nullptr, 0);
   }
 
   void KeepFinding(const Child& child) {
