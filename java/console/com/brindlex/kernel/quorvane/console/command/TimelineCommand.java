@@ -17,6 +17,7 @@ import picocli.CommandLine.Command;
 import picocli.CommandLine.Mixin;
 import picocli.CommandLine.Model.CommandSpec;
 import picocli.CommandLine.Option;
+import picocli.CommandLine.ParameterException;
 import picocli.CommandLine.ParentCommand;
 import picocli.CommandLine.Spec;
 
@@ -71,6 +72,9 @@ final class TimelineCommand implements Callable<Integer> {
     @Override
     public Integer call() throws IOException {
         terminal = parent.terminal();
+        if (csv && terminal.isJson()) {
+            throw new ParameterException(spec.commandLine(), "--csv and --json exclude each other");
+        }
         width = System.console() == null ? Integer.MAX_VALUE : spec.usageMessage().width();
         RowFilter filter = new RowFilter(account, stock, operation, failures);
         Timeline timeline = new Timeline();

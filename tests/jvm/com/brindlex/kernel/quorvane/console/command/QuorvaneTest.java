@@ -332,6 +332,9 @@ class QuorvaneTest {
         assertTrue(csv.out.contains(",1234567,,login,sent,0013452107,,,\r\n"), csv.out);
         Run calculated = run(LOG.replace("ACNO=1234567", "ACNO==1+2"), "timeline", "--csv");
         assertTrue(calculated.out.contains(",'=1+2,"), calculated.out);
+        Run both = run(LOG, "timeline", "--csv", "--json");
+        assertEquals(2, both.code, both.out);
+        assertTrue(both.err.contains("--csv and --json exclude each other"), both.err);
         Run json = run(LOG, "timeline", "--json");
         assertTrue(json.out.lines().allMatch(line -> line.startsWith("{\"line\":")), json.out);
         assertEquals(1, run("nothing\n", "timeline").code);
