@@ -10,7 +10,8 @@ import time
 TOP = pathlib.Path(__file__).resolve().parent.parent.parent
 KEPT = TOP / "docs/assurance"
 PAGE = TOP / "docs/assurance.md"
-TESTS = ["tests/unit", "tests/jni", "tests/heap", "tests/support", "tests/vectors"]
+TESTS = ["tests/unit", "tests/jni", "tests/heap", "tests/support", "tests/vectors",
+         "tests/fuzz/reply_tables.h", "tests/fuzz/reply_tables.inc"]
 FUZZ = "fuzzing"
 
 # What each section measures with, beside gateway/, jni/ and its own program. In the page's order.
